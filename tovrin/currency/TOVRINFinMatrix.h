@@ -1,0 +1,4 @@
+// Money matrices.
+#pragma once
+
+#include "tovrin/foundation/TOVRINFoundation.h"

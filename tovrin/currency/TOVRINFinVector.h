@@ -1,0 +1,4 @@
+// Money vectors.
+#pragma once
+
+#include "tovrin/foundation/TOVRINFoundation.h"

@@ -1,0 +1,4 @@
+// Money conversions.
+#pragma once
+
+#include "tovrin/foundation/TOVRINFoundation.h"

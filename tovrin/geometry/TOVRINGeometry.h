@@ -1,0 +1,4 @@
+// Plane and solid geometry formulas.
+#pragma once
+
+#include "tovrin/foundation/TOVRINFoundation.h"

@@ -1,0 +1,4 @@
+// The descriptive-statistics component TQENDescStats.
+#pragma once
+
+#include "tovrin/foundation/TOVRINFoundation.h"

@@ -1,0 +1,4 @@
+// Paired data: correlation and regression.
+#pragma once
+
+#include "tovrin/foundation/TOVRINFoundation.h"

@@ -1,0 +1,4 @@
+// Continuous distributions.
+#pragma once
+
+#include "tovrin/foundation/TOVRINFoundation.h"

@@ -1,0 +1,4 @@
+// Discrete distributions and combinatorics.
+#pragma once
+
+#include "tovrin/foundation/TOVRINFoundation.h"

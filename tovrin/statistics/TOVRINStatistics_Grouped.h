@@ -1,0 +1,4 @@
+// Statistics of grouped frequency data.
+#pragma once
+
+#include "tovrin/foundation/TOVRINFoundation.h"

@@ -1,0 +1,4 @@
+// Descriptive statistics of a sample.
+#pragma once
+
+#include "tovrin/foundation/TOVRINFoundation.h"

@@ -1,0 +1,15 @@
+// The whole public interface of tovrin.
+#pragma once
+
+#include "tovrin/foundation/TOVRINFinancials.h"
+#include "tovrin/foundation/TOVRINFoundation.h"
+#include "tovrin/vector/TOVRINVector.h"
+#include "tovrin/matrix/TOVRINMatrix.h"
+#include "tovrin/statistics/TOVRINStatistics.h"
+#include "tovrin/statistics/TOVRINPairStats.h"
+#include "tovrin/statistics/TOVRIN_RS_DescStats.h"
+#include "tovrin/statistics/TOVRINDescStats.h"
+#include "tovrin/random/TOVRINRandom.h"
+#include "tovrin/geometry/TOVRINGeometry.h"
+#include "tovrin/currency/TOVRINFinVector.h"
+#include "tovrin/currency/TOVRINFinMatrix.h"

@@ -1,0 +1,4 @@
+// Vector building, aggregates, arithmetic, transforms, sorting and ranking.
+#pragma once
+
+#include "tovrin/foundation/TOVRINFoundation.h"
