@@ -35,7 +35,18 @@ Int64 MaxXY(Int64 X, Int64 Y) { return Y > X ? Y : X; }
 Extended SignXY(Extended X, Extended Y) { return Y >= 0 ? std::fabs(X) : -std::fabs(X); }
 Extended XtoY(Extended X, Extended Y) { return std::pow(X, Y); }
 Extended TwoToY(Extended Y) { return std::exp2(Y); }
-Extended QENLog10(Extended X) { return std::log10(X); }
+Extended QENLog10(Extended X) {
+  // The C library's log10 may miss an exact power of ten by a unit in the last place; the
+  // powers 10^0 to 10^27 are exact in Extended, so their logarithms are given exactly.
+  const Extended result = std::log10(X);
+  const Extended nearest = std::nearbyint(result);
+  if (nearest >= 0 && nearest <= 27 && std::fabs(result - nearest) < 1e-15L) {
+    Extended power = 1;
+    for (int i = 0; i < static_cast<int>(nearest); ++i) power *= 10;
+    if (power == X) return nearest;
+  }
+  return result;
+}
 Extended QENLog2(Extended X) { return std::log2(X); }
 Extended CubeRoot(Extended X) { return std::cbrt(X); }
 Extended QENArcCos(Extended X) { return std::acos(X); }

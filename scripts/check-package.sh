@@ -1,0 +1,25 @@
+#!/usr/bin/env bash
+# Installs tovrin into a scratch prefix and builds the examples against it twice: through
+# find_package(tovrin CONFIG) and through pkg-config. Runs each example.
+set -euo pipefail
+cd "$(dirname "$0")/.."
+build=build/package
+prefix=$PWD/$build/prefix
+cmake -S . -B $build/lib -DCMAKE_BUILD_TYPE=Release -DTOVRIN_BUILD_TESTS=OFF \
+  -DTOVRIN_BUILD_BENCHMARKS=OFF -DCMAKE_INSTALL_PREFIX="$prefix" >/dev/null
+cmake --build $build/lib -j2
+cmake --install $build/lib >/dev/null
+cmake -S examples -B $build/examples -DCMAKE_PREFIX_PATH="$prefix" >/dev/null
+cmake --build $build/examples -j2
+for example in examples/*.cpp; do
+  name=$(basename "$example" .cpp)
+  "$build/examples/$name" >/dev/null
+  PKG_CONFIG_PATH="$prefix/lib/pkgconfig" g++ "$example" -o "$build/$name-pkgconfig" \
+    $(PKG_CONFIG_PATH="$prefix/lib/pkgconfig" pkg-config --cflags --libs tovrin)
+  "$build/$name-pkgconfig" >/dev/null
+done
+echo "package check: find_package and pkg-config consumers built and ran"
+cmake -S examples/subdirectory -B $build/subdirectory -DCMAKE_BUILD_TYPE=Release >/dev/null
+cmake --build $build/subdirectory -j2
+"$build/subdirectory/quickstart" >/dev/null
+echo "package check: add_subdirectory consumer built and ran"

@@ -1,0 +1,15 @@
+#!/usr/bin/env bash
+# Installs the build requirements of tovrin with apt-get when they are missing.
+set -euo pipefail
+missing=()
+command -v cmake >/dev/null || missing+=(cmake)
+command -v g++ >/dev/null || missing+=(g++)
+command -v pkg-config >/dev/null || missing+=(pkg-config)
+[ -d /usr/include/gtest ] || missing+=(libgtest-dev libgmock-dev)
+[ -d /usr/include/benchmark ] || missing+=(libbenchmark-dev)
+if [ ${#missing[@]} -gt 0 ]; then
+  echo "installing: ${missing[*]}"
+  if [ "$(id -u)" -eq 0 ]; then SUDO=""; else SUDO="sudo"; fi
+  $SUDO apt-get update -qq
+  DEBIAN_FRONTEND=noninteractive $SUDO apt-get install -y -qq "${missing[@]}"
+fi

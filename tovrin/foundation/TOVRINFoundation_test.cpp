@@ -1,0 +1,332 @@
+#include <cmath>
+#include <limits>
+#include <set>
+#include <string>
+
+#include <gtest/gtest.h>
+
+#include "tovrin/foundation/TOVRINFoundation.h"
+
+namespace tovrin {
+namespace {
+
+constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
+constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
+
+// --- Storage ----------------------------------------------------------------------------------
+
+TEST(PackedExtendedTest, ThreeElementsSpanThirtyBytes) {
+  TQENFloatVector v(3);
+  const auto* first = reinterpret_cast<const unsigned char*>(v.data());
+  const auto* last = reinterpret_cast<const unsigned char*>(v.data() + v.size());
+  EXPECT_EQ(last - first, 30);
+  for (Extended x : v) EXPECT_EQ(x, 0.0L);  // value-initialised elements are zero
+}
+
+TEST(PackedExtendedTest, KeepsEveryBitOfTheValue) {
+  for (Extended x : {0.1L, -0.0L, std::numeric_limits<Extended>::max(),
+                     std::numeric_limits<Extended>::denorm_min(),
+                     std::numeric_limits<Extended>::lowest(), 1.0L + 0x1p-63L, kInf}) {
+    const PackedExtended p = x;
+    const Extended back = p;
+    EXPECT_EQ(back, x);
+    EXPECT_EQ(std::signbit(back), std::signbit(x));
+  }
+  const PackedExtended nan = kNaN;
+  EXPECT_TRUE(std::isnan(Extended(nan)));
+}
+
+TEST(PackedExtendedTest, CompoundAssignmentWorksInPlace) {
+  TQENFloatVector v{1.0L, 2.0L};
+  v[0] += 0x1p-63L;  // representable only at 64-bit precision
+  v[1] *= 3.0L;
+  v[1] -= 1.0L;
+  v[1] /= 4.0L;
+  EXPECT_EQ(Extended(v[0]), 1.0L + 0x1p-63L);
+  EXPECT_EQ(Extended(v[1]), 1.25L);
+}
+
+TEST(ConstantsTest, HoldFullExtendedPrecision) {
+  // Each constant is the Extended nearest the true value: cos(pi) is -1 and the roots square
+  // back to within one rounding.
+  EXPECT_EQ(std::cos(QENPi), -1.0L);
+  EXPECT_EQ(TwoPi, 2 * QENPi);
+  EXPECT_NEAR(static_cast<double>(Sqrt2 * Sqrt2 - 2), 0.0, 4.4e-19);
+  EXPECT_NEAR(static_cast<double>(Sqrt3 * Sqrt3 - 3), 0.0, 4.4e-19);
+  EXPECT_NEAR(static_cast<double>(Sqrt5 * Sqrt5 - 5), 0.0, 8.7e-19);
+  EXPECT_EQ(QENTolerance, 5e-12L);
+  EXPECT_TRUE(QENMatrixRectangularCheck.load());
+}
+
+// --- Tolerance predicates ---------------------------------------------------------------------
+
+TEST(TolerancePredicatesTest, CompareAgainstTheToleranceAbsolutely) {
+  EXPECT_TRUE(FloatIsZero(0.0L));
+  EXPECT_TRUE(FloatIsZero(4.9e-12L));
+  EXPECT_TRUE(FloatIsZero(-4.9e-12L));
+  EXPECT_FALSE(FloatIsZero(5e-12L));
+  EXPECT_FALSE(FloatIsZero(-5.1e-12L));
+  EXPECT_TRUE(FloatIsNotZero(5.1e-12L));
+  EXPECT_FALSE(FloatIsNotZero(1e-30L));
+
+  EXPECT_TRUE(FloatIsPositive(5.1e-12L));
+  EXPECT_FALSE(FloatIsPositive(5e-12L));
+  EXPECT_FALSE(FloatIsPositive(1e-13L));
+  EXPECT_TRUE(FloatIsNegative(-5.1e-12L));
+  EXPECT_FALSE(FloatIsNegative(-5e-12L));
+  EXPECT_FALSE(FloatIsNegative(-1e-13L));
+}
+
+TEST(TolerancePredicatesTest, NaNIsNeitherZeroNorSigned) {
+  EXPECT_FALSE(FloatIsZero(kNaN));
+  EXPECT_TRUE(FloatIsNotZero(kNaN));
+  EXPECT_FALSE(FloatIsPositive(kNaN));
+  EXPECT_FALSE(FloatIsNegative(kNaN));
+  EXPECT_FALSE(SameFloat(kNaN, kNaN));
+  EXPECT_TRUE(NotSameFloat(kNaN, 1.0L));
+}
+
+TEST(SameFloatTest, AbsoluteUpToOneAndRelativeBeyond) {
+  EXPECT_TRUE(SameFloat(0.0L, 4e-12L));
+  EXPECT_FALSE(SameFloat(0.0L, 6e-12L));
+  EXPECT_TRUE(SameFloat(0.5L, 0.5L + 4e-12L));
+  EXPECT_TRUE(SameFloat(1.0L, 1.0L + 4e-12L));
+  EXPECT_FALSE(SameFloat(1.0L, 1.0L + 6e-12L));
+  EXPECT_TRUE(SameFloat(1e6L, 1e6L + 4e-6L));
+  EXPECT_FALSE(SameFloat(1e6L, 1e6L + 6e-6L));
+  EXPECT_TRUE(SameFloat(-1e300L, -1e300L * (1 + 4e-12L)));
+  EXPECT_FALSE(SameFloat(1e-20L, -1.0L));
+  EXPECT_TRUE(SameFloat(kInf, kInf));
+  EXPECT_FALSE(SameFloat(kInf, -kInf));
+  EXPECT_FALSE(SameFloat(std::numeric_limits<Extended>::max(), kInf));
+  EXPECT_TRUE(NotSameFloat(1.0L, 2.0L));
+}
+
+TEST(SameFloatTest, DoubleAndSingleCompareAtTheirOwnPrecision) {
+  EXPECT_TRUE(SameFloat(1.0, 1.0 + 4e-12));
+  EXPECT_FALSE(SameFloat(1.0, 1.0 + 6e-12));
+  EXPECT_TRUE(SameFloat(1.0F, 1.000004F));
+  EXPECT_FALSE(SameFloat(1.0F, 1.00001F));
+  EXPECT_TRUE(SameFloat(0.0F, 4e-6F));
+  EXPECT_FALSE(SameFloat(0.0F, 6e-6F));
+}
+
+// --- Elementary helpers -----------------------------------------------------------------------
+
+TEST(ElementaryTest, MinMaxAndSign) {
+  EXPECT_EQ(MinXY(2.0L, -3.0L), -3.0L);
+  EXPECT_EQ(MinXY(LongInt{-7}, LongInt{4}), -7);
+  EXPECT_EQ(MinXY(Int64{1} << 40, Int64{5}), 5);
+  EXPECT_EQ(MinXY(LongWord{4000000000U}, LongWord{3}), 3U);
+  EXPECT_EQ(MaxXY(2.0L, -3.0L), 2.0L);
+  EXPECT_EQ(MaxXY(Int64{-1}, std::numeric_limits<Int64>::min()), -1);
+  EXPECT_EQ(SignXY(3.0L, -2.0L), -3.0L);
+  EXPECT_EQ(SignXY(-3.0L, 2.0L), 3.0L);
+  EXPECT_EQ(SignXY(-3.0L, 0.0L), 3.0L);
+}
+
+TEST(ElementaryTest, PowersLogsAndRoots) {
+  EXPECT_EQ(XtoY(2.0L, 10.0L), 1024.0L);
+  EXPECT_EQ(XtoY(-2.0L, 3.0L), -8.0L);
+  EXPECT_EQ(XtoY(9.0L, 0.5L), 3.0L);
+  EXPECT_EQ(TwoToY(-3.0L), 0.125L);
+  EXPECT_EQ(TwoToY(16383.0L), 0x1p16383L);
+  EXPECT_EQ(QENLog2(8.0L), 3.0L);
+  EXPECT_EQ(QENLog2(0x1p-16000L), -16000.0L);
+  EXPECT_EQ(QENLog10(1000.0L), 3.0L);
+  EXPECT_EQ(QENLog10(1e27L), 27.0L);
+  EXPECT_NEAR(static_cast<double>(QENLog10(1e-4000L) + 4000), 0.0, 1e-15);
+  EXPECT_TRUE(std::isnan(QENLog10(-1.0L)));
+  EXPECT_EQ(CubeRoot(-27.0L), -3.0L);
+  EXPECT_EQ(QENArcCos(-1.0L), QENPi);
+  EXPECT_EQ(QENTan(0.0L), 0.0L);
+  // tan(pi/4) is 1 within two units of the last place.
+  EXPECT_NEAR(static_cast<double>(QENTan(QENPi / 4) - 1), 0.0, 2.2e-19);
+}
+
+TEST(ElementaryTest, DistanceDoesNotOverflowOnTheWay) {
+  EXPECT_EQ(QENDistance(1.0L, 1.0L, 4.0L, 5.0L), 5.0L);
+  EXPECT_EQ(QENDistance(0.0L, 0.0L, -3e4000L, 4e4000L), 5e4000L);
+  EXPECT_EQ(QENDistance(0.0L, 0.0L, 3e-4000L, 4e-4000L), 5e-4000L);
+}
+
+TEST(SystemTest, SwapAndClear) {
+  LongInt a = 1, b = 2;
+  SwapXY(a, b);
+  EXPECT_EQ(a, 2);
+  EXPECT_EQ(b, 1);
+  TQENFloatVector v{1.5L, 2.5L};
+  SwapXY(v[0], v[1]);
+  EXPECT_EQ(Extended(v[0]), 2.5L);
+  Extended x = 1, y = -1;
+  SwapXY(x, y);
+  EXPECT_EQ(x, -1);
+  TQENDoubleVector d{1.0, 2.0, 3.0};
+  QENClear(d.data(), 2 * sizeof(Double));
+  EXPECT_EQ(d, (TQENDoubleVector{0.0, 0.0, 3.0}));
+  QENClear(nullptr, 0);
+}
+
+// --- Text conversions -------------------------------------------------------------------------
+
+TEST(Float2EStrTest, FixedNotationWithExactDecimals) {
+  EXPECT_EQ(Float2EStr(1.5L, 2), "1.50");
+  EXPECT_EQ(Float2EStr(1.5L, 0), "2");
+  EXPECT_EQ(Float2EStr(-1234567.0L, 1), "-1234567.0");
+  EXPECT_EQ(Float2EStr(1e20L, 0), "100000000000000000000");
+  EXPECT_EQ(Float2EStr(0.0L, 4), "0.0000");
+}
+
+TEST(Float2EStrTest, RoundsTheExactBinaryValueTiesToEven) {
+  // Exact binary ties go to the even digit.
+  EXPECT_EQ(Float2EStr(2.5L, 0), "2");
+  EXPECT_EQ(Float2EStr(3.5L, 0), "4");
+  EXPECT_EQ(Float2EStr(0.125L, 2), "0.12");
+  EXPECT_EQ(Float2EStr(0.375L, 2), "0.38");
+  EXPECT_EQ(Float2EStr(-2.25L, 1), "-2.2");
+  // Decimal expansions of the stored values (computed exactly with Python's decimal module at
+  // 64-bit precision): 2.675L is 2.67499999999999999995..., 0.3L is 0.30000000000000000001...
+  EXPECT_EQ(Float2EStr(2.675L, 2), "2.67");
+  EXPECT_EQ(Float2EStr(0.3L, 19), "0.3000000000000000000");
+  EXPECT_EQ(Float2EStr(0.3L, 20), "0.30000000000000000001");
+  EXPECT_EQ(Float2EStr(0.1L, 21), "0.100000000000000000001");
+  EXPECT_EQ(Float2EStr(1e-3L, 25), "0.0009999999999999999999585");
+}
+
+TEST(Float2EStrTest, NeverWritesNegativeZero) {
+  EXPECT_EQ(Float2EStr(-0.0L, 3), "0.000");
+  EXPECT_EQ(Float2EStr(-0.001L, 2), "0.00");
+  EXPECT_EQ(Float2EStr(-0.4L, 0), "0");
+  EXPECT_EQ(Float2EStr(-0.5L, 0), "0");
+  EXPECT_EQ(Float2EStr(-0.6L, 0), "-1");
+}
+
+TEST(Float2EStrTest, SpecialValuesAndExtremes) {
+  EXPECT_EQ(Float2EStr(kNaN, 2), "NAN");
+  EXPECT_EQ(Float2EStr(kInf, 2), "INF");
+  EXPECT_EQ(Float2EStr(-kInf, 0), "-INF");
+  const std::string big = Float2EStr(std::numeric_limits<Extended>::max(), 255);
+  EXPECT_EQ(big.substr(0, 8), "11897314");
+  EXPECT_EQ(big.size(), 4933U + 1 + 255);
+  const std::string tiny = Float2EStr(std::numeric_limits<Extended>::denorm_min(), 255);
+  EXPECT_EQ(tiny, "0." + std::string(255, '0'));
+}
+
+TEST(Int2EStrTest, PlainDecimal) {
+  EXPECT_EQ(Int2EStr(LongInt{0}), "0");
+  EXPECT_EQ(Int2EStr(std::numeric_limits<LongInt>::min()), "-2147483648");
+  EXPECT_EQ(Int2EStr(std::numeric_limits<Int64>::min()), "-9223372036854775808");
+  EXPECT_EQ(Int2EStr(Int64{1234567890123}), "1234567890123");
+}
+
+TEST(Str2FloatTest, AcceptsTheDecimalForms) {
+  EXPECT_EQ(Str2Float("1"), 1.0L);
+  EXPECT_EQ(Str2Float("-2.5"), -2.5L);
+  EXPECT_EQ(Str2Float(".5"), 0.5L);
+  EXPECT_EQ(Str2Float("3."), 3.0L);
+  EXPECT_EQ(Str2Float("+7"), 7.0L);
+  EXPECT_EQ(Str2Float("1e-3"), 1e-3L);
+  EXPECT_EQ(Str2Float("1E+2"), 100.0L);
+  EXPECT_EQ(Str2Float(" \t0.1  "), 0.1L);
+  EXPECT_TRUE(std::signbit(Str2Float("-0")));
+}
+
+TEST(Str2FloatTest, RoundsCorrectlyToExtended) {
+  // 1 + 2^-64 lies halfway between 1 and the next Extended: ties to even give 1.
+  EXPECT_EQ(Str2Float("1.0000000000000000000542101086242752217003726400434970855712890625"),
+            1.0L);
+  EXPECT_EQ(Str2Float("1.0000000000000000000542101086242752217003726400434970855712890626"),
+            1.0L + 0x1p-63L);
+  // 1 + 3 * 2^-64 is a tie between 1 + 2^-63 and 1 + 2^-62: the even one is 1 + 2^-62.
+  EXPECT_EQ(Str2Float("1.0000000000000000001626303258728256651011179201304912567138671875"),
+            1.0L + 0x1p-62L);
+  EXPECT_EQ(Str2Float("1e-4952"), 0.0L);  // below half the smallest subnormal
+  EXPECT_EQ(Str2Float("4e-4951"), std::numeric_limits<Extended>::denorm_min());
+  EXPECT_EQ(Str2Float("1.18973149535723176502e+4932"), std::numeric_limits<Extended>::max());
+}
+
+TEST(Str2FloatTest, RejectsEverythingElseNamingTheText) {
+  for (const char* text : {"", "   ", "inf", "nan", "1,5", "0x10", "1e", "e5", ".", "-", "+",
+                           "1.2.3", "1 2", "--1", "1e+", "١", "1f", "1.5L", "Infinity"}) {
+    try {
+      Str2Float(text);
+      ADD_FAILURE() << "accepted '" << text << "'";
+    } catch (const EConvertError& e) {
+      EXPECT_NE(std::string(e.what()).find(std::string("'") + text + "'"), std::string::npos)
+          << e.what();
+    }
+  }
+  EXPECT_THROW(Str2Float("1e5000"), EConvertError);
+  EXPECT_THROW(Str2Float("-1e5000"), EConvertError);
+}
+
+TEST(Str2FloatTest, RoundTripsFloat2EStrAtTwentyDecimals) {
+  for (Extended x : {1.0L / 3, -2.0L / 7, 12345.678L, 0.5L}) {
+    EXPECT_NEAR(static_cast<double>(Str2Float(Float2EStr(x, 20)) - x), 0.0, 1e-20);
+  }
+}
+
+TEST(StripTChStrTest, RemovesOnlyTheTrailingRun) {
+  EXPECT_EQ(StripTChStr("2.50000", '0'), "2.5");
+  EXPECT_EQ(StripTChStr("2.00000", '0'), "2.");
+  EXPECT_EQ(StripTChStr("0000", '0'), "");
+  EXPECT_EQ(StripTChStr("", '0'), "");
+  EXPECT_EQ(StripTChStr("100", '1'), "100");
+  EXPECT_EQ(StripTChStr("a--", '-'), "a");
+}
+
+// --- Messages ---------------------------------------------------------------------------------
+
+TEST(ResStringTest, EveryIdentifierHasItsOwnTextAndName) {
+  std::set<std::string> texts, names;
+  for (int i = 0; i < rsResStringCount; ++i) {
+    const auto id = static_cast<TResStringId>(i);
+    const std::string text = LoadResString(id);
+    EXPECT_FALSE(text.empty()) << ResStringName(id);
+    EXPECT_TRUE(texts.insert(text).second) << "duplicate text: " << text;
+    EXPECT_TRUE(names.insert(ResStringName(id)).second) << ResStringName(id);
+  }
+  EXPECT_EQ(std::string(ResStringName(rsVectorIsEmpty)), "rsVectorIsEmpty");
+  EXPECT_NE(LoadResString(rsVectorIsEmpty), LoadResString(rsVectorEmpty));
+  EXPECT_THROW(LoadResString(rsResStringCount), std::out_of_range);
+}
+
+TEST(ResStringTest, ReportLabelsHaveTheirPublishedTexts) {
+  EXPECT_EQ(LoadResString(rsDSNoOfValues), "Number of Values:");
+  EXPECT_EQ(LoadResString(rsDSSumSQ), "Sum of Squares:");
+  EXPECT_EQ(LoadResString(rsDSNoMode), "No Modal Value");
+  EXPECT_EQ(LoadResString(rsDSSDKurtosis), "Standard Deviation needs to be > 0 for Kurtosis");
+  EXPECT_EQ(LoadResString(rsDSUpperFence), "Upper Fence for Outliers:");
+  EXPECT_EQ(LoadResString(rsPValue), "p-Value:");
+  EXPECT_EQ(LoadResString(rsDSCoeffCor), "Coefficient of Correlation");
+  EXPECT_EQ(LoadResString(rsDSMeanY), "Mean of Y Values:");
+  // 47 report strings: rsDSNoOfValues through rsDSMeanY.
+  EXPECT_EQ(rsDSMeanY - rsDSNoOfValues + 1, 47);
+}
+
+TEST(ResStringTest, TextsCanBeReplacedAtRunTime) {
+  SetResString(rsMatrixSqr, "La matrice doit être carrée");
+  try {
+    detail::RaiseMathError(rsMatrixSqr);
+  } catch (const EMathError& e) {
+    EXPECT_EQ(e.Ident(), rsMatrixSqr);
+    EXPECT_STREQ(e.what(), "La matrice doit être carrée");
+  }
+  ResetResStrings();
+  EXPECT_EQ(EMathError(rsMatrixSqr).what(), LoadResString(rsMatrixSqr));
+  EXPECT_STRNE(EMathError(rsMatrixSqr).what(), "La matrice doit être carrée");
+  EXPECT_THROW(SetResString(static_cast<TResStringId>(rsResStringCount), "x"), std::out_of_range);
+}
+
+TEST(ResStringTest, ExceptionClassesCarryTheirMessages) {
+  const EMathError math(rsVectorIsEmpty);
+  EXPECT_EQ(math.Ident(), rsVectorIsEmpty);
+  EXPECT_EQ(std::string(math.what()), LoadResString(rsVectorIsEmpty));
+  EXPECT_STREQ(EConvertError("bad").what(), "bad");
+  EXPECT_STREQ(EAccessViolation("no rows").what(), "no rows");
+  const std::exception& base = math;
+  EXPECT_NE(dynamic_cast<const EMathError*>(&base), nullptr);
+}
+
+}  // namespace
+}  // namespace tovrin

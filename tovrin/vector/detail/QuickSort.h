@@ -1,0 +1,101 @@
+// The explicit-stack quick sort shared by the vector, matrix and money units.
+//
+// The sort works on 1-based positions 1..N through three callables, so that one algorithm
+// orders vector elements, matrix rows on a column key, matrix columns on a row key and money
+// values alike:
+//   key(p)      the sort key at position p, returned by value (the pivot is a copy of it);
+//   less(a, b)  the strict order of two keys (`a < b` for ascending order);
+//   swap(p, q)  exchanges whatever sits at positions p and q (called also when p == q).
+// It is the classic Hoare partition around the middle position, not stable, with no recursion:
+// the larger part is pushed on a stack of TQStackRec entries and the loop goes on with the
+// smaller one, so the stack never holds more than log2(N) entries. Equal keys stop both scans
+// and are exchanged, which keeps runs of equal keys balanced. A key that is unordered with
+// everything (a NaN) only makes the scans stop earlier; no position outside 1..N is ever read.
+#pragma once
+
+#include <cmath>
+#include <utility>
+#include <vector>
+
+#include "tovrin/foundation/TOVRINErrors.h"
+#include "tovrin/foundation/TOVRINGlobals.h"
+#include "tovrin/foundation/TOVRINMath.h"
+#include "tovrin/foundation/TOVRINSystem.h"
+#include "tovrin/foundation/detail/ElementRules.h"
+
+namespace tovrin::detail {
+
+// Entries of the explicit stack for N positions: Round(log2 N) + 2, halves rounded to even.
+inline LongInt QuickSortStackSize(LongInt N) {
+  return static_cast<LongInt>(std::nearbyint(QENLog2(static_cast<Extended>(N)))) + 2;
+}
+
+// Sorts positions 1..N so that `less` holds along them wherever it can (see above).
+template <typename KeyAt, typename Less, typename SwapAt>
+void QuickSortPositions(LongInt N, KeyAt&& key, Less&& less, SwapAt&& swap) {
+  if (N < 2) return;
+  std::vector<TQStackRec> stack(static_cast<std::size_t>(QuickSortStackSize(N)));
+  const LongInt capacity = static_cast<LongInt>(stack.size());
+  LongInt sp = 0;
+  stack[0] = TQStackRec{1, N};
+  // The halving argument bounds the depth by log2(N); the guard only keeps a comparison that
+  // breaks the order's rules from ever writing past the stack.
+  auto push = [&](LongInt lower, LongInt upper) {
+    if (sp + 1 >= capacity) RaiseMathError(rsInvalidValue);
+    stack[static_cast<std::size_t>(++sp)] = TQStackRec{lower, upper};
+  };
+  while (sp >= 0) {
+    LongInt l = stack[static_cast<std::size_t>(sp)].Lower;
+    LongInt r = stack[static_cast<std::size_t>(sp)].Upper;
+    --sp;
+    while (l < r) {
+      const auto pivot = key(l + (r - l) / 2);
+      LongInt i = l;
+      LongInt j = r;
+      do {
+        while (less(key(i), pivot)) ++i;
+        while (less(pivot, key(j))) --j;
+        if (i <= j) {
+          swap(i, j);
+          ++i;
+          --j;
+        }
+      } while (i <= j);
+      if ((j - l) < (r - i)) {
+        if (i < r) push(i, r);
+        r = j;
+      } else {
+        if (l < j) push(l, j);
+        l = i;
+      }
+    }
+  }
+}
+
+// The same with the direction chosen at run time: descending order is ascending order under
+// the reversed comparison (the scans of a descending sort are the ascending ones mirrored).
+template <typename KeyAt, typename Less, typename SwapAt>
+void QuickSortPositions(LongInt N, bool Ascending, KeyAt&& key, Less&& less, SwapAt&& swap) {
+  if (Ascending) {
+    QuickSortPositions(N, key, less, swap);
+  } else {
+    QuickSortPositions(
+        N, key, [&less](const auto& a, const auto& b) { return less(b, a); }, swap);
+  }
+}
+
+// Sorts a vector in place by the elements' own `<` (exact, also for floats), with SwapXY
+// exchanging elements (found by argument-dependent lookup, so the money types' overloads
+// serve too). PackedExtended elements are compared as Extended values.
+template <typename T>
+void QuickSortVector(std::vector<T>& V, bool Ascending) {
+  const LongInt n = static_cast<LongInt>(V.size());
+  if (n < 2) return;
+  T* const data = V.data();  // position p is data[p - 1]
+  auto key = [data](LongInt p) { return static_cast<ValueOf<T>>(data[p - 1]); };
+  auto less = [](ValueOf<T> a, ValueOf<T> b) { return a < b; };
+  auto swap = [data](LongInt p, LongInt q) { SwapXY(data[p - 1], data[q - 1]); };
+  QuickSortPositions(n, Ascending, key, less, swap);
+}
+
+}  // namespace tovrin::detail
