@@ -41,15 +41,6 @@ Int64 ScaleFloat(Extended X, Int64 Scale, Extended Low, Extended High) {
   return static_cast<Int64>(n);
 }
 
-// Q / D rounded to nearest, exact halves to even, in integer arithmetic (D > 0).
-Int64 DivRoundHalfEven(Int64 Q, Int64 D) {
-  Int64 quot = Q / D;  // truncated toward zero
-  const Int64 rem = Q % D;
-  const Int64 twice = rem < 0 ? -2 * rem : 2 * rem;  // |rem| < D <= 2^20: no overflow
-  if (twice > D || (twice == D && quot % 2 != 0)) quot += (Q < 0 ? -1 : 1);
-  return quot;
-}
-
 TQENCurrency CheckedCurr(Int64 X) {
   if (X < INT32_MIN || X > INT32_MAX) detail::RaiseMathError(rsInvalidValue);
   return static_cast<TQENCurrency>(static_cast<LongInt>(X));
@@ -64,6 +55,14 @@ Int64 CheckedScaleUp(Int64 X, Int64 Factor) {
 }  // namespace
 
 namespace detail {
+
+Int64 DivRoundHalfEven(Int64 Q, Int64 D) {
+  Int64 quot = Q / D;  // truncated toward zero
+  const Int64 rem = Q % D;
+  const Int64 twice = rem < 0 ? -2 * rem : 2 * rem;  // |rem| < D <= 2^32: no overflow
+  if (twice > D || (twice == D && quot % 2 != 0)) quot += (Q < 0 ? -1 : 1);
+  return quot;
+}
 
 Int64 RoundWrapping(Extended X) {
   if (!std::isfinite(X)) return INT64_MIN;
@@ -112,13 +111,13 @@ Currency QENCurrency2Currency(TQENCurrency X) {
   return static_cast<Currency>(detail::StoredOf(X) * 100);
 }
 TQENCurrency QENLongCurrency2QENCurrency(TQENLongCurrency X) {
-  return CheckedCurr(DivRoundHalfEven(detail::StoredOf(X), 10000));
+  return CheckedCurr(detail::DivRoundHalfEven(detail::StoredOf(X), 10000));
 }
 Currency QENLongCurrency2Currency(TQENLongCurrency X) {
-  return static_cast<Currency>(DivRoundHalfEven(detail::StoredOf(X), 100));
+  return static_cast<Currency>(detail::DivRoundHalfEven(detail::StoredOf(X), 100));
 }
 TQENCurrency Currency2QENCurrency(Currency X) {
-  return CheckedCurr(DivRoundHalfEven(detail::StoredOf(X), 100));
+  return CheckedCurr(detail::DivRoundHalfEven(detail::StoredOf(X), 100));
 }
 TQENLongCurrency Currency2QENLongCurrency(Currency X) {
   return static_cast<TQENLongCurrency>(CheckedScaleUp(detail::StoredOf(X), 100));

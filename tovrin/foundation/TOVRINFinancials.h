@@ -15,6 +15,9 @@
 #pragma once
 
 #include <cmath>
+#include <cstdint>
+#include <type_traits>
+#include <utility>
 
 #include "tovrin/foundation/TOVRINFoundation.h"
 
@@ -79,6 +82,10 @@ inline Extended RoundHalfEven(Extended X) {
 // modulo 2^64 into an Int64 (two's complement); a NaN or an infinity gives -2^63, the x87
 // integer indefinite. Storing into a TQENCurrency then keeps the low 32 bits.
 Int64 RoundWrapping(Extended X);
+
+// Q / D rounded to the nearest integer, an exact half to the even one, in integer
+// arithmetic (0 < D <= 2^32).
+Int64 DivRoundHalfEven(Int64 Q, Int64 D);
 
 // Float X times the money scale of T, rounded by the rule of this header into T's stored
 // integer; raises rsInvalidValue out of range. Float2QENCurrency and Float2QENLongCurrency

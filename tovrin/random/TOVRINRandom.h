@@ -1,4 +1,190 @@
 // The uniform source and the random-variate generators.
+//
+// Every generator comes as a pair: one overload takes a uniform source (TRandomGenFunction) as
+// its last argument, its twin without it draws from VerdanRandom and behaves exactly as the
+// first given VerdanRandom. A generator keeps nothing between calls: two calls with the same
+// arguments differ only through the state of the uniform source. Argument checks raise
+// EMathError before the first uniform is drawn, unless a family says otherwise.
+//
+// Where a generator truncates a value to an integer (Trunc), a value that is NaN or lies outside
+// the Int64 range raises rsInvalidValue instead (the conversion would be undefined).
 #pragma once
 
+#include <cstdint>
+#include <memory>
+#include <type_traits>
+
 #include "tovrin/foundation/TOVRINFoundation.h"
+
+namespace tovrin {
+
+// --- The uniform source -----------------------------------------------------------------------
+// A uniform on [0, 1) with 64 random mantissa bits (every multiple of 2^-64 below 1 is equally
+// likely). Safe to call from several threads; no lock is taken on the way.
+//
+// Seeding rule. The process holds one seed (0 at start-up, so a program that never seeds gets
+// the same numbers on every run) from which numbered streams of a xoshiro256** generator are
+// derived; every thread draws from a stream of its own:
+//  - SetRandSeed(S) makes S the process seed and puts the calling thread on stream 0 of S at
+//    once, so the draws that thread makes after SetRandSeed(S) are the same on every run,
+//    whatever other threads do.
+//  - Any other thread moves to a fresh stream of the new seed (1, 2, ..., in the order in which
+//    the threads next draw) at its next draw. A thread that draws for the first time takes the
+//    next stream number of the current seed (the first thread ever to draw without a seed being
+//    set gets stream 0 of seed 0).
+//  - Randomize() is SetRandSeed with a value taken from the clocks.
+// A thread that needs a reproducible stream independent of other threads' scheduling seeds on
+// that thread, or passes its own TRandomGenFunction.
+Extended VerdanRandom();
+void SetRandSeed(std::uint64_t Seed);
+void Randomize();
+
+// A reference to a uniform source: a function of no arguments returning an Extended uniform on
+// [0, 1). It accepts a plain function (`Extended MyUniform()`), a function pointer, or any
+// callable object such as a capturing lambda. It does not own or copy the callable: it holds a
+// pointer to it, so the callable must outlive every call made through the reference (a lambda
+// written in the argument list of a generator call lives long enough). Copying the reference
+// and calling through it never allocates.
+class TRandomGenFunction {
+ public:
+  template <typename F>
+  requires(!std::is_same_v<std::remove_cvref_t<F>, TRandomGenFunction> &&
+           std::is_invocable_r_v<Extended, F&>) TRandomGenFunction(F&& Source)
+  noexcept {  // NOLINT: implicit by design
+    using T = std::remove_reference_t<F>;
+    using Plain = std::remove_cvref_t<F>;
+    if constexpr (std::is_function_v<T>) {
+      target_.function = reinterpret_cast<void (*)()>(&Source);
+      call_ = &CallFunction<T*>;
+    } else if constexpr (std::is_pointer_v<Plain> &&
+                         std::is_function_v<std::remove_pointer_t<Plain>>) {
+      target_.function = reinterpret_cast<void (*)()>(Source);
+      call_ = &CallFunction<Plain>;
+    } else {
+      target_.object = const_cast<void*>(static_cast<const void*>(std::addressof(Source)));
+      call_ = &CallObject<T>;
+    }
+  }
+
+  Extended operator()() const { return call_(target_); }
+
+ private:
+  union Target {
+    void* object;
+    void (*function)();
+  };
+  template <typename Pointer>
+  static Extended CallFunction(Target t) {
+    return static_cast<Extended>(reinterpret_cast<Pointer>(t.function)());
+  }
+  template <typename T>
+  static Extended CallObject(Target t) {
+    return static_cast<Extended>((*static_cast<T*>(t.object))());
+  }
+
+  Target target_;
+  Extended (*call_)(Target);
+};
+
+// --- Normal and log-normal ----------------------------------------------------------------------
+// Standard normal by Leva's ratio of uniforms (two uniforms per attempt, u first, held as
+// doubles). Raises rsDivideByZero when the accepted u is below 5.0E-324.
+Extended Random_Normal(TRandomGenFunction Gen);
+Extended Random_Normal();
+// Mean + StdDev * Z. StdDev is not checked (zero and negative values are used as given).
+Extended Random_Normal(Extended Mean, Extended StdDev, TRandomGenFunction Gen);
+Extended Random_Normal(Extended Mean, Extended StdDev);
+// A log-normal variate whose own mean and standard deviation are Mean and StdDev.
+// Raises rsInvalidMean for Mean <= 0, rsInvalidStdDev for StdDev <= 0.
+Extended Random_LogNormal(Extended Mean, Extended StdDev, TRandomGenFunction Gen);
+Extended Random_LogNormal(Extended Mean, Extended StdDev);
+
+// --- Gamma, chi-square, exponential, Weibull ----------------------------------------------------
+// Gamma(Shape, scale 1): Marsaglia-Tsang above 1, a power-law/exponential rejection below 1,
+// the exponential at exactly 1. Raises rsInvalidShape for Shape <= 0 and rsShapeTooSmall for
+// 0 < Shape < 5.0E-324.
+Extended Random_Gamma(Extended Shape, TRandomGenFunction Gen);
+Extended Random_Gamma(Extended Shape);
+// 2 * Gamma(DF / 2); DF <= 0 raises rsInvalidShape (the gamma's check).
+Extended Random_ChiSq(LongInt DF, TRandomGenFunction Gen);
+Extended Random_ChiSq(LongInt DF);
+// Exponential with mean 1: -ln u for the first u above 5.0E-324.
+Extended Random_Exponential(TRandomGenFunction Gen);
+Extended Random_Exponential();
+// E^(1/Shape) for an exponential E; negative shapes are accepted. Raises rsInvalidValue for
+// |Shape| <= 5.0E-324.
+Extended Random_Weibull(Extended Shape, TRandomGenFunction Gen);
+Extended Random_Weibull(Extended Shape);
+
+// --- Beta and Student t
+// --------------------------------------------------------------------------- Beta(A, B) on [0, 1]
+// by Cheng's algorithm BA with the larger parameter leading, so that Random_Beta(A, B) = 1 -
+// Random_Beta(B, A) on the same uniforms when A != B. Raises rsInvalidValue for A <= 0 or B <= 0.
+Extended Random_Beta(Extended A, Extended B, TRandomGenFunction Gen);
+Extended Random_Beta(Extended A, Extended B);
+// Student t by ratio of uniforms. Raises rsInvalidValue for DF < 1.
+Extended Random_T(LongInt DF, TRandomGenFunction Gen);
+Extended Random_T(LongInt DF);
+
+// --- Multivariate normal
+// -------------------------------------------------------------------------- Covariance holds the
+// upper triangle of the n x n covariance matrix packed column by column
+// ((i, j), i <= j, 1-based, at (j - 1) j / 2 + i - 1), n = Means.size(). Factor is resized to
+// n (n + 1) / 2 (keeping what it held in front) and receives the upper Cholesky factor U
+// (Covariance = U'U) packed row by row ((i, j) at (i - 1)(2n - i) / 2 + j - 1); Variate becomes
+// Means + U'z for n standard normals z drawn in index order. ErrorCode is 0 on success; a
+// covariance that is not positive definite sets it to 1 and returns at once with Factor partly
+// filled and Variate unchanged. Raises rsVectorEmpty for empty Means and rsVectorTooSmall for
+// a Covariance shorter than n (n + 1) / 2 (nothing is changed then).
+void Random_MVNorm(const TQENFloatVector& Means, const TQENFloatVector& Covariance,
+                   TQENFloatVector& Factor, TQENFloatVector& Variate, LongInt& ErrorCode,
+                   TRandomGenFunction Gen);
+void Random_MVNorm(const TQENFloatVector& Means, const TQENFloatVector& Covariance,
+                   TQENFloatVector& Factor, TQENFloatVector& Variate, LongInt& ErrorCode);
+
+// --- Generalised inverse Gaussian
+// ----------------------------------------------------------------- Density proportional to
+// x^(Lambda - 1) exp(-(Omega / 2)(x + 1/x)). Raises rsInvalidValue for Lambda < 0, Omega <= 0,
+// Lambda > 0.25 Omega sqrt(1.7E+308), or when the method's bounds fall to 5.0E-324 or below.
+Extended Random_Inv_Gauss(Extended Lambda, Extended Omega, TRandomGenFunction Gen);
+Extended Random_Inv_Gauss(Extended Lambda, Extended Omega);
+
+// --- Binomial and negative binomial
+// --------------------------------------------------------------- Binomial(N, P) by inversion
+// walking outward from the mode Trunc((N + 1) P); the mode is returned at once when the first
+// uniform lies below its probability. Arguments are not checked. If rounding leaves the walk
+// unfinished once both ends are reached (it could only step on for ever), rsInvalidValue is raised.
+Int64 Random_Binomial1(LongInt N, Extended P, TRandomGenFunction Gen);
+Int64 Random_Binomial1(LongInt N, Extended P);
+// Binomial(N, P) by BTPE, or by inversion when N min(P, 1 - P) <= 30. Arguments are not
+// checked. The inversion path never gives 0 before the reflection N - y for P > 0.5 (a draw
+// that would give 0 is redrawn). It cannot finish when the probability of 0 is 1 or NaN
+// (P = 0, P = 1, N <= 0 ...), nor when rounding leaves the walk unfinished past 110; those
+// cases raise rsInvalidValue (the first before any draw) instead of running for ever.
+Int64 Random_Binomial2(Int64 N, Extended P, TRandomGenFunction Gen);
+Int64 Random_Binomial2(Int64 N, Extended P);
+// Negative binomial with probabilities C(x + R - 1, x) (1 - P)^R P^x. Raises rsInvalidValue for
+// R <= 0, P <= 0 or P >= 1 (before any draw), and, after the geometric part for P > 0.7 has
+// drawn its uniforms, when the start probability (1 - P)^rho of the remaining fraction would
+// fall below 5.0E-324. Also raises rsInvalidValue if rounding leaves the inversion unfinished
+// after its probabilities have underflowed to zero.
+Int64 Random_Neg_Binomial(Extended R, Extended P, TRandomGenFunction Gen);
+Int64 Random_Neg_Binomial(Extended R, Extended P);
+
+// --- von Mises and Cauchy
+// ------------------------------------------------------------------------- An angle in [-pi, pi]
+// with density proportional to exp(K cos theta). Raises rsInvalidValue unless 0 <= K < 10.
+Extended Random_von_Mises(Extended K, TRandomGenFunction Gen);
+Extended Random_von_Mises(Extended K);
+// Standard Cauchy: x / y for a point (x, y) uniform in the unit disc.
+Extended Random_Cauchy(TRandomGenFunction Gen);
+Extended Random_Cauchy();
+
+// --- Poisson
+// ----------------------------------------------------------------------------------------
+// Poisson(Mu) by Ahrens-Dieter PD: table inversion for Mu <= 10, the normal-based method above.
+// Mu is read only. A non-positive Mu gives 0.
+Int64 Random_Poisson(Extended& Mu, TRandomGenFunction Gen);
+Int64 Random_Poisson(Extended& Mu);
+
+}  // namespace tovrin

@@ -20,8 +20,8 @@ void GetRegressionLine(const TQENFloatVector& X, const TQENFloatVector& Y, Exten
 // The least-squares parabola y = A + B x + C x^2 by Cramer's rule on the normal equations.
 // Raises rsSameDimensions for unequal lengths, rsDivideByZero when the determinant is zero
 // within tolerance (fewer than three distinct x values, or no pairs at all).
-void GetQuadraticCurve(const TQENFloatVector& X, const TQENFloatVector& Y, Extended& A,
-                       Extended& B, Extended& C);
+void GetQuadraticCurve(const TQENFloatVector& X, const TQENFloatVector& Y, Extended& A, Extended& B,
+                       Extended& C);
 // sum (Slope X[i] + Intercept - Y[i])^2; 0 for two empty vectors. Raises rsSameDimensions.
 Extended GetSSE(const TQENFloatVector& X, const TQENFloatVector& Y, Extended Intercept,
                 Extended Slope);

@@ -66,7 +66,7 @@ Extended GetGroupedPopulationSkew(const TQENLWordVector& Freqs, Extended Start, 
                                   Extended Mean, Extended StdDev);
 Extended GetGroupedSampleKurtosis(const TQENLWordVector& Freqs, Extended Start, Extended Width,
                                   Extended Mean, Extended StdDev);
-Extended GetGroupedPopulationKurtosis(const TQENLWordVector& Freqs, Extended Start,
-                                      Extended Width, Extended Mean, Extended StdDev);
+Extended GetGroupedPopulationKurtosis(const TQENLWordVector& Freqs, Extended Start, Extended Width,
+                                      Extended Mean, Extended StdDev);
 
 }  // namespace tovrin

@@ -149,8 +149,8 @@ void GetDeciles(const TQENFloatVector& X, std::array<Extended, 9>& Deciles);
 // With the mean m and standard deviation s given, S3 = sum (x - m)^3 and S4 = sum (x - m)^4:
 //   GetSampleSkew          n S3 / ((n - 1)(n - 2) s^3)
 //   GetPopulationSkew      S3 / (n s^3)
-//   GetSampleKurtosis      n (n + 1) S4 / ((n - 1)(n - 2)(n - 3) s^4) - 3 (n - 1)^2 / ((n - 2)(n - 3))
-//   GetPopulationKurtosis  S4 / (n s^4) - 3
+//   GetSampleKurtosis      n (n + 1) S4 / ((n - 1)(n - 2)(n - 3) s^4) - 3 (n - 1)^2 / ((n - 2)(n -
+//   3)) GetPopulationKurtosis  S4 / (n s^4) - 3
 // Both kurtoses are excess kurtoses. The forms without m and s take them from
 // SampleStdDevAndMean (sample forms) or PopulationStdDevAndMean (population forms).
 // Checks in order: rsVectorIsEmpty; rsVectorG2 for fewer than 3 elements (skews) or rsVectorG3

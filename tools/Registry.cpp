@@ -1,0 +1,46 @@
+#include "tools/Registry.h"
+
+namespace tovrin::cli {
+
+std::vector<const Callable*> FindCallables(const CallableTable& Table, const std::string& Name) {
+  std::vector<const Callable*> found;
+  for (const Callable& entry : Table) {
+    if (entry.name == Name) found.push_back(&entry);
+  }
+  return found;
+}
+
+namespace {
+std::string Signature(const Callable& Entry) {
+  std::string text = Entry.name;
+  for (const std::string& param : Entry.params) text += " " + param;
+  if (Entry.variadic) text += "...";
+  return text;
+}
+}  // namespace
+
+std::function<std::string()> BindByName(const CallableTable& Table, const std::string& What,
+                                        const std::string& Name,
+                                        std::span<const std::string> Arguments) {
+  const std::vector<const Callable*> found = FindCallables(Table, Name);
+  if (found.empty()) {
+    throw UsageError("unknown " + What + " '" + Name + "' (the names are case-sensitive)");
+  }
+  for (const Callable* entry : found) {
+    if (entry->variadic || entry->params.size() == Arguments.size()) {
+      return entry->bind(Arguments);
+    }
+  }
+  std::string message = Name + " does not take " + std::to_string(Arguments.size()) +
+                        " argument" + (Arguments.size() == 1 ? "" : "s") + "; it takes:";
+  for (const Callable* entry : found) message += "\n  " + Signature(*entry);
+  throw UsageError(message);
+}
+
+std::string ListCallables(const CallableTable& Table) {
+  std::string text;
+  for (const Callable& entry : Table) text += Signature(entry) + "\n";
+  return text;
+}
+
+}  // namespace tovrin::cli

@@ -1,0 +1,320 @@
+#include "tovrin/currency/TOVRINFinVector.h"
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <cstdint>
+#include <initializer_list>
+#include <limits>
+#include <type_traits>
+#include <vector>
+
+namespace tovrin {
+namespace {
+
+// A money value from its stored integer, and back.
+template <typename T>
+T M(Int64 Stored) {
+  return static_cast<T>(static_cast<std::underlying_type_t<T>>(Stored));
+}
+template <typename T>
+std::vector<T> Vec(std::initializer_list<Int64> Stored) {
+  std::vector<T> v;
+  for (const Int64 s : Stored) v.push_back(M<T>(s));
+  return v;
+}
+template <typename T>
+std::vector<Int64> StoredOf(const std::vector<T>& V) {
+  std::vector<Int64> out;
+  for (const T x : V) out.push_back(detail::StoredOf(x));
+  return out;
+}
+using Ints = std::vector<Int64>;
+
+template <typename Call>
+void ExpectRaises(TResStringId Ident, Call&& call) {
+  try {
+    call();
+    ADD_FAILURE() << "no EMathError raised";
+  } catch (const EMathError& e) {
+    EXPECT_EQ(e.Ident(), Ident) << e.what();
+  }
+}
+
+template <typename T>
+class MoneyVector : public ::testing::Test {};
+using MoneyTypes = ::testing::Types<TQENCurrency, TQENLongCurrency, Currency>;
+TYPED_TEST_SUITE(MoneyVector, MoneyTypes);
+
+TYPED_TEST(MoneyVector, BuildingFollowsTheIndexRules) {
+  using T = TypeParam;
+  auto v = Vec<T>({1, 2});
+  AddValue2Vector(v, M<T>(7), 0);
+  EXPECT_EQ(StoredOf(v), (Ints{7, 1, 2}));
+  v = Vec<T>({1, 2});
+  AddValue2Vector(v, M<T>(7), 1);
+  EXPECT_EQ(StoredOf(v), (Ints{1, 7, 2}));
+  for (const LongInt index : {2, -1, 1000000}) {
+    v = Vec<T>({1, 2});
+    AddValue2Vector(v, M<T>(7), index);
+    EXPECT_EQ(StoredOf(v), (Ints{1, 2, 7})) << index;
+  }
+  std::vector<T> e;
+  AddValue2Vector(e, M<T>(7), 5);
+  EXPECT_EQ(StoredOf(e), (Ints{7}));
+  AppendValue2Vector(e, M<T>(-3));
+  EXPECT_EQ(StoredOf(e), (Ints{7, -3}));
+  v = Vec<T>({1, 2});
+  DeleteValueFromVector(v, 2);
+  EXPECT_EQ(StoredOf(v), (Ints{1, 2}));
+  DeleteValueFromVector(v, -1);
+  EXPECT_EQ(StoredOf(v), (Ints{1, 2}));
+  v = Vec<T>({1, 2, 3});
+  DeleteValueFromVector(v, 0);
+  EXPECT_EQ(StoredOf(v), (Ints{2, 3}));
+  v = Vec<T>({5});
+  DeleteValueFromVector(v, 0);
+  EXPECT_TRUE(v.empty());
+}
+
+TYPED_TEST(MoneyVector, ExtremesCompareStoredIntegers) {
+  using T = TypeParam;
+  const auto v = Vec<T>({3, 1, 4, 1, 5});
+  EXPECT_EQ(detail::StoredOf(MaxVector(v)), 5);
+  EXPECT_EQ(detail::StoredOf(MinVector(v)), 1);
+  T lo{}, hi{};
+  LongWord loIndex = 9, hiIndex = 9;
+  bool loUnique = true, hiUnique = false;
+  MinMaxVector(v, lo, hi, loIndex, hiIndex, loUnique, hiUnique);
+  EXPECT_EQ(detail::StoredOf(lo), 1);
+  EXPECT_EQ(loIndex, 1u);
+  EXPECT_FALSE(loUnique);
+  EXPECT_EQ(detail::StoredOf(hi), 5);
+  EXPECT_EQ(hiIndex, 4u);
+  EXPECT_TRUE(hiUnique);
+  MinMaxVector(Vec<T>({-2, -2}), lo, hi, loIndex, hiIndex, loUnique, hiUnique);
+  EXPECT_EQ(detail::StoredOf(lo), -2);
+  EXPECT_EQ(loIndex, 0u);
+  EXPECT_FALSE(loUnique);
+  EXPECT_FALSE(hiUnique);
+}
+
+TYPED_TEST(MoneyVector, EmptyVectorsRaiseBeforeAnything) {
+  using T = TypeParam;
+  const std::vector<T> e;
+  ExpectRaises(rsVectorIsEmpty, [&] { MaxVector(e); });
+  ExpectRaises(rsVectorIsEmpty, [&] { MinVector(e); });
+  ExpectRaises(rsVectorIsEmpty, [&] { SumVector(e); });
+  T lo = M<T>(11), hi = M<T>(12);
+  LongWord i1 = 3, i2 = 4;
+  bool u1 = false, u2 = false;
+  ExpectRaises(rsVectorIsEmpty, [&] { MinMaxVector(e, lo, hi, i1, i2, u1, u2); });
+  EXPECT_EQ(detail::StoredOf(lo), 11);
+  EXPECT_EQ(i1, 3u);
+  ExpectRaises(rsVectorIsEmpty, [&] { VectorNonNegative(e); });
+  ExpectRaises(rsVectorIsEmpty, [&] { VectorNegative(e); });
+  ExpectRaises(rsVectorIsEmpty, [&] { VectorNonPositive(e); });
+  ExpectRaises(rsVectorIsEmpty, [&] { VectorNonZero(e); });
+  ExpectRaises(rsVectorIsEmpty, [&] { VectorZero(e); });
+  ExpectRaises(rsVectorIsEmpty, [&] { VectorPositive(e); });
+  std::vector<T> w;
+  ExpectRaises(rsVectorIsEmpty, [&] { LinearTransformVector(w, 2, 1); });
+  EXPECT_TRUE(w.empty());
+}
+
+TYPED_TEST(MoneyVector, SignPredicatesOnNegativeZeroAndPositive) {
+  using T = TypeParam;
+  // The smallest stored unit is well beyond the tolerance for every type, Currency included.
+  const auto neg = Vec<T>({-1, -7}), zero = Vec<T>({0, 0}), pos = Vec<T>({1, 7});
+  const auto mixed = Vec<T>({0, 1});
+  EXPECT_TRUE(VectorNegative(neg));
+  EXPECT_FALSE(VectorNegative(zero));
+  EXPECT_TRUE(VectorNonPositive(neg));
+  EXPECT_TRUE(VectorNonPositive(zero));
+  EXPECT_FALSE(VectorNonPositive(pos));
+  EXPECT_TRUE(VectorZero(zero));
+  EXPECT_FALSE(VectorZero(mixed));
+  EXPECT_TRUE(VectorNonZero(neg));
+  EXPECT_TRUE(VectorNonZero(pos));
+  EXPECT_FALSE(VectorNonZero(mixed));
+  EXPECT_TRUE(VectorNonNegative(zero));
+  EXPECT_TRUE(VectorNonNegative(mixed));
+  EXPECT_FALSE(VectorNonNegative(neg));
+  EXPECT_TRUE(VectorPositive(pos));
+  EXPECT_FALSE(VectorPositive(mixed));
+}
+
+TYPED_TEST(MoneyVector, SortsAndRanksByStoredIntegers) {
+  using T = TypeParam;
+  auto v = Vec<T>({3, 1, 2});
+  QSortVector(v, true);
+  EXPECT_EQ(StoredOf(v), (Ints{1, 2, 3}));
+  QSortVector(v, false);
+  EXPECT_EQ(StoredOf(v), (Ints{3, 2, 1}));
+  // A reference scan: a longer vector sorts to the order std::sort gives.
+  std::vector<Int64> raw;
+  for (Int64 k = 0; k < 300; ++k) raw.push_back((k * 7919) % 101 - 50);
+  std::vector<T> big;
+  for (const Int64 s : raw) big.push_back(M<T>(s));
+  QSortVector(big, true);
+  std::sort(raw.begin(), raw.end());
+  EXPECT_EQ(StoredOf(big), raw);
+
+  EXPECT_EQ(Vector2RankVector(Vec<T>({10, 30, 20}), true), (TQENLIntVector{0, 2, 1}));
+  EXPECT_EQ(Vector2RankVector(Vec<T>({10, 30, 20}), false), (TQENLIntVector{2, 0, 1}));
+  EXPECT_EQ(Vector2RankVector(Vec<T>({5, 3, 5}), true), (TQENLIntVector{1, 0, 1}));
+  EXPECT_EQ(Vector2RankVector(Vec<T>({2, 2, 2}), true), (TQENLIntVector{0, 0, 0}));
+  // Neighbouring stored integers are different values, never ties.
+  EXPECT_EQ(Vector2RankVector(Vec<T>({2, 1, 2, 3}), true), (TQENLIntVector{1, 0, 1, 3}));
+  EXPECT_TRUE(Vector2RankVector(std::vector<T>{}, true).empty());
+  EXPECT_EQ(Vector2Rank(Vec<T>({10, 30, 20}), 3, true), -1);
+  EXPECT_EQ(Vector2Rank(Vec<T>({10, 30, 20}), 2, true), 1);
+  EXPECT_EQ(Vector2RankValue(Vec<T>({10, 30, 20}), M<T>(25), true), -1);
+  EXPECT_EQ(Vector2RankValue(Vec<T>({10, 30, 20}), M<T>(30), false), 0);
+  EXPECT_EQ(Vector2RankValue(Vec<T>({10, 30, 20}), M<T>(21), true), -1);
+  EXPECT_EQ(Vector2RankValue(std::vector<T>{}, M<T>(0), true), -1);
+}
+
+TYPED_TEST(MoneyVector, SumsAndDifferencesOfEqualLengths) {
+  using T = TypeParam;
+  const auto a = Vec<T>({1, -2, 300}), b = Vec<T>({10, 20, -30});
+  EXPECT_EQ(StoredOf(AddVectors(a, b)), (Ints{11, 18, 270}));
+  EXPECT_EQ(StoredOf(SubtractVectors(a, b)), (Ints{-9, -22, 330}));
+  auto c = a;
+  AddToVector(c, b);
+  EXPECT_EQ(StoredOf(c), (Ints{11, 18, 270}));
+  SubtractFromVector(c, b);
+  EXPECT_EQ(StoredOf(c), (Ints{1, -2, 300}));
+  EXPECT_TRUE(AddVectors(std::vector<T>{}, std::vector<T>{}).empty());
+  const auto shorter = Vec<T>({1, 2});
+  ExpectRaises(rsSameDimensions, [&] { AddVectors(a, shorter); });
+  ExpectRaises(rsSameDimensions, [&] { SubtractVectors(a, shorter); });
+  ExpectRaises(rsSameDimensions, [&] { AddToVector(c, shorter); });
+  ExpectRaises(rsSameDimensions, [&] { SubtractFromVector(c, shorter); });
+  EXPECT_EQ(StoredOf(c), (Ints{1, -2, 300}));
+  EXPECT_EQ(detail::StoredOf(SumVector(a)), 299);
+}
+
+TYPED_TEST(MoneyVector, FillClearReverseCopy) {
+  using T = TypeParam;
+  auto v = Vec<T>({1, 2, 3});
+  EXPECT_EQ(StoredOf(ReverseVector(v)), (Ints{3, 2, 1}));
+  EXPECT_EQ(StoredOf(v), (Ints{1, 2, 3}));
+  auto copy = CopyVector(v);
+  EXPECT_NE(copy.data(), v.data());
+  FillVector(v, M<T>(-4));
+  EXPECT_EQ(StoredOf(v), (Ints{-4, -4, -4}));
+  EXPECT_EQ(StoredOf(copy), (Ints{1, 2, 3}));
+  ClearVector(v);
+  EXPECT_EQ(StoredOf(v), (Ints{0, 0, 0}));
+  EXPECT_TRUE(ReverseVector(std::vector<T>{}).empty());
+}
+
+TYPED_TEST(MoneyVector, ConversionsToTheSameTypeCopy) {
+  using T = TypeParam;
+  const auto v = Vec<T>({5, -6});
+  std::vector<T> same;
+  if constexpr (std::is_same_v<T, TQENCurrency>) same = Vector2QENCurrVector(v);
+  if constexpr (std::is_same_v<T, TQENLongCurrency>) same = Vector2QENLongCurrVector(v);
+  if constexpr (std::is_same_v<T, Currency>) same = Vector2QENCurrencyVector(v);
+  EXPECT_EQ(StoredOf(same), (Ints{5, -6}));
+  EXPECT_NE(same.data(), v.data());
+}
+
+// --- Type-specific rules ----------------------------------------------------------------------
+
+TEST(MoneyVectorWrapAround, SumsWrapAtTheStoredWidth) {
+  // 32 bits for TQENCurrency: the sum is not widened to 64.
+  EXPECT_EQ(detail::StoredOf(SumVector(Vec<TQENCurrency>({INT32_MAX, 1}))), INT32_MIN);
+  EXPECT_EQ(detail::StoredOf(SumVector(Vec<TQENLongCurrency>({INT64_MAX, 1}))), INT64_MIN);
+  EXPECT_EQ(detail::StoredOf(SumVector(Vec<Currency>({INT64_MIN, -1}))), INT64_MAX);
+  EXPECT_EQ(StoredOf(AddVectors(Vec<TQENCurrency>({INT32_MAX}), Vec<TQENCurrency>({2}))),
+            (Ints{INT32_MIN + 1}));
+  EXPECT_EQ(StoredOf(SubtractVectors(Vec<TQENCurrency>({INT32_MIN}), Vec<TQENCurrency>({1}))),
+            (Ints{INT32_MAX}));
+  auto l = Vec<TQENLongCurrency>({INT64_MAX});
+  AddToVector(l, Vec<TQENLongCurrency>({1}));
+  EXPECT_EQ(StoredOf(l), (Ints{INT64_MIN}));
+  auto c = Vec<Currency>({INT64_MIN});
+  SubtractFromVector(c, Vec<Currency>({1}));
+  EXPECT_EQ(StoredOf(c), (Ints{INT64_MAX}));
+}
+
+TEST(MoneyVectorLinearTransform, WorksInAmounts) {
+  // Currency [1.5] with A = 2 and B = 0.25 (an amount) gives [3.25].
+  auto c = Vec<Currency>({15000});
+  LinearTransformVector(c, 2, 0.25L);
+  EXPECT_EQ(StoredOf(c), (Ints{32500}));
+  auto q = Vec<TQENCurrency>({150});
+  LinearTransformVector(q, 2, 0.25L);
+  EXPECT_EQ(StoredOf(q), (Ints{325}));
+  auto l = Vec<TQENLongCurrency>({1500000});
+  LinearTransformVector(l, 2, 0.25L);
+  EXPECT_EQ(StoredOf(l), (Ints{3250000}));
+}
+
+TEST(MoneyVectorLinearTransform, HalvesGoToEven) {
+  // Amounts 0.5 and 1.5 times 0.25 are 12.5 and 37.5 hundredths.
+  auto q = Vec<TQENCurrency>({50, 150, -50});
+  LinearTransformVector(q, 0.25L, 0);
+  EXPECT_EQ(StoredOf(q), (Ints{12, 38, -12}));
+  auto l = Vec<TQENLongCurrency>({1000000});
+  LinearTransformVector(l, 0.0078125L, 0);  // 7812.5 millionths
+  EXPECT_EQ(StoredOf(l), (Ints{7812}));
+  auto c = Vec<Currency>({1, 3, 5});
+  LinearTransformVector(c, 0.5L, 0);  // 0.5, 1.5, 2.5 stored units
+  EXPECT_EQ(StoredOf(c), (Ints{0, 2, 2}));
+}
+
+TEST(MoneyVectorLinearTransform, OutOfRangeRaisesAndLeavesTheVector) {
+  auto q = Vec<TQENCurrency>({1, 10000000});
+  ExpectRaises(rsInvalidValue, [&] { LinearTransformVector(q, 1000, 0); });
+  EXPECT_EQ(StoredOf(q), (Ints{1, 10000000}));
+  auto l = Vec<TQENLongCurrency>({1, INT64_MAX / 2});
+  ExpectRaises(rsInvalidValue, [&] { LinearTransformVector(l, 4, 0); });
+  EXPECT_EQ(StoredOf(l), (Ints{1, INT64_MAX / 2}));
+  // Currency works on its stored integer and wraps unreported: (2^63 - 1) x 2 = 2^64 - 2.
+  auto c = Vec<Currency>({INT64_MAX});
+  LinearTransformVector(c, 2, 0);
+  EXPECT_EQ(StoredOf(c), (Ints{-2}));
+}
+
+TEST(MoneyVectorConversions, ToFloatDividesByTheScale) {
+  const TQENFloatVector f = Vector2FloatVector(Vec<TQENCurrency>({12345, -1}));
+  ASSERT_EQ(f.size(), 2u);
+  EXPECT_EQ(Extended(f[0]), 123.45L);
+  EXPECT_EQ(Extended(f[1]), -0.01L);
+  EXPECT_EQ(Extended(Vector2FloatVector(Vec<TQENLongCurrency>({1500000}))[0]), 1.5L);
+  EXPECT_EQ(Extended(Vector2FloatVector(Vec<Currency>({-12346}))[0]), -1.2346L);
+  EXPECT_TRUE(Vector2FloatVector(std::vector<Currency>{}).empty());
+}
+
+TEST(MoneyVectorConversions, FromFloatRoundsTheExactProduct) {
+  const TQENFloatVector f{1.23456L};
+  EXPECT_EQ(StoredOf(Vector2QENCurrencyVector(f)), (Ints{12346}));
+  // 0.125 is a true half of a hundredth; 2.675L lies below 2.675 (see TOVRINFinancials_ref.py).
+  const TQENFloatVector g{0.125L, 0.375L, 2.675L, -0.125L};
+  EXPECT_EQ(StoredOf(Vector2QENCurrVector(g)), (Ints{12, 38, 267, -12}));
+  EXPECT_EQ(StoredOf(Vector2QENLongCurrVector(TQENFloatVector{0.0078125L, 0.0000005L})),
+            (Ints{7812, 1}));
+  EXPECT_EQ(StoredOf(Vector2QENCurrencyVector(TQENFloatVector{0.000025L, 0.00015L})), (Ints{0, 2}));
+  EXPECT_TRUE(Vector2QENCurrVector(TQENFloatVector{}).empty());
+  ExpectRaises(rsInvalidValue, [] { Vector2QENCurrVector(TQENFloatVector{1, 1e300L}); });
+  ExpectRaises(rsInvalidValue, [] { Vector2QENCurrencyVector(TQENFloatVector{1e16L}); });
+}
+
+TEST(MoneyVectorConversions, BetweenMoneyTypes) {
+  EXPECT_EQ(StoredOf(Vector2QENLongCurrVector(Vec<TQENCurrency>({-12345}))), (Ints{-123450000}));
+  EXPECT_EQ(StoredOf(Vector2QENCurrencyVector(Vec<TQENCurrency>({12345}))), (Ints{1234500}));
+  EXPECT_EQ(StoredOf(Vector2QENCurrVector(Vec<TQENLongCurrency>({15000, 25000, -25001}))),
+            (Ints{2, 2, -3}));
+  EXPECT_EQ(StoredOf(Vector2QENCurrencyVector(Vec<TQENLongCurrency>({250, 350}))), (Ints{2, 4}));
+  EXPECT_EQ(StoredOf(Vector2QENCurrVector(Vec<Currency>({150, -50}))), (Ints{2, 0}));
+  EXPECT_EQ(StoredOf(Vector2QENLongCurrVector(Vec<Currency>({-15}))), (Ints{-1500}));
+  EXPECT_TRUE(Vector2QENLongCurrVector(std::vector<Currency>{}).empty());
+  ExpectRaises(rsInvalidValue, [] { Vector2QENCurrVector(Vec<Currency>({214748364750})); });
+  ExpectRaises(rsInvalidValue, [] { Vector2QENLongCurrVector(Vec<Currency>({INT64_MAX})); });
+}
+
+}  // namespace
+}  // namespace tovrin

@@ -1,0 +1,380 @@
+// Tests of creation, shape queries, conversion, arithmetic, element-wise functions and the
+// grand mean.
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <limits>
+
+#include "tovrin/foundation/detail/ElementRules.h"
+#include "tovrin/matrix/TOVRINMatrix.h"
+#include "tovrin/matrix/TOVRINMatrix_test_support.h"
+
+namespace tovrin {
+namespace {
+
+using testing::ExpectMathError;
+using testing::ExpectRaisesUntouched;
+using testing::Make;
+using testing::Matrix;
+using testing::RectangularCheckSwitch;
+using testing::SameBits;
+using testing::Values;
+using Rows = std::vector<std::vector<long double>>;
+
+// The creators of each element type, so that typed tests can reach the per-type names.
+template <typename T>
+struct Creators;
+#define TOVRIN_CREATORS(T, Name)                                                    \
+  template <>                                                                       \
+  struct Creators<T> {                                                              \
+    static auto Create(LongWord R, LongWord C) { return Create##Name##Matrix(R, C); } \
+    static auto Identity(LongWord N) { return Create##Name##IdentityMatrix(N); }   \
+  };
+TOVRIN_CREATORS(PackedExtended, Float)
+TOVRIN_CREATORS(Double, Double)
+TOVRIN_CREATORS(Single, Single)
+TOVRIN_CREATORS(Int64, Int64)
+TOVRIN_CREATORS(LongWord, LWord)
+TOVRIN_CREATORS(LongInt, LInt)
+TOVRIN_CREATORS(Word, Word)
+TOVRIN_CREATORS(SmallInt, SmallInt)
+TOVRIN_CREATORS(Byte, Byte)
+TOVRIN_CREATORS(ShortInt, SInt)
+#undef TOVRIN_CREATORS
+
+// --- Every element type ---------------------------------------------------------------------
+
+template <typename T>
+class MatrixAllTypes : public ::testing::Test {};
+TYPED_TEST_SUITE(MatrixAllTypes, testing::AllMatrixTypes);
+
+TYPED_TEST(MatrixAllTypes, CreateGivesZerosOfTheAskedShape) {
+  const auto m = Creators<TypeParam>::Create(2, 3);
+  static_assert(std::is_same_v<std::remove_const_t<decltype(m)>, Matrix<TypeParam>>);
+  EXPECT_EQ(Values(m), (Rows{{0, 0, 0}, {0, 0, 0}}));
+  EXPECT_TRUE(Creators<TypeParam>::Create(0, 5).empty());
+  EXPECT_EQ(MatrixCols(Creators<TypeParam>::Create(0, 5)), 0);
+  EXPECT_EQ(Values(Creators<TypeParam>::Create(3, 0)), (Rows{{}, {}, {}}));
+}
+
+TYPED_TEST(MatrixAllTypes, IdentityHasOnesOnTheDiagonal) {
+  EXPECT_EQ(Values(Creators<TypeParam>::Identity(3)), (Rows{{1, 0, 0}, {0, 1, 0}, {0, 0, 1}}));
+  EXPECT_TRUE(Creators<TypeParam>::Identity(0).empty());
+}
+
+TYPED_TEST(MatrixAllTypes, RowsAndColsLookAtRowZeroOnly) {
+  EXPECT_EQ(MatrixRows(Matrix<TypeParam>{}), 0);
+  EXPECT_EQ(MatrixCols(Matrix<TypeParam>{}), 0);
+  const auto ragged = Make<TypeParam>({{1, 2}, {3}, {4, 5, 6}});
+  EXPECT_EQ(MatrixRows(ragged), 3);
+  EXPECT_EQ(MatrixCols(ragged), 2);
+}
+
+TYPED_TEST(MatrixAllTypes, IsRectangularIgnoresTheSwitch) {
+  for (bool on : {true, false}) {
+    RectangularCheckSwitch sw(on);
+    EXPECT_FALSE(MatrixIsRectangular(Matrix<TypeParam>{}));
+    EXPECT_TRUE(MatrixIsRectangular(Make<TypeParam>({{}, {}})));
+    EXPECT_TRUE(MatrixIsRectangular(Make<TypeParam>({{1, 2}, {3, 4}, {5, 6}})));
+    EXPECT_FALSE(MatrixIsRectangular(Make<TypeParam>({{1, 2}, {3, 4}, {5}})));
+    EXPECT_FALSE(MatrixIsRectangular(Make<TypeParam>({{1}, {3, 4}})));
+  }
+}
+
+struct Dims {
+  LongWord Rows;
+  LongWord Cols;
+  bool Rectangular;
+  bool operator==(const Dims&) const = default;
+};
+template <typename T>
+Dims DimsOf(const Matrix<T>& M) {
+  Dims d{99, 99, false};
+  MatrixDimensions(M, d.Rows, d.Cols, d.Rectangular);
+  return d;
+}
+
+TYPED_TEST(MatrixAllTypes, DimensionsWithTheSwitchOn) {
+  RectangularCheckSwitch sw(true);
+  EXPECT_EQ(DimsOf(Matrix<TypeParam>{}), (Dims{0, 0, false}));
+  EXPECT_EQ(DimsOf(Make<TypeParam>({{}, {1}})), (Dims{2, 0, false}));
+  EXPECT_EQ(DimsOf(Make<TypeParam>({{1, 2}, {3}})), (Dims{2, 0, false}));
+  EXPECT_EQ(DimsOf(Make<TypeParam>({{1, 2}, {3, 4, 5}})), (Dims{2, 0, false}));
+  EXPECT_EQ(DimsOf(Make<TypeParam>({{1, 2, 3}, {4, 5, 6}})), (Dims{2, 3, true}));
+  EXPECT_FALSE(MatrixIsSquare(Matrix<TypeParam>{}));
+  EXPECT_TRUE(MatrixIsSquare(Make<TypeParam>({{1, 2}, {3, 4}})));
+  EXPECT_FALSE(MatrixIsSquare(Make<TypeParam>({{1, 2}, {3}})));
+  EXPECT_FALSE(MatrixIsSquare(Make<TypeParam>({{1, 2, 3}, {4, 5, 6}})));
+}
+
+TYPED_TEST(MatrixAllTypes, DimensionsWithTheSwitchOff) {
+  RectangularCheckSwitch sw(false);
+  EXPECT_EQ(DimsOf(Matrix<TypeParam>{}), (Dims{0, 0, true}));
+  EXPECT_EQ(DimsOf(Make<TypeParam>({{}, {1}})), (Dims{2, 0, true}));
+  EXPECT_EQ(DimsOf(Make<TypeParam>({{1, 2}, {3}})), (Dims{2, 2, true}));
+  EXPECT_TRUE(MatrixIsSquare(Matrix<TypeParam>{}));
+  EXPECT_TRUE(MatrixIsSquare(Make<TypeParam>({{1, 2}, {3}})));
+}
+
+TYPED_TEST(MatrixAllTypes, SameDimensions) {
+  const auto a = Make<TypeParam>({{1, 2, 3}, {4, 5, 6}});
+  const auto b = Make<TypeParam>({{0, 0, 0}, {0, 0, 0}});
+  const auto ragged = Make<TypeParam>({{1, 2, 3}, {4, 5}});
+  {
+    RectangularCheckSwitch sw(true);
+    EXPECT_TRUE(MatricesSameDimensions(a, b));
+    EXPECT_FALSE(MatricesSameDimensions(a, ragged));
+    EXPECT_FALSE(MatricesSameDimensions(ragged, ragged));
+    EXPECT_FALSE(MatricesSameDimensions(a, Make<TypeParam>({{1, 2}, {3, 4}})));
+    EXPECT_FALSE(MatricesSameDimensions(Matrix<TypeParam>{}, Matrix<TypeParam>{}));
+  }
+  {
+    RectangularCheckSwitch sw(false);
+    EXPECT_TRUE(MatricesSameDimensions(a, ragged));
+    EXPECT_TRUE(MatricesSameDimensions(Matrix<TypeParam>{}, Matrix<TypeParam>{}));
+  }
+}
+
+TYPED_TEST(MatrixAllTypes, ToFloatMatrixKeepsTheShapeAndTheValues) {
+  const auto m = Make<TypeParam>({{1, 2}, {}, {3, 4, 5}});
+  const TQENFloatMatrix f = Matrix2FloatMatrix(m);
+  EXPECT_EQ(Values(f), (Rows{{1, 2}, {}, {3, 4, 5}}));
+  EXPECT_TRUE(Matrix2FloatMatrix(Matrix<TypeParam>{}).empty());
+  // The extreme values of the type are held exactly.
+  using V = detail::ValueOf<TypeParam>;
+  const Matrix<TypeParam> extremes{
+      {TypeParam(std::numeric_limits<V>::max()), TypeParam(std::numeric_limits<V>::lowest())}};
+  const TQENFloatMatrix g = Matrix2FloatMatrix(extremes);
+  EXPECT_EQ(static_cast<long double>(g[0][0]),
+            static_cast<long double>(std::numeric_limits<V>::max()));
+  EXPECT_EQ(static_cast<long double>(g[0][1]),
+            static_cast<long double>(std::numeric_limits<V>::lowest()));
+}
+
+TEST(MatrixConversion, ExactValuesOfWideTypes) {
+  const TQENFloatMatrix i = Matrix2FloatMatrix(TQENInt64Matrix{{9223372036854775807LL}});
+  EXPECT_EQ(static_cast<long double>(i[0][0]), 9223372036854775807.0L);
+  const TQENFloatMatrix d = Matrix2FloatMatrix(TQENDoubleMatrix{{0.1}});
+  EXPECT_EQ(static_cast<long double>(d[0][0]), static_cast<long double>(0.1));
+  EXPECT_NE(static_cast<long double>(d[0][0]), 0.1L);
+}
+
+// --- Arithmetic element types ---------------------------------------------------------------
+
+template <typename T>
+class MatrixArithmetic : public ::testing::Test {};
+TYPED_TEST_SUITE(MatrixArithmetic, testing::ArithmeticMatrixTypes);
+
+TYPED_TEST(MatrixArithmetic, AddAndSubtract) {
+  const auto a = Make<TypeParam>({{1, 2, 3}, {4, 5, 6}});
+  const auto b = Make<TypeParam>({{10, 20, 30}, {40, 50, 60}});
+  EXPECT_EQ(Values(AddMatrices(a, b)), (Rows{{11, 22, 33}, {44, 55, 66}}));
+  EXPECT_EQ(Values(SubtractMatrices(b, a)), (Rows{{9, 18, 27}, {36, 45, 54}}));
+  auto c = a;
+  AddToMatrix(c, b);
+  EXPECT_EQ(Values(c), (Rows{{11, 22, 33}, {44, 55, 66}}));
+  SubtractFromMatrix(c, a);
+  EXPECT_TRUE(SameBits(c, b));
+  EXPECT_EQ(Values(a), (Rows{{1, 2, 3}, {4, 5, 6}}));
+}
+
+TYPED_TEST(MatrixArithmetic, TwoMatrixChecksInOrder) {
+  using M = Matrix<TypeParam>;
+  const auto a = Make<TypeParam>({{1, 2}, {3, 4}});
+  const M none;
+  const auto ragged = Make<TypeParam>({{1, 2}, {3}});
+  const auto emptyFirstRow = Make<TypeParam>({{}, {1, 2}});
+  // An M1 without rows has no row 0 to read: access violation, before anything else.
+  for (bool on : {true, false}) {
+    RectangularCheckSwitch sw(on);
+    EXPECT_THROW(AddMatrices(none, a), EAccessViolation);
+    EXPECT_THROW(SubtractMatrices(none, none), EAccessViolation);
+    M target;
+    EXPECT_THROW(AddToMatrix(target, a), EAccessViolation);
+    EXPECT_THROW(SubtractFromMatrix(target, ragged), EAccessViolation);
+    EXPECT_TRUE(target.empty());
+    // An empty row 0 comes before the shape test.
+    ExpectMathError(rsMatrixIsEmpty, [&] { AddMatrices(emptyFirstRow, a); });
+    ExpectRaisesUntouched(rsMatrixIsEmpty, emptyFirstRow, [&](M& m) { AddToMatrix(m, a); });
+    ExpectRaisesUntouched(rsMatrixIsEmpty, emptyFirstRow,
+                          [&](M& m) { SubtractFromMatrix(m, none); });
+    // Shapes that differ.
+    ExpectMathError(rsSameDimensions, [&] { SubtractMatrices(a, Make<TypeParam>({{1, 2}})); });
+    ExpectRaisesUntouched(rsSameDimensions, a, [&](M& m) { AddToMatrix(m, none); });
+    ExpectRaisesUntouched(rsSameDimensions, a,
+                          [&](M& m) { SubtractFromMatrix(m, Make<TypeParam>({{1, 2, 3}})); });
+  }
+  {
+    RectangularCheckSwitch sw(true);
+    ExpectMathError(rsSameDimensions, [&] { AddMatrices(ragged, ragged); });
+    ExpectRaisesUntouched(rsSameDimensions, a, [&](M& m) { AddToMatrix(m, ragged); });
+    ExpectRaisesUntouched(rsSameDimensions, ragged, [&](M& m) { AddToMatrix(m, a); });
+  }
+  {
+    // Without the switch the shape is row 0's; a short row is never read past its end.
+    RectangularCheckSwitch sw(false);
+    ExpectMathError(rsMatrixRect, [&] { AddMatrices(ragged, a); });
+    ExpectMathError(rsMatrixRect, [&] { SubtractMatrices(a, ragged); });
+    ExpectRaisesUntouched(rsMatrixRect, ragged, [&](M& m) { AddToMatrix(m, a); });
+    ExpectRaisesUntouched(rsMatrixRect, a, [&](M& m) { SubtractFromMatrix(m, ragged); });
+    // Longer rows are fine: only the first Cols elements take part.
+    const auto longer = Make<TypeParam>({{1, 2}, {3, 4, 5}});
+    EXPECT_EQ(Values(AddMatrices(a, longer)), (Rows{{2, 4}, {6, 8}}));
+    EXPECT_EQ(Values(AddMatrices(longer, a)), (Rows{{2, 4}, {6, 8}}));
+    auto c = longer;
+    AddToMatrix(c, a);
+    EXPECT_EQ(Values(c), (Rows{{2, 4}, {6, 8, 5}}));
+  }
+}
+
+TYPED_TEST(MatrixArithmetic, ScalarArithmeticKeepsRaggedShapes) {
+  using M = Matrix<TypeParam>;
+  RectangularCheckSwitch sw(true);
+  const auto ragged = Make<TypeParam>({{1, 2}, {3}, {}});
+  EXPECT_EQ(Values(MultiplyMatrixByConst(ragged, 2)), (Rows{{2, 4}, {6}, {}}));
+  auto m = ragged;
+  MultiplyMatrixByConst2(m, 3);
+  EXPECT_EQ(Values(m), (Rows{{3, 6}, {9}, {}}));
+  m = Make<TypeParam>({{3, 0}, {-1}});
+  LinearTransformMatrix(m, 2, 1);
+  EXPECT_EQ(Values(m), (Rows{{7, 1}, {-1}}));
+  ExpectMathError(rsMatrixIsEmpty, [] { MultiplyMatrixByConst(M{}, 2); });
+  ExpectRaisesUntouched(rsMatrixIsEmpty, M{}, [](M& x) { MultiplyMatrixByConst2(x, 2); });
+  ExpectRaisesUntouched(rsMatrixIsEmpty, M{}, [](M& x) { LinearTransformMatrix(x, 2, 1); });
+  // Rows that are all empty are not an error here.
+  EXPECT_EQ(Values(MultiplyMatrixByConst(Make<TypeParam>({{}, {}}), 2)), (Rows{{}, {}}));
+}
+
+TYPED_TEST(MatrixArithmetic, GrandMean) {
+  using M = Matrix<TypeParam>;
+  LongWord n = 99;
+  EXPECT_EQ(GrandMean(Make<TypeParam>({{1, 2}, {3}}), n), 2.0L);
+  EXPECT_EQ(n, 3u);
+  EXPECT_EQ(GrandMean(Make<TypeParam>({{}, {5}, {}, {6}}), n), 5.5L);
+  EXPECT_EQ(n, 2u);
+  ExpectMathError(rsMatrixIsEmpty, [&] { GrandMean(M{}, n); });
+  ExpectMathError(rsMatrixIsEmpty, [&] { GrandMean(Make<TypeParam>({{}, {}}), n); });
+}
+
+// --- Integer wrap-around ---
+
+TEST(MatrixIntegerArithmetic, LongIntWraps) {
+  const LongInt hi = std::numeric_limits<LongInt>::max();
+  const LongInt lo = std::numeric_limits<LongInt>::min();
+  EXPECT_EQ(MultiplyMatrixByConst(TQENLIntMatrix{{hi}}, 2), (TQENLIntMatrix{{-2}}));
+  EXPECT_EQ(AddMatrices(TQENLIntMatrix{{hi, lo}}, TQENLIntMatrix{{1, -1}}),
+            (TQENLIntMatrix{{lo, hi}}));
+  EXPECT_EQ(SubtractMatrices(TQENLIntMatrix{{lo}}, TQENLIntMatrix{{1}}), (TQENLIntMatrix{{hi}}));
+  TQENLIntMatrix m{{65536}};
+  LinearTransformMatrix(m, 65536, 5);  // 2^32 + 5 wraps to 5
+  EXPECT_EQ(m, (TQENLIntMatrix{{5}}));
+  m = {{lo}};
+  MultiplyMatrixByConst2(m, -1);
+  EXPECT_EQ(m, (TQENLIntMatrix{{lo}}));
+}
+
+TEST(MatrixIntegerArithmetic, Int64Wraps) {
+  const Int64 hi = std::numeric_limits<Int64>::max();
+  const Int64 lo = std::numeric_limits<Int64>::min();
+  EXPECT_EQ(MultiplyMatrixByConst(TQENInt64Matrix{{hi}}, 2), (TQENInt64Matrix{{-2}}));
+  TQENInt64Matrix m{{hi}};
+  AddToMatrix(m, TQENInt64Matrix{{1}});
+  EXPECT_EQ(m, (TQENInt64Matrix{{lo}}));
+  SubtractFromMatrix(m, TQENInt64Matrix{{1}});
+  EXPECT_EQ(m, (TQENInt64Matrix{{hi}}));
+  m = {{Int64{1} << 32}};
+  LinearTransformMatrix(m, Int64{1} << 32, -1);  // 2^64 - 1 wraps to -1
+  EXPECT_EQ(m, (TQENInt64Matrix{{-1}}));
+}
+
+TEST(MatrixIntegerArithmetic, GrandMeanOfLargeInt64DoesNotWrap) {
+  LongWord n = 0;
+  const Int64 big = Int64{1} << 62;
+  EXPECT_EQ(GrandMean(TQENInt64Matrix{{big, big, big}}, n), static_cast<long double>(big));
+  EXPECT_EQ(GrandMean(TQENLIntMatrix{{2147483647, 2147483647}}, n), 2147483647.0L);
+}
+
+// --- Float rounding ---
+
+TEST(MatrixFloatArithmetic, DoubleSumsAreRoundedThroughExtended) {
+  // 1 + (2^-53 + 2^-64): rounded straight to double this is 1 + 2^-52, but the Extended sum is
+  // a tie at 64 bits that rounds to 1 + 2^-53, which is again a tie and rounds to 1.
+  const Double b = std::ldexp(1.0, -53) + std::ldexp(1.0, -64);
+  volatile Double direct = 1.0;
+  direct = direct + b;
+  ASSERT_EQ(direct, 1.0 + std::ldexp(1.0, -52));
+  EXPECT_EQ(AddMatrices(TQENDoubleMatrix{{1.0}}, TQENDoubleMatrix{{b}}), (TQENDoubleMatrix{{1.0}}));
+}
+
+TEST(MatrixFloatArithmetic, ExtendedConstantsAreNotRoundedFirst) {
+  // K = 1 + 2^-60 is not a double; 3 x K rounded to Single is 3.
+  const Extended k = 1.0L + std::ldexp(1.0L, -60);
+  EXPECT_EQ(MultiplyMatrixByConst(TQENFloatMatrix{{PackedExtended(3.0L)}}, k)[0][0],
+            PackedExtended(3.0L * k));
+  EXPECT_EQ(static_cast<Extended>(MultiplyMatrixByConst(TQENFloatMatrix{{3.0L}}, k)[0][0]),
+            3.0L + 3.0L * std::ldexp(1.0L, -60));
+  EXPECT_EQ(MultiplyMatrixByConst(TQENSingleMatrix{{3.0F}}, k), (TQENSingleMatrix{{3.0F}}));
+}
+
+// --- Element-wise functions -----------------------------------------------------------------
+
+template <typename T>
+class MatrixElementWise : public ::testing::Test {};
+TYPED_TEST_SUITE(MatrixElementWise, testing::FloatMatrixTypes);
+
+TYPED_TEST(MatrixElementWise, Values) {
+  auto m = Make<TypeParam>({{3, -2}, {1.5}, {}});
+  SquareMatrix(m);
+  EXPECT_EQ(Values(m), (Rows{{9, 4}, {2.25}, {}}));
+  SqrtMatrix(m);
+  EXPECT_EQ(Values(m), (Rows{{3, 2}, {1.5}, {}}));
+  m = Make<TypeParam>({{0.5, -4}, {0.25}});
+  InvMatrix(m);
+  EXPECT_EQ(Values(m), (Rows{{2, -0.25}, {4}}));
+  m = Make<TypeParam>({{100, 1000}, {1, 0.01}});
+  Log10Matrix(m);
+  EXPECT_NEAR(static_cast<double>(m[0][0]), 2.0, 1e-6);
+  EXPECT_NEAR(static_cast<double>(m[0][1]), 3.0, 1e-6);
+  EXPECT_EQ(static_cast<long double>(m[1][0]), 0.0L);
+  EXPECT_NEAR(static_cast<double>(m[1][1]), -2.0, 1e-6);
+  m = Make<TypeParam>({{1, 2.718281828459045235360287L}});
+  LnMatrix(m);
+  EXPECT_EQ(static_cast<long double>(m[0][0]), 0.0L);
+  EXPECT_NEAR(static_cast<double>(m[0][1]), 1.0, 1e-6);
+  // Zero is a valid square root.
+  m = Make<TypeParam>({{0}});
+  SqrtMatrix(m);
+  EXPECT_EQ(Values(m), (Rows{{0}}));
+}
+
+TYPED_TEST(MatrixElementWise, FailuresStopWhereTheyAreWithoutRollBack) {
+  using M = Matrix<TypeParam>;
+  for (bool on : {true, false}) {
+    RectangularCheckSwitch sw(on);
+    auto m = Make<TypeParam>({{4, -1, 9}});
+    ExpectMathError(rsMatrixNeg, [&] { SqrtMatrix(m); });
+    EXPECT_EQ(Values(m), (Rows{{2, -1, 9}}));
+    // Rows are visited in order, each at its own length.
+    m = Make<TypeParam>({{4}, {2, 0, 8}, {0.5}});
+    ExpectMathError(rsMatrixZero, [&] { InvMatrix(m); });
+    EXPECT_EQ(Values(m), (Rows{{0.25}, {0.5, 0, 8}, {0.5}}));
+    m = Make<TypeParam>({{1, 1}, {0, 1}});
+    ExpectMathError(rsMatrixNotPos, [&] { LnMatrix(m); });
+    EXPECT_EQ(Values(m), (Rows{{0, 0}, {0, 1}}));
+    m = Make<TypeParam>({{10, -5}});
+    ExpectMathError(rsMatrixNotPos, [&] { Log10Matrix(m); });
+    EXPECT_EQ(static_cast<long double>(m[0][1]), -5.0L);
+    // Domain tests are exact: a value far inside the tolerance is not zero.
+    m = Make<TypeParam>({{1e-20L}});
+    LnMatrix(m);
+    EXPECT_LT(static_cast<long double>(m[0][0]), -40.0L);
+    using Fn = void (*)(M&);
+    const Fn functions[] = {&SquareMatrix, &SqrtMatrix, &InvMatrix, &LnMatrix, &Log10Matrix};
+    for (Fn fn : functions) {
+      ExpectRaisesUntouched(rsMatrixIsEmpty, M{}, [fn](M& x) { fn(x); });
+    }
+  }
+}
+
+}  // namespace
+}  // namespace tovrin

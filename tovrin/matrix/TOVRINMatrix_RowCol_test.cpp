@@ -1,0 +1,430 @@
+// Tests of the row and column operations, sorts, extraction, overwriting, copying,
+// transposition, the matrix product and the row and column sums.
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <limits>
+#include <random>
+
+#include "tovrin/matrix/TOVRINMatrix.h"
+#include "tovrin/matrix/TOVRINMatrix_test_support.h"
+
+namespace tovrin {
+namespace {
+
+using testing::ExpectMathError;
+using testing::ExpectRaisesUntouched;
+using testing::Make;
+using testing::Matrix;
+using testing::RectangularCheckSwitch;
+using testing::SameBits;
+using testing::Values;
+using Rows = std::vector<std::vector<long double>>;
+using Row = std::vector<long double>;
+
+// --- Every element type ---------------------------------------------------------------------
+
+template <typename T>
+class RowColAllTypes : public ::testing::Test {};
+TYPED_TEST_SUITE(RowColAllTypes, testing::AllMatrixTypes);
+
+TYPED_TEST(RowColAllTypes, SwapRowsAndCols) {
+  using M = Matrix<TypeParam>;
+  auto m = Make<TypeParam>({{1, 2, 3}, {4, 5, 6}});
+  SwapMatrixRows(m, 0, 1);
+  EXPECT_EQ(Values(m), (Rows{{4, 5, 6}, {1, 2, 3}}));
+  SwapMatrixCols(m, 2, 0);
+  EXPECT_EQ(Values(m), (Rows{{6, 5, 4}, {3, 2, 1}}));
+  // Equal indices return before any check.
+  M none;
+  SwapMatrixRows(m, 7, 7);
+  SwapMatrixCols(m, 7, 7);
+  SwapMatrixRows(none, 3, 3);
+  SwapMatrixCols(none, 3, 3);
+  EXPECT_EQ(Values(m), (Rows{{6, 5, 4}, {3, 2, 1}}));
+  const auto sq = Make<TypeParam>({{1, 2}, {3, 4}});
+  ExpectRaisesUntouched(rsInvalidRow, sq, [](M& x) { SwapMatrixRows(x, 0, 2); });
+  ExpectRaisesUntouched(rsInvalidRow, sq, [](M& x) { SwapMatrixRows(x, 2, 0); });
+  ExpectRaisesUntouched(rsInvalidCol, sq, [](M& x) { SwapMatrixCols(x, 1, 5); });
+}
+
+TYPED_TEST(RowColAllTypes, SwapChecksInOrder) {
+  using M = Matrix<TypeParam>;
+  RectangularCheckSwitch sw(true);
+  // Empty comes first, then rectangular, then the index.
+  ExpectRaisesUntouched(rsMatrixIsEmpty, M{}, [](M& x) { SwapMatrixRows(x, 0, 9); });
+  ExpectRaisesUntouched(rsMatrixIsEmpty, Make<TypeParam>({{}, {}}),
+                        [](M& x) { SwapMatrixCols(x, 0, 9); });
+  const auto ragged = Make<TypeParam>({{1, 2}, {3}});
+  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { SwapMatrixRows(x, 0, 9); });
+  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { SwapMatrixCols(x, 0, 9); });
+}
+
+TYPED_TEST(RowColAllTypes, SwapsWithTheSwitchOffNeverPassARowEnd) {
+  using M = Matrix<TypeParam>;
+  RectangularCheckSwitch sw(false);
+  // Rows 0 and 1 are long enough; row 2 is not touched.
+  auto m = Make<TypeParam>({{1, 2}, {3, 4, 9}, {5}});
+  SwapMatrixRows(m, 0, 1);
+  EXPECT_EQ(Values(m), (Rows{{3, 4}, {1, 2, 9}, {5}}));  // the storage itself stays put
+  ExpectRaisesUntouched(rsMatrixRect, m, [](M& x) { SwapMatrixRows(x, 0, 2); });
+  // A column swap touches every row.
+  ExpectRaisesUntouched(rsMatrixRect, m, [](M& x) { SwapMatrixCols(x, 0, 1); });
+  auto n = Make<TypeParam>({{1, 2, 3}, {4, 5}});
+  SwapMatrixCols(n, 0, 1);
+  EXPECT_EQ(Values(n), (Rows{{2, 1, 3}, {5, 4}}));
+  ExpectRaisesUntouched(rsMatrixRect, n, [](M& x) { SwapMatrixCols(x, 0, 2); });
+}
+
+TYPED_TEST(RowColAllTypes, SortsLeaveOneRowOrOneColumnAlone) {
+  using M = Matrix<TypeParam>;
+  auto m = Make<TypeParam>({{3}, {1}, {2}});
+  QSortMatrixRowsOnCol(m, 5, true);  // no check at all
+  QSortMatrixColsOnRow(m, 5, true);
+  EXPECT_EQ(Values(m), (Rows{{3}, {1}, {2}}));
+  M none;
+  QSortMatrixRowsOnCol(none, 0, true);
+  auto ragged = Make<TypeParam>({{3, 1, 2}, {1}});
+  QSortMatrixRowsOnCol(ragged, 0, true);  // two rows but row 0 ... ragged: checks apply
+  EXPECT_EQ(Values(ragged), (Rows{{3, 1, 2}, {1}}));
+}
+
+TYPED_TEST(RowColAllTypes, SortRowsOnAColumn) {
+  using M = Matrix<TypeParam>;
+  auto m = Make<TypeParam>({{3, 0}, {1, 0}, {2, 0}});
+  QSortMatrixRowsOnCol(m, 0, true);
+  EXPECT_EQ(Values(m), (Rows{{1, 0}, {2, 0}, {3, 0}}));
+  m = Make<TypeParam>({{7, 3}, {8, 1}, {9, 2}, {6, 5}});
+  QSortMatrixRowsOnCol(m, 1, false);
+  EXPECT_EQ(Values(m), (Rows{{6, 5}, {7, 3}, {9, 2}, {8, 1}}));
+  const auto sq = Make<TypeParam>({{2, 1}, {1, 2}});
+  ExpectRaisesUntouched(rsInvalidCol, sq, [](M& x) { QSortMatrixRowsOnCol(x, 2, true); });
+  ExpectRaisesUntouched(rsInvalidRow, sq, [](M& x) { QSortMatrixColsOnRow(x, 2, true); });
+  RectangularCheckSwitch sw(true);
+  const auto ragged = Make<TypeParam>({{2, 1}, {1}, {3, 3}});
+  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { QSortMatrixRowsOnCol(x, 9, true); });
+  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { QSortMatrixColsOnRow(x, 9, true); });
+}
+
+TYPED_TEST(RowColAllTypes, SortsOrderEqualKeysAsTheQuickSortLeavesThem) {
+  // Keys [2, 1, 2, 1] with tags [0, 1, 2, 3]; traced by hand through the explicit-stack
+  // quick sort (middle pivot, both scans stopping on equal keys, smaller part first).
+  auto m = Make<TypeParam>({{2, 0}, {1, 1}, {2, 2}, {1, 3}});
+  auto up = m;
+  QSortMatrixRowsOnCol(up, 0, true);
+  EXPECT_EQ(Values(up), (Rows{{1, 3}, {1, 1}, {2, 0}, {2, 2}}));
+  auto down = m;
+  QSortMatrixRowsOnCol(down, 0, false);
+  EXPECT_EQ(Values(down), (Rows{{2, 2}, {2, 0}, {1, 3}, {1, 1}}));
+  auto t = Make<TypeParam>({{2, 1, 2, 1}, {0, 1, 2, 3}});
+  QSortMatrixColsOnRow(t, 0, true);
+  EXPECT_EQ(Values(t), (Rows{{1, 1, 2, 2}, {3, 1, 0, 2}}));
+  t = Make<TypeParam>({{2, 1, 2, 1}, {0, 1, 2, 3}});
+  QSortMatrixColsOnRow(t, 0, false);
+  EXPECT_EQ(Values(t), (Rows{{2, 2, 1, 1}, {2, 0, 3, 1}}));
+}
+
+TYPED_TEST(RowColAllTypes, SortsWithTheSwitchOff) {
+  using M = Matrix<TypeParam>;
+  RectangularCheckSwitch sw(false);
+  auto longer = Make<TypeParam>({{3, 0}, {1, 1, 9}, {2, 2}});
+  QSortMatrixRowsOnCol(longer, 0, true);  // elements past Cols stay in their row storage
+  EXPECT_EQ(Values(longer), (Rows{{1, 1}, {2, 2, 9}, {3, 0}}));
+  ExpectRaisesUntouched(rsMatrixRect, Make<TypeParam>({{3, 0}, {1}, {2, 2}}),
+                        [](M& x) { QSortMatrixRowsOnCol(x, 0, true); });
+  ExpectRaisesUntouched(rsMatrixRect, Make<TypeParam>({{3, 0, 1}, {1, 2}}),
+                        [](M& x) { QSortMatrixColsOnRow(x, 0, true); });
+}
+
+TYPED_TEST(RowColAllTypes, ExtractRowsAndColumns) {
+  const auto m = Make<TypeParam>({{1, 2, 3}, {4, 5, 6}});
+  EXPECT_EQ(Values(ExtractMatrixRow(m, 1)), (Row{4, 5, 6}));
+  EXPECT_EQ(Values(ExtractMatrixCol(m, 2)), (Row{3, 6}));
+  ExpectMathError(rsInvalidRow, [&] { ExtractMatrixRow(m, 2); });
+  ExpectMathError(rsInvalidCol, [&] { ExtractMatrixCol(m, 3); });
+  // No rows or no columns: an empty result, whatever the index.
+  EXPECT_TRUE(ExtractMatrixRow(Matrix<TypeParam>{}, 5).empty());
+  EXPECT_TRUE(ExtractMatrixCol(Matrix<TypeParam>{}, 5).empty());
+  EXPECT_TRUE(ExtractMatrixCol(Make<TypeParam>({{}, {1}}), 5).empty());
+  const auto ragged = Make<TypeParam>({{1, 2}, {3}, {4, 5, 6}});
+  {
+    RectangularCheckSwitch sw(true);  // a ragged matrix reports no columns
+    EXPECT_TRUE(ExtractMatrixRow(ragged, 0).empty());
+    EXPECT_TRUE(ExtractMatrixCol(ragged, 9).empty());
+  }
+  {
+    RectangularCheckSwitch sw(false);
+    EXPECT_EQ(Values(ExtractMatrixRow(ragged, 2)), (Row{4, 5}));
+    EXPECT_EQ(Values(ExtractMatrixCol(ragged, 0)), (Row{1, 3, 4}));
+    ExpectMathError(rsMatrixRect, [&] { ExtractMatrixRow(ragged, 1); });
+    ExpectMathError(rsMatrixRect, [&] { ExtractMatrixCol(ragged, 1); });
+  }
+}
+
+TYPED_TEST(RowColAllTypes, OverwriteWithPadding) {
+  using M = Matrix<TypeParam>;
+  using V = std::vector<TypeParam>;
+  auto m = Make<TypeParam>({{1, 2, 3}, {4, 5, 6}});
+  OverwriteMatrixRow(m, 0, V{TypeParam(9)}, 0);
+  EXPECT_EQ(Values(m), (Rows{{9, 0, 0}, {4, 5, 6}}));
+  OverwriteMatrixRow(m, 1, V{TypeParam(1), TypeParam(2), TypeParam(3), TypeParam(4)}, 0);
+  EXPECT_EQ(Values(m), (Rows{{9, 0, 0}, {1, 2, 3}}));
+  OverwriteMatrixCol(m, 2, V{}, 7);
+  EXPECT_EQ(Values(m), (Rows{{9, 0, 7}, {1, 2, 7}}));
+  OverwriteMatrixCol(m, 0, V{TypeParam(5), TypeParam(6), TypeParam(8)}, 7);
+  EXPECT_EQ(Values(m), (Rows{{5, 0, 7}, {6, 2, 7}}));
+  ExpectRaisesUntouched(rsInvalidRow, m, [](M& x) { OverwriteMatrixRow(x, 2, V{}, 1); });
+  ExpectRaisesUntouched(rsInvalidCol, m, [](M& x) { OverwriteMatrixCol(x, 3, V{}, 1); });
+  // Nothing happens to a matrix without rows or columns.
+  M none;
+  OverwriteMatrixRow(none, 4, V{TypeParam(1)}, 1);
+  OverwriteMatrixCol(none, 4, V{TypeParam(1)}, 1);
+  EXPECT_TRUE(none.empty());
+  auto blank = Make<TypeParam>({{}, {}});
+  OverwriteMatrixCol(blank, 0, V{TypeParam(1)}, 1);
+  EXPECT_EQ(Values(blank), (Rows{{}, {}}));
+  RectangularCheckSwitch sw(false);
+  const auto ragged = Make<TypeParam>({{1, 2}, {3}});
+  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { OverwriteMatrixRow(x, 1, V{}, 1); });
+  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { OverwriteMatrixCol(x, 1, V{}, 1); });
+  auto r = ragged;
+  OverwriteMatrixCol(r, 0, V{}, 4);
+  EXPECT_EQ(Values(r), (Rows{{4, 2}, {4}}));
+}
+
+TYPED_TEST(RowColAllTypes, CopyIsDeepAndKeepsTheShape) {
+  const auto m = Make<TypeParam>({{1, 2}, {}, {3, 4, 5}});
+  auto c = CopyMatrix(m);
+  EXPECT_TRUE(SameBits(c, m));
+  c[0][0] = TypeParam(9);
+  EXPECT_EQ(Values(m)[0][0], 1.0L);
+  EXPECT_TRUE(CopyMatrix(Matrix<TypeParam>{}).empty());
+}
+
+TYPED_TEST(RowColAllTypes, Transpose) {
+  using M = Matrix<TypeParam>;
+  EXPECT_EQ(Values(TransposeMatrix(Make<TypeParam>({{1, 2, 3}}))), (Rows{{1}, {2}, {3}}));
+  EXPECT_EQ(Values(TransposeMatrix(Make<TypeParam>({{1, 2, 3}, {4, 5, 6}}))),
+            (Rows{{1, 4}, {2, 5}, {3, 6}}));
+  {
+    RectangularCheckSwitch sw(true);
+    ExpectMathError(rsMatrixRect, [] { TransposeMatrix(M{}); });
+    ExpectMathError(rsMatrixRect, [] { TransposeMatrix(Make<TypeParam>({{1, 2}, {3}})); });
+  }
+  {
+    RectangularCheckSwitch sw(false);
+    EXPECT_TRUE(TransposeMatrix(M{}).empty());
+    EXPECT_TRUE(TransposeMatrix(Make<TypeParam>({{}, {1}})).empty());
+    ExpectMathError(rsMatrixRect, [] { TransposeMatrix(Make<TypeParam>({{1, 2}, {3}})); });
+    EXPECT_EQ(Values(TransposeMatrix(Make<TypeParam>({{1, 2}, {3, 4, 5}}))),
+              (Rows{{1, 3}, {2, 4}}));
+  }
+}
+
+// --- Scaling and adding (arithmetic types) --------------------------------------------------
+
+template <typename T>
+class RowColArithmetic : public ::testing::Test {};
+TYPED_TEST_SUITE(RowColArithmetic, testing::ArithmeticMatrixTypes);
+
+TYPED_TEST(RowColArithmetic, ScaleRowsAndColumns) {
+  using M = Matrix<TypeParam>;
+  auto m = Make<TypeParam>({{1, 2}, {3, 4}});
+  ScaleMatrixRow(m, 9, 1);  // K exactly 1 returns before any check
+  ScaleMatrixCol(m, 9, 1);
+  M none;
+  ScaleMatrixRow(none, 0, 1);
+  EXPECT_EQ(Values(m), (Rows{{1, 2}, {3, 4}}));
+  ExpectRaisesUntouched(rsInvalidRow, m, [](M& x) { ScaleMatrixRow(x, 9, 2); });
+  ExpectRaisesUntouched(rsInvalidCol, m, [](M& x) { ScaleMatrixCol(x, 2, 2); });
+  ExpectRaisesUntouched(rsMatrixIsEmpty, none, [](M& x) { ScaleMatrixRow(x, 0, 2); });
+  ScaleMatrixRow(m, 1, -2);
+  EXPECT_EQ(Values(m), (Rows{{1, 2}, {-6, -8}}));
+  ScaleMatrixCol(m, 0, 3);
+  EXPECT_EQ(Values(m), (Rows{{3, 2}, {-18, -8}}));
+}
+
+TYPED_TEST(RowColArithmetic, AddMultiplesOfRowsAndColumns) {
+  using M = Matrix<TypeParam>;
+  auto m = Make<TypeParam>({{1, 2}, {3, 4}});
+  AddMatrixRows(m, 1, 0, -3);
+  EXPECT_EQ(Values(m), (Rows{{1, 2}, {0, -2}}));
+  AddMatrixCols(m, 0, 1, 2);
+  EXPECT_EQ(Values(m), (Rows{{5, 2}, {-4, -2}}));
+  AddMatrixRows(m, 0, 0, 1);  // a row added to itself
+  EXPECT_EQ(Values(m), (Rows{{10, 4}, {-4, -2}}));
+  // No shortcut for K = 0: the indices are still checked.
+  ExpectRaisesUntouched(rsInvalidRow, m, [](M& x) { AddMatrixRows(x, 0, 2, 0); });
+  ExpectRaisesUntouched(rsInvalidCol, m, [](M& x) { AddMatrixCols(x, 2, 0, 0); });
+  ExpectRaisesUntouched(rsMatrixIsEmpty, M{}, [](M& x) { AddMatrixCols(x, 0, 0, 0); });
+  RectangularCheckSwitch sw(true);
+  const auto ragged = Make<TypeParam>({{1, 2}, {3}});
+  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { AddMatrixRows(x, 0, 9, 1); });
+  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { ScaleMatrixCol(x, 9, 2); });
+}
+
+TYPED_TEST(RowColArithmetic, RaggedWithTheSwitchOff) {
+  using M = Matrix<TypeParam>;
+  RectangularCheckSwitch sw(false);
+  const auto ragged = Make<TypeParam>({{1, 2}, {3}, {4, 5}});
+  auto m = ragged;
+  AddMatrixRows(m, 0, 2, 1);
+  ScaleMatrixRow(m, 2, 2);
+  ScaleMatrixCol(m, 0, 10);
+  EXPECT_EQ(Values(m), (Rows{{50, 7}, {30}, {80, 10}}));
+  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { AddMatrixRows(x, 0, 1, 1); });
+  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { ScaleMatrixRow(x, 1, 2); });
+  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { ScaleMatrixCol(x, 1, 2); });
+  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { AddMatrixCols(x, 0, 1, 1); });
+}
+
+TEST(RowColIntegers, ScalingAndAddingWrap) {
+  TQENLIntMatrix m{{2147483647, 1}, {2, 3}};
+  ScaleMatrixRow(m, 0, 2);
+  EXPECT_EQ(m, (TQENLIntMatrix{{-2, 2}, {2, 3}}));
+  AddMatrixCols(m, 1, 0, 1073741824);  // 2 + 2^30 x -2 wraps to 2 - 2^31
+  EXPECT_EQ(m[0][1], -2147483646);
+  TQENInt64Matrix n{{std::numeric_limits<Int64>::max()}, {1}};
+  AddMatrixRows(n, 0, 1, 1);
+  EXPECT_EQ(n[0][0], std::numeric_limits<Int64>::min());
+  ScaleMatrixCol(n, 0, -1);
+  EXPECT_EQ(n[0][0], std::numeric_limits<Int64>::min());
+}
+
+// --- Matrix product -------------------------------------------------------------------------
+
+template <typename T>
+class RowColProduct : public ::testing::Test {};
+TYPED_TEST_SUITE(RowColProduct, testing::FloatMatrixTypes);
+
+TYPED_TEST(RowColProduct, ShapesAndValues) {
+  using M = Matrix<TypeParam>;
+  const auto a = Make<TypeParam>({{1, 2, 3}, {4, 5, 6}});
+  const auto b = Make<TypeParam>({{1}, {0}, {-1}});
+  EXPECT_EQ(Values(MultiplyMatrices(a, b)), (Rows{{-2}, {-2}}));
+  EXPECT_EQ(Values(MultiplyMatrices(Make<TypeParam>({{1, 2}, {3, 4}}),
+                                    Make<TypeParam>({{5, 6, 7}, {8, 9, 10}}))),
+            (Rows{{21, 24, 27}, {47, 54, 61}}));
+  ExpectMathError(rsMatrixMult, [&] { MultiplyMatrices(a, a); });
+  {
+    RectangularCheckSwitch sw(true);
+    ExpectMathError(rsMatrixRect, [&] { MultiplyMatrices(M{}, b); });
+    ExpectMathError(rsMatrixRect, [&] { MultiplyMatrices(a, Make<TypeParam>({{1}, {2, 3}, {4}})); });
+  }
+  {
+    RectangularCheckSwitch sw(false);
+    ExpectMathError(rsMatrixIsEmpty, [&] { MultiplyMatrices(M{}, b); });
+    ExpectMathError(rsMatrixIsEmpty, [&] { MultiplyMatrices(a, M{}); });
+    ExpectMathError(rsMatrixRect, [&] { MultiplyMatrices(Make<TypeParam>({{1, 2}, {3}}), a); });
+    ExpectMathError(rsMatrixRect, [&] { MultiplyMatrices(b, Make<TypeParam>({{1, 2}})); });
+    EXPECT_EQ(Values(MultiplyMatrices(Make<TypeParam>({{2}, {3, 9}}), Make<TypeParam>({{4, 5}}))),
+              (Rows{{8, 10}, {12, 15}}));
+  }
+}
+
+// 1 x 3 times 3 x 1 with terms 1, 2^-60, -1. Rounding every partial sum to Double (or Single)
+// loses 2^-60 at the second step and gives 0; an Extended accumulator keeps it.
+TEST(RowColProductRounding, PerStepRoundingDiffersFromExtendedAccumulation) {
+  const long double tiny = std::ldexp(1.0L, -60);
+  const auto d = MultiplyMatrices(TQENDoubleMatrix{{1.0, std::ldexp(1.0, -60), -1.0}},
+                                  TQENDoubleMatrix{{1.0}, {1.0}, {1.0}});
+  EXPECT_EQ(d, (TQENDoubleMatrix{{0.0}}));
+  const auto f = MultiplyMatrices(TQENSingleMatrix{{1.0F, std::ldexp(1.0F, -60), -1.0F}},
+                                  TQENSingleMatrix{{1.0F}, {1.0F}, {1.0F}});
+  EXPECT_EQ(f, (TQENSingleMatrix{{0.0F}}));
+  const auto g = MultiplyMatrices(TQENFloatMatrix{{1.0L, tiny, -1.0L}},
+                                  TQENFloatMatrix{{1.0L}, {1.0L}, {1.0L}});
+  EXPECT_EQ(static_cast<long double>(g[0][0]), tiny);
+}
+
+// Each product term is rounded to Extended before it is added: 3 x (1 + 2^-62) is exact in
+// Extended only to 64 bits, and the Double result then rounds that sum once more.
+TEST(RowColProductRounding, DoubleProductsAreFormedInExtended) {
+  // (1 + 2^-52) x (1 + 2^-52) = 1 + 2^-51 + 2^-104: Extended keeps 1 + 2^-51, Double gets it.
+  const double x = 1.0 + std::ldexp(1.0, -52);
+  const auto d = MultiplyMatrices(TQENDoubleMatrix{{x}}, TQENDoubleMatrix{{x}});
+  EXPECT_EQ(d[0][0], 1.0 + std::ldexp(1.0, -51));
+  // 2^-60 + 1 - 1 in Single: every partial sum is stored as a Single.
+  const auto f = MultiplyMatrices(TQENSingleMatrix{{std::ldexp(1.0F, -30), 1.0F, -1.0F}},
+                                  TQENSingleMatrix{{std::ldexp(1.0F, -30)}, {1.0F}, {1.0F}});
+  EXPECT_EQ(f[0][0], 0.0F);
+}
+
+// Random matrices against the element-by-element definition, evaluated here in the plain
+// i, j, k order: every bit must agree.
+template <typename T>
+Matrix<T> ProductByDefinition(const Matrix<T>& A, const Matrix<T>& B) {
+  Matrix<T> r(A.size(), std::vector<T>(B[0].size()));
+  for (std::size_t i = 0; i < A.size(); ++i) {
+    for (std::size_t j = 0; j < B[0].size(); ++j) {
+      T acc = T(0);
+      for (std::size_t k = 0; k < B.size(); ++k) {
+        acc = T(static_cast<long double>(acc) +
+                static_cast<long double>(B[k][j]) * static_cast<long double>(A[i][k]));
+      }
+      r[i][j] = acc;
+    }
+  }
+  return r;
+}
+
+TYPED_TEST(RowColProduct, BitForBitTheDefinedOrder) {
+  std::mt19937_64 gen(12345);
+  std::uniform_real_distribution<double> u(-1.0, 1.0);
+  for (auto [n, m, p] : {std::tuple{7, 5, 9}, std::tuple{1, 13, 1}, std::tuple{16, 16, 16}}) {
+    Matrix<TypeParam> a(n, std::vector<TypeParam>(m)), b(m, std::vector<TypeParam>(p));
+    for (auto& row : a) {
+      for (auto& x : row) x = TypeParam(static_cast<long double>(u(gen)) / 3);
+    }
+    for (auto& row : b) {
+      for (auto& x : row) x = TypeParam(static_cast<long double>(u(gen)) * 7);
+    }
+    EXPECT_TRUE(SameBits(MultiplyMatrices(a, b), ProductByDefinition(a, b)));
+  }
+}
+
+// --- Sums -----------------------------------------------------------------------------------
+
+template <typename T>
+class RowColSums : public ::testing::Test {};
+using SumTypes = ::testing::Types<PackedExtended, Double, Single, Int64, LongWord, SmallInt, Word,
+                                  ShortInt, Byte>;
+TYPED_TEST_SUITE(RowColSums, SumTypes);
+
+TYPED_TEST(RowColSums, SumsAndChecks) {
+  const auto m = Make<TypeParam>({{1, 2, 3}, {4, 5, 6}});
+  EXPECT_EQ(static_cast<long double>(SumMatrixRow(m, 1)), 15.0L);
+  EXPECT_EQ(static_cast<long double>(SumMatrixCol(m, 2)), 9.0L);
+  ExpectMathError(rsInvalidRow, [&] { SumMatrixRow(m, 2); });
+  ExpectMathError(rsInvalidCol, [&] { SumMatrixCol(m, 3); });
+  ExpectMathError(rsMatrixIsEmpty, [&] { SumMatrixRow(Matrix<TypeParam>{}, 0); });
+  ExpectMathError(rsMatrixIsEmpty, [&] { SumMatrixCol(Make<TypeParam>({{}, {}}), 0); });
+  const auto ragged = Make<TypeParam>({{1, 2}, {3}});
+  {
+    RectangularCheckSwitch sw(true);
+    ExpectMathError(rsMatrixRect, [&] { SumMatrixRow(ragged, 0); });
+  }
+  RectangularCheckSwitch sw(false);
+  EXPECT_EQ(static_cast<long double>(SumMatrixRow(ragged, 0)), 3.0L);
+  EXPECT_EQ(static_cast<long double>(SumMatrixCol(ragged, 0)), 4.0L);
+  ExpectMathError(rsMatrixRect, [&] { SumMatrixRow(ragged, 1); });
+  ExpectMathError(rsMatrixRect, [&] { SumMatrixCol(ragged, 1); });
+}
+
+TEST(RowColSumsWidths, IntegersAreWidenedTo64Bits) {
+  static_assert(std::is_same_v<decltype(SumMatrixRow(TQENByteMatrix{}, 0)), Int64>);
+  static_assert(std::is_same_v<decltype(SumMatrixRow(TQENSingleMatrix{}, 0)), Extended>);
+  EXPECT_EQ(SumMatrixRow(TQENByteMatrix{{200, 100}}, 0), 300);
+  EXPECT_EQ(SumMatrixCol(TQENSIntMatrix{{-128}, {-128}}, 0), -256);
+  EXPECT_EQ(SumMatrixRow(TQENSmallIntMatrix{{-32768, -1}}, 0), -32769);
+  EXPECT_EQ(SumMatrixRow(TQENWordMatrix{{65535, 65535}}, 0), 131070);
+  EXPECT_EQ(SumMatrixRow(TQENLWordMatrix{{4294967295u, 1}}, 0), 4294967296LL);
+  EXPECT_EQ(SumMatrixCol(TQENInt64Matrix{{std::numeric_limits<Int64>::max()}, {1}}, 0),
+            std::numeric_limits<Int64>::min());
+  // Float sums keep Extended precision.
+  EXPECT_EQ(SumMatrixRow(TQENDoubleMatrix{{1.0, std::ldexp(1.0, -60)}}, 0),
+            1.0L + std::ldexp(1.0L, -60));
+}
+
+}  // namespace
+}  // namespace tovrin

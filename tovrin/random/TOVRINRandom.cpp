@@ -1,0 +1,957 @@
+// The uniform source and the random-variate generators.
+//
+// Each method is one function template over its uniform source: the overloads that take a
+// TRandomGenFunction call through it, the ones without it use ThreadSource, which draws from
+// the calling thread's stream directly (the same numbers VerdanRandom would give, without a
+// call per draw).
+#include "tovrin/random/TOVRINRandom.h"
+
+#include "tovrin/foundation/detail/ElementRules.h"
+
+#include <algorithm>
+#include <array>
+#include <chrono>
+#include <cmath>
+#include <cstddef>
+#include <functional>
+#include <mutex>
+#include <thread>
+
+namespace tovrin {
+
+namespace {
+
+using detail::RaiseMathError;
+
+// The two literal guards of the methods: the literal 5.0E-324 held as an Extended (not the
+// double denormal 4.94E-324) and the largest usable value.
+constexpr Extended kTiny = 5.0E-324L;
+constexpr Extended kHuge = 1.7E+308L;
+
+// ---------------------------------------------------------------------------------------------
+// The uniform source: xoshiro256** (Blackman and Vigna), one stream per thread.
+
+constexpr std::uint64_t RotateLeft(std::uint64_t x, int k) { return (x << k) | (x >> (64 - k)); }
+
+// The SplitMix64 output function: a bijection of 64-bit words with Mix64(0) = 0.
+constexpr std::uint64_t Mix64(std::uint64_t z) {
+  z = (z ^ (z >> 30)) * 0xBF58476D1CE4E5B9ULL;
+  z = (z ^ (z >> 27)) * 0x94D049BB133111EBULL;
+  return z ^ (z >> 31);
+}
+
+struct ThreadStream {
+  std::uint64_t s[4];
+  std::uint64_t epoch;  // the seed generation this stream belongs to; 0: none yet
+};
+
+// Stream k of a seed: the xoshiro state filled by SplitMix64 started at Seed + Mix64(k). Stream
+// 0 is the generator's customary seeding from Seed itself. SplitMix64 never yields four zero
+// words in a row, so the state is never the all-zero one.
+void StartStream(ThreadStream& stream, std::uint64_t seed, std::uint64_t index) {
+  std::uint64_t x = seed + Mix64(index);
+  for (std::uint64_t& word : stream.s) {
+    x += 0x9E3779B97F4A7C15ULL;
+    word = Mix64(x);
+  }
+}
+
+inline std::uint64_t NextBits(ThreadStream& stream) {
+  std::uint64_t* s = stream.s;
+  const std::uint64_t result = RotateLeft(s[1] * 5, 7) * 9;
+  const std::uint64_t t = s[1] << 17;
+  s[2] ^= s[0];
+  s[3] ^= s[1];
+  s[1] ^= s[2];
+  s[0] ^= s[3];
+  s[2] ^= t;
+  s[3] = RotateLeft(s[3], 45);
+  return result;
+}
+
+// bits * 2^-64, exact in the 64-bit mantissa. The word is loaded as a signed integer and moved
+// up by 2^63, which avoids the branch of an unsigned conversion.
+inline Extended UniformFromBits(std::uint64_t bits) {
+  const auto shifted = static_cast<std::int64_t>(bits ^ 0x8000000000000000ULL);
+  return (static_cast<Extended>(shifted) + 0x1p63L) * 0x1p-64L;
+}
+
+// The process seed. Only the slow paths (a thread joining a seed, a new seed) take the lock;
+// a draw reads the atomic generation and nothing else that is shared.
+std::mutex gSeedLock;
+std::uint64_t gSeed = 0;        // guarded by gSeedLock
+std::uint64_t gNextStream = 0;  // guarded by gSeedLock
+std::atomic<std::uint64_t> gEpoch{1};
+
+thread_local ThreadStream tStream{};
+
+[[gnu::noinline]] void JoinCurrentSeed(ThreadStream& stream) {
+  std::lock_guard<std::mutex> lock(gSeedLock);
+  StartStream(stream, gSeed, gNextStream++);
+  stream.epoch = gEpoch.load(std::memory_order_relaxed);
+}
+
+inline ThreadStream& CurrentStream() {
+  ThreadStream& stream = tStream;
+  if (stream.epoch != gEpoch.load(std::memory_order_acquire)) [[unlikely]] {
+    JoinCurrentSeed(stream);
+  }
+  return stream;
+}
+
+// The default source as the generators see it: the calling thread's stream, looked up once
+// per generator call.
+class ThreadSource {
+ public:
+  ThreadSource() : stream_(CurrentStream()) {}
+  Extended operator()() { return UniformFromBits(NextBits(stream_)); }
+
+ private:
+  ThreadStream& stream_;
+};
+
+// ---------------------------------------------------------------------------------------------
+// Conversions to integers. The methods truncate with the platform's Trunc, which faults on NaN
+// and on values past the Int64 range; here that is rsInvalidValue.
+
+Int64 TruncChecked(Extended x) {
+  const Extended t = std::trunc(x);
+  if (!(t >= -0x1p63L && t < 0x1p63L)) RaiseMathError(rsInvalidValue);
+  return static_cast<Int64>(t);
+}
+
+// For a candidate that a range test refuses next: values past either end of Int64 (from the
+// logarithm of a zero uniform) saturate, so the test sees them as out of range.
+Int64 TruncSaturated(Extended x) {
+  const Extended t = std::trunc(x);
+  if (t >= 0x1p63L) return std::numeric_limits<Int64>::max();
+  if (!(t >= -0x1p63L)) return std::numeric_limits<Int64>::min();
+  return static_cast<Int64>(t);
+}
+
+// ---------------------------------------------------------------------------------------------
+// Normal, log-normal, exponential
+
+// Leva's ratio of uniforms. The uniforms and the intermediates x, y, q are held as doubles on
+// purpose (the published method's precision); the rest is Extended.
+template <typename Gen>
+Extended StandardNormal(Gen& gen) {
+  double u;
+  double v;
+  for (;;) {
+    u = static_cast<double>(gen());
+    v = static_cast<double>(gen());
+    v = static_cast<double>((static_cast<Extended>(v) - 0.5L) * 1.7156L);
+    const double x = static_cast<double>(u - 0.449871L);
+    const double y = static_cast<double>(std::fabs(v) + 0.386595L);
+    const double q = static_cast<double>(static_cast<Extended>(x) * x +
+                                         static_cast<Extended>(y) * (0.196L * y - 0.25472L * x));
+    if (q < 0.27597L) break;
+    if (q > 0.27846L) continue;
+    if (static_cast<Extended>(v) * v <
+        -4.0L * static_cast<Extended>(u) * u * std::log(Extended{u})) {
+      break;
+    }
+  }
+  if (u < kTiny) RaiseMathError(rsDivideByZero);
+  return static_cast<Extended>(v) / u;
+}
+
+template <typename Gen>
+Extended NormalVariate(Extended mean, Extended stdDev, Gen& gen) {
+  return StandardNormal(gen) * stdDev + mean;
+}
+
+template <typename Gen>
+Extended LogNormalVariate(Extended mean, Extended stdDev, Gen& gen) {
+  if (!(mean > 0)) RaiseMathError(rsInvalidMean);
+  if (!(stdDev > 0)) RaiseMathError(rsInvalidStdDev);
+  const Extended r = stdDev / mean;
+  const Extended logSpread = std::log(r * r + 1);
+  const Extended mu = std::log(mean) - 0.5L * logSpread;
+  const Extended sigma = std::sqrt(logSpread);
+  return std::exp(NormalVariate(mu, sigma, gen));
+}
+
+template <typename Gen>
+Extended ExponentialVariate(Gen& gen) {
+  Extended u;
+  do {
+    u = gen();
+  } while (!(u > kTiny));
+  return -std::log(u);
+}
+
+// ---------------------------------------------------------------------------------------------
+// Gamma and its relatives
+
+// Marsaglia and Tsang, for Shape > 1.
+template <typename Gen>
+Extended GammaLargeShape(Extended shape, Gen& gen) {
+  const Extended d = shape - 1.0L / 3.0L;
+  const Extended c = 1 / std::sqrt(9 * d);
+  for (;;) {
+    Extended x;
+    Extended t;
+    do {
+      x = StandardNormal(gen);
+      t = XtoY(1 + c * x, 3);
+    } while (!(t > 0));
+    const Extended u = gen();
+    const Extended x2 = x * x;
+    if (u < 1 - 0.0331L * x2 * x2) return d * t;
+    if (std::log(u) < 0.5L * x2 + d * (1 - t + std::log(t))) return d * t;
+  }
+}
+
+// Shape < 1: a power-law body on [0, t] and an exponential tail beyond, t = 1 - Shape.
+template <typename Gen>
+Extended GammaSmallShape(Extended shape, Gen& gen) {
+  if (shape < kTiny) RaiseMathError(rsShapeTooSmall);
+  const Extended t = 1 - shape;
+  const Extended p = t / (t + shape * std::exp(-t));
+  // Below this floor the body's candidate would underflow: such a draw gives 0 at once.
+  const Extended w0 = p * XtoY(kTiny / t, shape);
+  const Extended tLnT = t * std::log(t);
+  for (;;) {
+    const Extended u = gen();
+    if (u >= 1) continue;
+    Extended x;
+    Extended w;
+    if (u > p) {
+      x = t - std::log((1 - u) / (1 - p));
+      w = t * std::log(x) - tLnT;
+    } else if (u <= w0) {
+      return 0;
+    } else {
+      x = t * XtoY(u / p, 1 / shape);
+      w = x;
+    }
+    const Extended u2 = gen();
+    if (w < 1 - u2) return x;
+    if (u2 <= 0) return x;
+    if (u2 * (1 + w) < 1 && w < -std::log(u2)) return x;
+  }
+}
+
+template <typename Gen>
+Extended GammaVariate(Extended shape, Gen& gen) {
+  if (!(shape > 0)) RaiseMathError(rsInvalidShape);
+  if (shape > 1) return GammaLargeShape(shape, gen);
+  if (shape < 1) return GammaSmallShape(shape, gen);
+  return ExponentialVariate(gen);
+}
+
+template <typename Gen>
+Extended ChiSquareVariate(LongInt df, Gen& gen) {
+  return 2 * GammaVariate(df * 0.5L, gen);
+}
+
+template <typename Gen>
+Extended WeibullVariate(Extended shape, Gen& gen) {
+  if (!(std::fabs(shape) > kTiny)) RaiseMathError(rsInvalidValue);
+  return XtoY(ExponentialVariate(gen), 1 / shape);
+}
+
+// ---------------------------------------------------------------------------------------------
+// Beta and Student t
+
+// Cheng's BA with the larger parameter leading: x ~ Beta(max, min), reflected when A < B.
+template <typename Gen>
+Extended BetaVariate(Extended a, Extended b, Gen& gen) {
+  if (!(a > 0) || !(b > 0)) RaiseMathError(rsInvalidValue);
+  const bool reflect = a < b;
+  const Extended p = reflect ? b : a;
+  const Extended q = reflect ? a : b;
+  const Extended alpha = p + q;
+  const Extended rho = p / q;
+  Extended c;
+  Extended h;  // u1 at or above h would overflow w (only for a small min)
+  if (q > 1) {
+    c = std::sqrt((2 * p * q - alpha) / (alpha - 2));
+    h = 1;
+  } else {
+    c = q;
+    h = 1 / (1 + XtoY(p / (kHuge * q), q));
+  }
+  const Extended gamma = p + c;
+  constexpr Extended kLn4 = 1.386294361119890600L;
+  Extended x;
+  for (;;) {
+    const Extended u1 = gen();
+    const Extended u2 = gen();
+    const Extended z = u1 * u1 * u2;
+    if (u1 < kTiny || z <= 0) continue;
+    if (u1 < h) {
+      const Extended v = std::log(u1 / (1 - u1)) / c;
+      const Extended w = rho * std::exp(v);
+      const Extended t = alpha * std::log((1 + rho) / (1 + w)) + gamma * v - kLn4;
+      if (t < z - 1) {
+        if (z - z * t > 1 || t < std::log(z)) continue;
+      }
+      x = w / (1 + w);
+      break;
+    }
+    if (4 * z <= XtoY(1 + 1 / rho, alpha)) {
+      x = 1;
+      break;
+    }
+  }
+  return reflect ? 1 - x : x;
+}
+
+template <typename Gen>
+Extended StudentTVariate(LongInt df, Gen& gen) {
+  if (df < 1) RaiseMathError(rsInvalidValue);
+  const Extended n = df;
+  const Extended e = -0.25L * (n + 1);
+  const Extended s = 4 / XtoY(1 + 1 / n, e);
+  const Extended c = 16 / s;
+  const Extended m = df > 1 ? std::sqrt(2 * n / (n - 1)) * XtoY((n + 1) / (n - 1), e) : 1;
+  for (;;) {
+    const Extended u = gen();
+    if (u <= 0) continue;
+    const Extended v = gen();
+    const Extended x = (2 * v - 1) * m / u;
+    const Extended x2 = x * x;
+    if (x2 <= 5 - s * u) return x;
+    if (c < (x2 + 3) * u) continue;
+    if (u <= XtoY(1 + x2 / n, e)) return x;
+  }
+}
+
+// ---------------------------------------------------------------------------------------------
+// Multivariate normal
+
+template <typename Gen>
+void MultivariateNormal(const TQENFloatVector& Means, const TQENFloatVector& Covariance,
+                        TQENFloatVector& Factor, TQENFloatVector& Variate, LongInt& ErrorCode,
+                        Gen& gen) {
+  const std::size_t n = Means.size();
+  if (n == 0) RaiseMathError(rsVectorEmpty);
+  // Past 2^32 - 1 means no covariance could be long enough (and n (n + 1) / 2 would wrap).
+  if (n > 0xFFFFFFFFu || Covariance.size() < n * (n + 1) / 2) RaiseMathError(rsVectorTooSmall);
+
+  // The outputs may be the caller's input vectors themselves: read those through copies.
+  TQENFloatVector meansCopy;
+  TQENFloatVector covarianceCopy;
+  const TQENFloatVector* means = &Means;
+  const TQENFloatVector* covariance = &Covariance;
+  if (&Factor == &Means) means = &(meansCopy = Means);
+  if (&Factor == &Covariance) covariance = &(covarianceCopy = Covariance);
+
+  // 1-based (i, j), i <= j: the covariance packed by columns, the factor packed by rows.
+  const auto cov = [covariance](std::size_t i, std::size_t j) -> Extended {
+    return (*covariance)[(j - 1) * j / 2 + i - 1];
+  };
+  const auto at = [n](std::size_t i, std::size_t j) { return (i - 1) * (2 * n - i) / 2 + j - 1; };
+
+  ErrorCode = 0;
+  Factor.resize(n * (n + 1) / 2);
+  const Extended c11 = cov(1, 1);
+  if (!(c11 > 0)) {
+    ErrorCode = 1;
+    return;
+  }
+  const Extended u11 = std::sqrt(c11);
+  Factor[0] = u11;
+  for (std::size_t j = 2; j <= n; ++j) Factor[at(1, j)] = cov(1, j) / u11;
+  for (std::size_t i = 2; i <= n; ++i) {
+    Extended squares = 0;
+    for (std::size_t k = 1; k < i; ++k) {
+      const Extended uki = Factor[at(k, i)];
+      squares += uki * uki;
+    }
+    const Extended s = cov(i, i) - squares;
+    if (!(s > 0)) {
+      ErrorCode = 1;
+      return;
+    }
+    const Extended uii = std::sqrt(s);
+    Factor[at(i, i)] = uii;
+    for (std::size_t j = i + 1; j <= n; ++j) {
+      Extended products = 0;
+      for (std::size_t k = 1; k < i; ++k) {
+        products += Extended(Factor[at(k, i)]) * Extended(Factor[at(k, j)]);
+      }
+      Factor[at(i, j)] = (cov(i, j) - products) / uii;
+    }
+  }
+
+  TQENFloatVector factorCopy;
+  const TQENFloatVector* factor = &Factor;
+  if (&Variate == &Factor) factor = &(factorCopy = Factor);
+  Variate = *means;
+  for (std::size_t i = 1; i <= n; ++i) {
+    const Extended z = StandardNormal(gen);
+    for (std::size_t j = i; j <= n; ++j) Variate[j - 1] += Extended((*factor)[at(i, j)]) * z;
+  }
+}
+
+// ---------------------------------------------------------------------------------------------
+// Generalised inverse Gaussian: ratio of uniforms without shift.
+
+template <typename Gen>
+Extended InverseGaussianVariate(Extended lambda, Extended omega, Gen& gen) {
+  if (lambda < 0 || !(omega > 0) || lambda > 0.25L * omega * std::sqrt(kHuge)) {
+    RaiseMathError(rsInvalidValue);
+  }
+  const Extended a =
+      (std::sqrt((lambda + 1) * (lambda + 1) + omega * omega) - (lambda + 1)) / omega;
+  const Extended m =
+      (std::sqrt((lambda - 1) * (lambda - 1) + omega * omega) + (lambda - 1)) / omega;
+  if (!(a > kTiny) || !(m > kTiny)) RaiseMathError(rsInvalidValue);
+  const Extended h = (lambda - 1) / 2;
+  const Extended q = -omega / 4;
+  const Extended c =
+      XtoY(m * a, -lambda / 2) * std::sqrt(m / a) * std::exp(omega / 4 * (m + 1 / m - a - 1 / a));
+  if (!(c > kTiny)) RaiseMathError(rsInvalidValue);
+  const Extended k = -h * std::log(m) - q * (m + 1 / m);
+  for (;;) {
+    const Extended u = gen();
+    if (u <= 0) continue;
+    const Extended v = gen();
+    const Extended x = c * v / u;
+    if (x <= 0) continue;
+    if (std::log(u) < h * std::log(x) + q * (x + 1 / x) + k) return x;
+  }
+}
+
+// ---------------------------------------------------------------------------------------------
+// Binomial
+
+// Inversion from the mode, walking outward one step down, one step up. The probabilities are
+// held as doubles.
+template <typename Gen>
+Int64 BinomialFromMode(LongInt n, Extended prob, Gen& gen) {
+  const Extended trials = n;
+  const Int64 mode = TruncChecked((trials + 1) * prob);
+  const Extended modeX = static_cast<Extended>(mode);
+  const double f = static_cast<double>(
+      std::exp(LnGamma(trials + 1) - LnGamma(modeX + 1) - LnGamma(trials - modeX + 1) +
+               modeX * std::log(prob) + (trials - modeX) * std::log(1 - prob)));
+  const Extended r = prob < 1 ? prob / (1 - prob) : kHuge;
+  Extended u = gen() - f;
+  if (u < 0) return mode;
+  double fLow = f;
+  double fHigh = f;
+  Int64 low = mode;
+  Int64 high = mode;
+  for (;;) {
+    bool stepped = false;
+    if (low > 0) {
+      --low;
+      fLow = static_cast<double>(fLow * Extended(low + 1) / ((trials - Extended(low)) * r));
+      u -= fLow;
+      if (u < 0) return low;
+      stepped = true;
+    }
+    if (high < n) {
+      ++high;
+      fHigh = static_cast<double>(fHigh * (trials - Extended(high) + 1) * r / Extended(high));
+      u -= fHigh;
+      if (u < 0) return high;
+      stepped = true;
+    }
+    // Both ends reached with u still not negative: the walk could only step on for ever.
+    if (!stepped) RaiseMathError(rsInvalidValue);
+  }
+}
+
+// Inversion for N min(P, 1 - P) <= 30; p <= 0.5 here. A draw that would give 0 is redrawn.
+template <typename Gen>
+Int64 BinomialInversion(Int64 n, Extended p, Extended q, Gen& gen) {
+  const Extended trials = static_cast<Extended>(n);
+  const Extended qn = XtoY(q, trials);
+  // The probability of 0 is 1 (or NaN): every draw would be redrawn.
+  if (!(qn < 1)) RaiseMathError(rsInvalidValue);
+  const Extended r = p / q;
+  const Extended g = (trials + 1) * r;
+  bool flag = false;
+  for (;;) {
+    Int64 y = 0;
+    Extended f = qn;
+    Extended u = gen();
+    while (u >= f) {
+      // Past 110 the values no longer change: the search could not end.
+      if (y > 110) RaiseMathError(rsInvalidValue);
+      flag = true;
+      u -= f;
+      ++y;
+      f = f * (g / static_cast<Extended>(y) - r);
+    }
+    if (flag) return y;
+  }
+}
+
+// Stirling's correction term of BTPE's final test.
+inline Extended StirlingTail(Extended a) {
+  const Extended a2 = a * a;
+  return (13860 - (462 - (132 - (99 - 140 / a2) / a2) / a2) / a2) / a / 166320;
+}
+
+// Kachitvichyanukul and Schmeiser's BTPE for N p > 30, p <= 0.5.
+template <typename Gen>
+Int64 BinomialBtpe(Int64 n, Extended p, Extended q, Extended np, Gen& gen) {
+  const Extended trials = static_cast<Extended>(n);
+  const Extended npq = np * q;
+  const Extended fm = np + p;
+  const Int64 mode = TruncChecked(fm);
+  const Extended modeX = static_cast<Extended>(mode);
+  const Extended p1 = std::trunc(2.195L * std::sqrt(npq) - 4.6L * q) + 0.5L;
+  const Extended xm = modeX + 0.5L;
+  const Extended xl = xm - p1;
+  const Extended xr = xm + p1;
+  const Extended c = 0.134L + 20.5L / (15.3L + modeX);
+  Extended a = (fm - xl) / (fm - xl * p);
+  const Extended lambdaL = a * (1 + 0.5L * a);
+  a = (xr - fm) / (xr * q);
+  const Extended lambdaR = a * (1 + 0.5L * a);
+  const Extended p2 = p1 * (1 + 2 * c);
+  const Extended p3 = p2 + c / lambdaL;
+  const Extended p4 = p3 + c / lambdaR;
+  const Extended r = p / q;
+  const Extended g = (trials + 1) * r;
+  for (;;) {
+    const Extended u = gen() * p4;
+    Extended v = gen();
+    Int64 y;
+    if (u <= p1) return TruncSaturated(xm - p1 * v + u);
+    if (u <= p2) {
+      const Extended x = xl + (u - p1) / c;
+      v = v * c + 1 - std::fabs(xm - x) / p1;
+      if (v > 1 || v <= 0) continue;
+      y = TruncSaturated(x);
+    } else if (u <= p3) {
+      y = TruncSaturated(xl + std::log(v) / lambdaL);
+      if (y < 0) continue;
+      v = v * (u - p2) * lambdaL;
+    } else {
+      y = TruncSaturated(xr - std::log(v) / lambdaR);
+      if (y > n) continue;
+      v = v * (u - p3) * lambdaR;
+    }
+    const Extended yX = static_cast<Extended>(y);
+    const Extended k = std::fabs(yX - modeX);
+    if (k <= 20 || k >= npq / 2 - 1) {
+      Extended f = 1;
+      for (Int64 i = mode; i < y;) {
+        ++i;
+        f = f * (g / static_cast<Extended>(i) - r);
+      }
+      for (Int64 i = y; i < mode;) {
+        ++i;
+        f = f / (g / static_cast<Extended>(i) - r);
+      }
+      if (v <= f) return y;
+      continue;
+    }
+    const Extended rho = (k / npq) * ((k * (k / 3 + 0.625L) + 0.1666666666666L) / npq + 0.5L);
+    const Extended t = -k * k / (2 * npq);
+    const Extended logV = std::log(v);
+    if (logV < t - rho) return y;
+    if (logV > t + rho) continue;
+    const Extended x1 = yX + 1;
+    const Extended f1 = modeX + 1;
+    const Extended z = trials + 1 - modeX;
+    const Extended w = trials - yX + 1;
+    if (logV <= xm * std::log(f1 / x1) + (trials - modeX + 0.5L) * std::log(z / w) +
+                    (yX - modeX) * std::log(w * p / (x1 * q)) + StirlingTail(f1) + StirlingTail(z) +
+                    StirlingTail(x1) + StirlingTail(w)) {
+      return y;
+    }
+  }
+}
+
+template <typename Gen>
+Int64 BinomialVariate(Int64 n, Extended prob, Gen& gen) {
+  const Extended p = MinXY(prob, 1 - prob);
+  const Extended q = 1 - p;
+  const Extended np = static_cast<Extended>(n) * p;
+  const Int64 y = np <= 30 ? BinomialInversion(n, p, q, gen) : BinomialBtpe(n, p, q, np, gen);
+  return prob > 0.5L ? detail::WrappingSub64(n, y) : y;
+}
+
+template <typename Gen>
+Int64 NegativeBinomialVariate(Extended r, Extended prob, Gen& gen) {
+  if (!(r > 0) || !(prob > 0) || !(prob < 1)) RaiseMathError(rsInvalidValue);
+  const Extended q = 1 - prob;
+  Extended count = 0;  // whole numbers, kept as Extended so that no sum can overflow
+  Extended rho = r;
+  if (prob > 0.7L) {
+    // One geometric variate per whole unit of R.
+    const Int64 whole = TruncChecked(r);
+    const Extended logP = std::log(prob);
+    for (Int64 i = 0; i < whole; ++i) {
+      Extended u;
+      do {
+        u = gen();
+      } while (!(u > 0));
+      count += std::trunc(std::log(u) / logP);
+    }
+    rho = r - static_cast<Extended>(whole);
+  }
+  if (rho > std::log(kTiny) / std::log(q)) RaiseMathError(rsInvalidValue);
+  Extended f = XtoY(q, rho);
+  Extended x = 0;
+  Extended a = rho;
+  Extended u = gen();
+  while (u >= f) {
+    // Once the probabilities have underflowed to zero, u can no longer fall below them.
+    if (f == 0) RaiseMathError(rsInvalidValue);
+    u -= f;
+    x += 1;
+    f = f * prob * a / x;
+    a += 1;
+  }
+  return TruncChecked(count + x + 0.5L);
+}
+
+// ---------------------------------------------------------------------------------------------
+// von Mises: intervals of [0, pi] on which K cos theta falls by one, chosen by their exact
+// probability, then Forsythe's comparison method inside the chosen interval.
+
+constexpr std::array<Extended, 3> kLegendreNodes = {0.238619186083197L, 0.661209386466265L,
+                                                    0.932469514203152L};
+constexpr std::array<Extended, 3> kLegendreWeights = {0.467913934572691L, 0.360761573048139L,
+                                                      0.171324492379170L};
+
+Extended VonMisesMass(Extended from, Extended to, Extended k) {
+  const Extended middle = (from + to) / 2;
+  const Extended half = (to - from) / 2;
+  Extended sum = 0;
+  for (std::size_t i = 0; i < kLegendreNodes.size(); ++i) {
+    const Extended offset = half * kLegendreNodes[i];
+    sum += kLegendreWeights[i] *
+           (std::exp(k * std::cos(middle - offset)) + std::exp(k * std::cos(middle + offset)));
+  }
+  return half * sum;
+}
+
+template <typename Gen>
+Extended VonMisesVariate(Extended k, Gen& gen) {
+  if (!(k >= 0) || !(2 * k + 1 < 21)) RaiseMathError(rsInvalidValue);
+  int n = static_cast<int>(2 * k + 1);  // 1..20
+  std::array<Extended, 21> theta{};     // bounds theta[0..n]
+  std::array<Extended, 21> prob{};      // prob[1..n]
+  if (k > 0.5L) {
+    for (int i = 1; i < n; ++i) theta[i] = QENArcCos(1 - i / k);
+    theta[n] = QENPi;
+    Extended total = 0;
+    for (int i = 1; i <= n; ++i) {
+      prob[i] = VonMisesMass(theta[i - 1], theta[i], k);
+      total += prob[i];
+    }
+    for (int i = 1; i <= n; ++i) prob[i] /= total;
+  } else {
+    n = 1;
+    theta[1] = QENPi;
+    prob[1] = 1;
+  }
+
+  Extended u = gen();
+  int j = n;
+  Extended width = 0;  // stays 0 when rounding lets u survive every interval
+  for (int i = 1; i <= n; ++i) {
+    u -= prob[i];
+    if (u < 0) {
+      j = i;
+      width = theta[i] - theta[i - 1];
+      break;
+    }
+  }
+  Extended s = -u / prob[j];
+  for (;;) {
+    const Extended angle = theta[j - 1] + width * s;
+    const Extended h = (k - j + 1) - k * std::cos(angle);
+    bool odd = true;
+    Extended previous = h;
+    do {
+      u = gen();
+      if (u <= previous) {
+        odd = !odd;
+        previous = u;
+      }
+    } while (!(u > previous));
+    if (odd) {
+      const Extended sign = (u - previous) / (1 - previous) - 0.5L;
+      return sign < 0 ? -std::fabs(angle) : std::fabs(angle);
+    }
+    s = gen();
+  }
+}
+
+template <typename Gen>
+Extended CauchyVariate(Gen& gen) {
+  Extended x;
+  Extended y;
+  do {
+    x = 2 * (gen() - 0.5L);
+    y = 2 * (gen() - 0.5L);
+  } while (!(std::fabs(y) > kTiny && x * x + y * y < 1));
+  return x / y;
+}
+
+// ---------------------------------------------------------------------------------------------
+// Poisson: Ahrens and Dieter's algorithm PD.
+
+// Case B, Mu <= 10: inversion with a cumulative table built during the call.
+template <typename Gen>
+Int64 PoissonByTable(Extended mu, Gen& gen) {
+  constexpr int kTableSize = 35;
+  const int m = mu < 1 ? 1 : static_cast<int>(mu);  // MaxXY(1, Trunc(Mu)), Mu <= 10
+  const Extended p0 = std::exp(-mu);
+  std::array<Extended, kTableSize + 1> cumulative{};  // cumulative[1..35]
+  bool full = false;
+  for (;;) {
+    const Extended u = gen();
+    if (u <= p0) return 0;
+    if (full) {
+      const int start = u > 0.458L ? std::min(kTableSize, m) : 1;
+      for (int k = start; k <= kTableSize; ++k) {
+        if (u <= cumulative[k]) return k;
+      }
+      continue;
+    }
+    Extended p = p0;
+    Extended q = p0;
+    for (int k = 1; k <= kTableSize; ++k) {
+      p = p * mu / k;
+      q += p;
+      cumulative[k] = q;
+      if (u <= q) return k;
+    }
+    full = true;
+  }
+}
+
+constexpr std::array<Extended, 10> kFactorials = {1, 1, 2, 6, 24, 120, 720, 5040, 40320, 362880};
+
+// Case A, Mu > 10: a normal candidate with squeeze, quotient and hat tests.
+template <typename Gen>
+Int64 PoissonByNormal(Extended mu, Gen& gen) {
+  const Extended s = std::sqrt(mu);
+  const Extended d = 6 * mu * mu;
+  const Int64 bigL = TruncChecked(mu - 1.1484L);
+
+  // Step N. K and u stay 0 when g is exactly 0 (step N is skipped, step Q is not).
+  Int64 k = 0;
+  Extended u = 0;
+  const Extended g = mu + s * StandardNormal(gen);
+  if (g > 0) {
+    k = TruncChecked(g);
+    if (k >= bigL) return k;
+    u = gen();
+    const Extended difference = mu - static_cast<Extended>(k);
+    if (d * u >= difference * difference * difference) return k;
+  }
+
+  // Step P.
+  const Extended omega = 0.3989423L / s;
+  const Extended b1 = 0.04166667L / mu;
+  const Extended b2 = 0.3L * b1 * b1;
+  const Extended c3 = 0.1428571L * b1 * b2;
+  const Extended c2 = b2 - 15 * c3;
+  const Extended c1 = b1 - 6 * b2 + 45 * c3;
+  const Extended c0 = 1 - b1 + 3 * b2 - 15 * c3;
+  const Extended c = 0.1069L / mu;
+
+  // Procedure F.
+  Extended px = 0;
+  Extended py = 0;
+  Extended fx = 0;
+  Extended fy = 0;
+  const auto procedureF = [&](Int64 candidate) {
+    const Extended kx = static_cast<Extended>(candidate);
+    if (candidate >= 0 && candidate < 10) {
+      px = -mu;
+      py = XtoY(mu, kx) / kFactorials[static_cast<std::size_t>(candidate)];
+    } else {
+      Extended delta = 0.08333333L / kx;
+      delta = delta - 4.8L * delta * delta * delta;
+      const Extended v = (mu - kx) / kx;
+      if (std::fabs(v) <= 0.25L) {
+        constexpr Extended a0 = -0.5L, a1 = 0.3333333L, a2 = -0.2500068L, a3 = 0.2000118L;
+        constexpr Extended a4 = -0.1661269L, a5 = 0.1421878L, a6 = -0.1384794L, a7 = 0.1250060L;
+        px = kx * v * v *
+                 (((((((a7 * v + a6) * v + a5) * v + a4) * v + a3) * v + a2) * v + a1) * v + a0) -
+             delta;
+      } else {
+        px = kx * std::log(1 + v) - (mu - kx) - delta;
+      }
+      py = 0.3989423L / std::sqrt(kx);
+    }
+    const Extended x = (0.5L - (mu - kx)) / s;
+    const Extended x2 = x * x;
+    fx = -0.5L * x2;
+    fy = omega * (((c3 * x2 + c2) * x2 + c1) * x2 + c0);
+  };
+
+  // Step Q.
+  if (g >= 0) {
+    procedureF(k);
+    if (fy - u * fy <= py * std::exp(px - fx)) return k;
+  }
+  // Steps E and H.
+  for (;;) {
+    const Extended e = ExponentialVariate(gen);
+    u = 2 * gen() - 1;
+    const Extended t = u >= 0 ? 1.8L + e : 1.8L - e;
+    if (t <= -0.6744L) continue;
+    k = TruncChecked(mu + s * t);
+    procedureF(k);
+    if (c * std::fabs(u) <= py * std::exp(px + e) - fy * std::exp(fx + e)) return k;
+  }
+}
+
+template <typename Gen>
+Int64 PoissonVariate(Extended mu, Gen& gen) {
+  if (mu <= 10) return PoissonByTable(mu, gen);
+  return PoissonByNormal(mu, gen);
+}
+
+}  // namespace
+
+// ---------------------------------------------------------------------------------------------
+// The uniform source
+
+Extended VerdanRandom() { return UniformFromBits(NextBits(CurrentStream())); }
+
+void SetRandSeed(std::uint64_t Seed) {
+  std::lock_guard<std::mutex> lock(gSeedLock);
+  gSeed = Seed;
+  gNextStream = 1;
+  const std::uint64_t epoch = gEpoch.load(std::memory_order_relaxed) + 1;
+  gEpoch.store(epoch, std::memory_order_release);
+  StartStream(tStream, Seed, 0);
+  tStream.epoch = epoch;
+}
+
+void Randomize() {
+  const auto wall =
+      static_cast<std::uint64_t>(std::chrono::system_clock::now().time_since_epoch().count());
+  const auto steady =
+      static_cast<std::uint64_t>(std::chrono::steady_clock::now().time_since_epoch().count());
+  const auto thread =
+      static_cast<std::uint64_t>(std::hash<std::thread::id>{}(std::this_thread::get_id()));
+  SetRandSeed(Mix64(wall) ^ Mix64(steady + 0x9E3779B97F4A7C15ULL) ^ Mix64(~thread));
+}
+
+// ---------------------------------------------------------------------------------------------
+// The generators: each overload is a forward to its method.
+
+Extended Random_Normal(TRandomGenFunction Gen) { return StandardNormal(Gen); }
+Extended Random_Normal() {
+  ThreadSource gen;
+  return StandardNormal(gen);
+}
+Extended Random_Normal(Extended Mean, Extended StdDev, TRandomGenFunction Gen) {
+  return NormalVariate(Mean, StdDev, Gen);
+}
+Extended Random_Normal(Extended Mean, Extended StdDev) {
+  ThreadSource gen;
+  return NormalVariate(Mean, StdDev, gen);
+}
+Extended Random_LogNormal(Extended Mean, Extended StdDev, TRandomGenFunction Gen) {
+  return LogNormalVariate(Mean, StdDev, Gen);
+}
+Extended Random_LogNormal(Extended Mean, Extended StdDev) {
+  ThreadSource gen;
+  return LogNormalVariate(Mean, StdDev, gen);
+}
+
+Extended Random_Gamma(Extended Shape, TRandomGenFunction Gen) { return GammaVariate(Shape, Gen); }
+Extended Random_Gamma(Extended Shape) {
+  ThreadSource gen;
+  return GammaVariate(Shape, gen);
+}
+Extended Random_ChiSq(LongInt DF, TRandomGenFunction Gen) { return ChiSquareVariate(DF, Gen); }
+Extended Random_ChiSq(LongInt DF) {
+  ThreadSource gen;
+  return ChiSquareVariate(DF, gen);
+}
+Extended Random_Exponential(TRandomGenFunction Gen) { return ExponentialVariate(Gen); }
+Extended Random_Exponential() {
+  ThreadSource gen;
+  return ExponentialVariate(gen);
+}
+Extended Random_Weibull(Extended Shape, TRandomGenFunction Gen) {
+  return WeibullVariate(Shape, Gen);
+}
+Extended Random_Weibull(Extended Shape) {
+  ThreadSource gen;
+  return WeibullVariate(Shape, gen);
+}
+
+Extended Random_Beta(Extended A, Extended B, TRandomGenFunction Gen) {
+  return BetaVariate(A, B, Gen);
+}
+Extended Random_Beta(Extended A, Extended B) {
+  ThreadSource gen;
+  return BetaVariate(A, B, gen);
+}
+Extended Random_T(LongInt DF, TRandomGenFunction Gen) { return StudentTVariate(DF, Gen); }
+Extended Random_T(LongInt DF) {
+  ThreadSource gen;
+  return StudentTVariate(DF, gen);
+}
+
+void Random_MVNorm(const TQENFloatVector& Means, const TQENFloatVector& Covariance,
+                   TQENFloatVector& Factor, TQENFloatVector& Variate, LongInt& ErrorCode,
+                   TRandomGenFunction Gen) {
+  MultivariateNormal(Means, Covariance, Factor, Variate, ErrorCode, Gen);
+}
+void Random_MVNorm(const TQENFloatVector& Means, const TQENFloatVector& Covariance,
+                   TQENFloatVector& Factor, TQENFloatVector& Variate, LongInt& ErrorCode) {
+  ThreadSource gen;
+  MultivariateNormal(Means, Covariance, Factor, Variate, ErrorCode, gen);
+}
+
+Extended Random_Inv_Gauss(Extended Lambda, Extended Omega, TRandomGenFunction Gen) {
+  return InverseGaussianVariate(Lambda, Omega, Gen);
+}
+Extended Random_Inv_Gauss(Extended Lambda, Extended Omega) {
+  ThreadSource gen;
+  return InverseGaussianVariate(Lambda, Omega, gen);
+}
+
+Int64 Random_Binomial1(LongInt N, Extended P, TRandomGenFunction Gen) {
+  return BinomialFromMode(N, P, Gen);
+}
+Int64 Random_Binomial1(LongInt N, Extended P) {
+  ThreadSource gen;
+  return BinomialFromMode(N, P, gen);
+}
+Int64 Random_Binomial2(Int64 N, Extended P, TRandomGenFunction Gen) {
+  return BinomialVariate(N, P, Gen);
+}
+Int64 Random_Binomial2(Int64 N, Extended P) {
+  ThreadSource gen;
+  return BinomialVariate(N, P, gen);
+}
+Int64 Random_Neg_Binomial(Extended R, Extended P, TRandomGenFunction Gen) {
+  return NegativeBinomialVariate(R, P, Gen);
+}
+Int64 Random_Neg_Binomial(Extended R, Extended P) {
+  ThreadSource gen;
+  return NegativeBinomialVariate(R, P, gen);
+}
+
+Extended Random_von_Mises(Extended K, TRandomGenFunction Gen) { return VonMisesVariate(K, Gen); }
+Extended Random_von_Mises(Extended K) {
+  ThreadSource gen;
+  return VonMisesVariate(K, gen);
+}
+Extended Random_Cauchy(TRandomGenFunction Gen) { return CauchyVariate(Gen); }
+Extended Random_Cauchy() {
+  ThreadSource gen;
+  return CauchyVariate(gen);
+}
+
+Int64 Random_Poisson(Extended& Mu, TRandomGenFunction Gen) { return PoissonVariate(Mu, Gen); }
+Int64 Random_Poisson(Extended& Mu) {
+  ThreadSource gen;
+  return PoissonVariate(Mu, gen);
+}
+
+}  // namespace tovrin

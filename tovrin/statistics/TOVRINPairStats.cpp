@@ -1,0 +1,99 @@
+// Paired data: correlation and regression.
+#include "tovrin/statistics/TOVRINPairStats.h"
+
+#include <cmath>
+#include <cstddef>
+
+#include "tovrin/vector/TOVRINVector.h"
+
+namespace tovrin {
+namespace {
+
+using detail::RaiseMathError;
+
+void CheckSameLength(const TQENFloatVector& X, const TQENFloatVector& Y) {
+  if (X.size() != Y.size()) RaiseMathError(rsSameDimensions);
+}
+
+}  // namespace
+
+Extended CoeffCorrelation(const TQENFloatVector& X, const TQENFloatVector& Y) {
+  if (X.size() != Y.size() || X.size() < 2) return 0;
+  const auto n = static_cast<Extended>(X.size());
+  const Extended sx = SumVector(X);
+  const Extended sy = SumVector(Y);
+  const Extended ssx = SumSqVector(X) - sx * sx / n;
+  const Extended ssy = SumSqVector(Y) - sy * sy / n;
+  const Extended spxy = DotProdVectors(X, Y) - sx * sy / n;
+  const Extended sdx = std::sqrt(ssx / (n - 1));
+  const Extended sdy = std::sqrt(ssy / (n - 1));
+  return (spxy / (n - 1)) / (sdx * sdy);
+}
+
+Extended CoeffDetermination(const TQENFloatVector& X, const TQENFloatVector& Y) {
+  const Extended r = CoeffCorrelation(X, Y);
+  return r * r;
+}
+
+void GetRegressionLine(const TQENFloatVector& X, const TQENFloatVector& Y, Extended& Intercept,
+                       Extended& Slope) {
+  CheckSameLength(X, Y);
+  const Extended sx = SumVector(X);
+  const Extended sy = SumVector(Y);
+  const auto n = static_cast<Extended>(X.size());
+  const Extended ssx = SumSqVector(X) - sx * sx / n;
+  const Extended spxy = DotProdVectors(X, Y) - sx * sy / n;
+  const Extended slope = spxy / ssx;
+  Slope = slope;
+  Intercept = (sy - slope * sx) / n;
+}
+
+void GetQuadraticCurve(const TQENFloatVector& X, const TQENFloatVector& Y, Extended& A, Extended& B,
+                       Extended& C) {
+  CheckSameLength(X, Y);
+  Extended s1 = 0, s2 = 0, s3 = 0, s4 = 0, t0 = 0, t1 = 0, t2 = 0;
+  for (std::size_t i = 0; i < X.size(); ++i) {
+    const Extended x = X[i];
+    const Extended y = Y[i];
+    const Extended q = x * x;
+    s1 += x;
+    s2 += q;
+    s3 += q * x;
+    s4 += q * q;
+    t0 += y;
+    t1 += y * x;
+    t2 += y * q;
+  }
+  const auto n = static_cast<Extended>(X.size());
+  const Extended s1_sq = s1 * s1;
+  const Extended s2_sq = s2 * s2;
+  const Extended s3_sq = s3 * s3;
+  // Determinant of the system with rows (n, S1, S2), (S1, S2, S3), (S2, S3, S4). The terms of
+  // it and of the three numerators stand in a fixed arrangement (additions before
+  // subtractions); the rounding of the coefficients depends on it.
+  const Extended d = 2 * s1 * s2 * s3 + s4 * s2 * n - s2 * s2_sq - s4 * s1_sq - s3_sq * n;
+  if (FloatIsZero(d)) RaiseMathError(rsDivideByZero);
+  const Extended a =
+      (t2 * s3 * s1 + t1 * s3 * s2 + t0 * s4 * s2 - t2 * s2_sq - t1 * s4 * s1 - t0 * s3_sq) / d;
+  const Extended b =
+      (t0 * s3 * s2 + t2 * s2 * s1 + t1 * s4 * n - t1 * s2_sq - t0 * s4 * s1 - t2 * s3 * n) / d;
+  const Extended c =
+      (t1 * s2 * s1 + t0 * s3 * s1 + t2 * s2 * n - t0 * s2_sq - t2 * s1_sq - t1 * s3 * n) / d;
+  A = a;
+  B = b;
+  C = c;
+}
+
+Extended GetSSE(const TQENFloatVector& X, const TQENFloatVector& Y, Extended Intercept,
+                Extended Slope) {
+  CheckSameLength(X, Y);
+  Extended sum = 0;
+  for (std::size_t i = 0; i < X.size(); ++i) {
+    const Extended p = Slope * Extended(X[i]) + Intercept;
+    const Extended e = p - Extended(Y[i]);
+    sum += e * e;
+  }
+  return sum;
+}
+
+}  // namespace tovrin
