@@ -6,7 +6,7 @@
 namespace tovrin {
 namespace {
 
-constexpr Extended kTwo63 = 9223372036854775808.0L;  // 2^63
+constexpr Extended kTwo63 = 9223372036854775808.0L;   // 2^63
 constexpr Extended kTwo64 = 18446744073709551616.0L;  // 2^64
 
 // The integer nearest to the exact product X * Scale (exact halves to even), for a finite X
@@ -67,7 +67,7 @@ Int64 DivRoundHalfEven(Int64 Q, Int64 D) {
 Int64 RoundWrapping(Extended X) {
   if (!std::isfinite(X)) return INT64_MIN;
   Extended r = std::fmod(RoundHalfEven(X), kTwo64);  // exact, in (-2^64, 2^64)
-  if (r < 0) r += kTwo64;                             // exact: an integer below 2^64
+  if (r < 0) r += kTwo64;                            // exact: an integer below 2^64
   return static_cast<Int64>(static_cast<std::uint64_t>(r));
 }
 

@@ -37,9 +37,9 @@ TQENLongCurrency Float2QENLongCurrency(Extended X);
 TQENLongCurrency QENCurrency2QENLongCurrency(TQENCurrency X);
 Currency QENCurrency2Currency(TQENCurrency X);
 TQENCurrency QENLongCurrency2QENCurrency(TQENLongCurrency X);  // round(stored / 10000)
-Currency QENLongCurrency2Currency(TQENLongCurrency X);          // round(stored / 100)
-TQENCurrency Currency2QENCurrency(Currency X);                  // round(stored / 100)
-TQENLongCurrency Currency2QENLongCurrency(Currency X);          // stored * 100
+Currency QENLongCurrency2Currency(TQENLongCurrency X);         // round(stored / 100)
+TQENCurrency Currency2QENCurrency(Currency X);                 // round(stored / 100)
+TQENLongCurrency Currency2QENLongCurrency(Currency X);         // stored * 100
 
 // Two Currency values are the same when their stored integers are equal (money is exact).
 bool SameCurrency(Currency X, Currency Y);
@@ -70,11 +70,11 @@ constexpr Int64 StoredOf(T X) {
 // rounding mode. X must be finite.
 inline Extended RoundHalfEven(Extended X) {
   const Extended a = std::fabs(X);
-  const Extended down = std::floor(a);
-  const Extended frac = a - down;  // exact (Sterbenz, or down = 0)
-  Extended r = down;
-  if (frac > 0.5L || (frac == 0.5L && std::fmod(down, 2.0L) != 0)) r = down + 1;
-  return X < 0 ? -r : r;
+  if (!(a < 9223372036854775808.0L)) return X;             // 2^63 and beyond hold no fraction
+  const auto whole = static_cast<std::uint64_t>(a);        // truncation is floor here
+  const Extended frac = a - static_cast<Extended>(whole);  // exact (Sterbenz, or whole = 0)
+  const std::uint64_t r = (frac > 0.5L || (frac == 0.5L && (whole & 1) != 0)) ? whole + 1 : whole;
+  return X < 0 ? -static_cast<Extended>(r) : static_cast<Extended>(r);
 }
 
 // The rounding of the money arithmetic whose overflow is not reported (products by a
@@ -101,8 +101,8 @@ Currency Float2Money<Currency>(Extended X);
 
 // Low 32 bits of X as a TQENCurrency (the wrapping store).
 constexpr TQENCurrency WrapToCurr(Int64 X) {
-  return static_cast<TQENCurrency>(static_cast<LongInt>(static_cast<std::uint32_t>(
-      static_cast<std::uint64_t>(X))));
+  return static_cast<TQENCurrency>(
+      static_cast<LongInt>(static_cast<std::uint32_t>(static_cast<std::uint64_t>(X))));
 }
 
 }  // namespace detail

@@ -92,14 +92,66 @@ TEST(Float2QENCurrency, RoundTripThroughTheAmount) {
   }
 }
 
+// The exact product X * Scale rounded half to even, in 128-bit integer arithmetic: X is
+// taken apart into its 64-bit significand and exponent, so nothing is rounded on the way.
+Int64 ExactScaledReference(Extended X, Int64 Scale) {
+  if (X == 0) return 0;
+  int e = 0;
+  const Extended f = std::frexp(std::fabs(X), &e);  // |X| = f 2^e, f in [0.5, 1)
+  const auto m = static_cast<unsigned __int128>(static_cast<std::uint64_t>(std::ldexp(f, 64)));
+  const unsigned __int128 p = m * static_cast<unsigned __int128>(Scale);  // |X| Scale = p 2^(e-64)
+  unsigned __int128 q = 0;
+  const int k = 64 - e;  // right shift
+  if (k <= 0) {
+    q = p << -k;
+  } else if (k < 127) {
+    q = p >> k;
+    const unsigned __int128 rem = p & ((static_cast<unsigned __int128>(1) << k) - 1);
+    const unsigned __int128 half = static_cast<unsigned __int128>(1) << (k - 1);
+    if (rem > half || (rem == half && (q & 1) != 0)) ++q;
+  }
+  const auto r = static_cast<Int64>(q);
+  return X < 0 ? -r : r;
+}
+
+TEST(Float2QENCurrency, AgreesWithExactIntegerArithmetic) {
+  std::mt19937_64 gen(7);
+  std::uniform_real_distribution<double> unit(-1, 1);
+  for (int i = 0; i < 50000; ++i) {
+    // Random significands at many magnitudes, and values next to halves of a stored unit.
+    const int exponent = static_cast<int>(gen() % 40) - 20;
+    Extended x = std::ldexp(
+        static_cast<Extended>(unit(gen)) + static_cast<Extended>(unit(gen)) * 1e-17L, exponent);
+    if (i % 3 == 0) {
+      const Extended half =
+          (static_cast<Extended>(static_cast<int>(gen() % 2000000) - 1000000) + 0.5L) / 100;
+      x = (i % 2 == 0) ? std::nextafter(half, 1e30L) : half;
+    }
+    EXPECT_EQ(Stored(Float2QENCurrency(x)), ExactScaledReference(x, 100)) << double(x);
+    EXPECT_EQ(Stored(Float2QENLongCurrency(x)), ExactScaledReference(x, 1000000)) << double(x);
+    EXPECT_EQ(Stored(detail::Float2Money<Currency>(x)), ExactScaledReference(x, 10000))
+        << double(x);
+  }
+}
+
+TEST(RoundHalfEven, NearestIntegerWithHalvesToEven) {
+  EXPECT_EQ(detail::RoundHalfEven(0.5L), 0);
+  EXPECT_EQ(detail::RoundHalfEven(1.5L), 2);
+  EXPECT_EQ(detail::RoundHalfEven(-1.5L), -2);
+  EXPECT_EQ(detail::RoundHalfEven(-0.5000000001L), -1);
+  EXPECT_EQ(detail::RoundHalfEven(0.49999999999999999995L), 0);
+  EXPECT_EQ(detail::RoundHalfEven(4611686018427387904.5L), 4611686018427387904.0L);  // 2^62 + .5
+  EXPECT_EQ(detail::RoundHalfEven(4611686018427387905.5L), 4611686018427387906.0L);
+  EXPECT_EQ(detail::RoundHalfEven(-1e30L), -1e30L);
+}
+
 TEST(MoneyConversions, WideningIsExact) {
   EXPECT_EQ(Stored(QENCurrency2QENLongCurrency(TQENCurrency{-12345})), -123450000);
   EXPECT_EQ(Stored(QENCurrency2QENLongCurrency(TQENCurrency{INT32_MIN})), -21474836480000);
   EXPECT_EQ(Stored(QENCurrency2Currency(TQENCurrency{12345})), 1234500);
   EXPECT_EQ(Stored(QENCurrency2Currency(TQENCurrency{INT32_MAX})), 214748364700);
   EXPECT_EQ(Stored(Currency2QENLongCurrency(Currency{-15})), -1500);
-  EXPECT_EQ(Stored(Currency2QENLongCurrency(Currency{92233720368547758})),
-            9223372036854775800);
+  EXPECT_EQ(Stored(Currency2QENLongCurrency(Currency{92233720368547758})), 9223372036854775800);
   ExpectInvalidValue([] { Currency2QENLongCurrency(Currency{92233720368547759}); });
   ExpectInvalidValue([] { Currency2QENLongCurrency(Currency{-92233720368547759}); });
 }
@@ -117,8 +169,7 @@ TEST(MoneyConversions, NarrowingRoundsHalvesToEven) {
   EXPECT_EQ(Stored(QENLongCurrency2Currency(TQENLongCurrency{350})), 4);
   EXPECT_EQ(Stored(QENLongCurrency2Currency(TQENLongCurrency{-350})), -4);
   EXPECT_EQ(Stored(QENLongCurrency2Currency(TQENLongCurrency{-349})), -3);
-  EXPECT_EQ(Stored(QENLongCurrency2Currency(TQENLongCurrency{INT64_MIN})),
-            -92233720368547758);
+  EXPECT_EQ(Stored(QENLongCurrency2Currency(TQENLongCurrency{INT64_MIN})), -92233720368547758);
   EXPECT_EQ(Stored(Currency2QENCurrency(Currency{150})), 2);
   EXPECT_EQ(Stored(Currency2QENCurrency(Currency{-50})), 0);
   EXPECT_EQ(Stored(Currency2QENCurrency(Currency{-51})), -1);

@@ -199,12 +199,52 @@ Extended BetaFinite(Extended a, Extended b) {
   return kSqrt2Pi * std::sqrt(c / b) / std::sqrt(a) * std::exp(correction - exponent);
 }
 
+// Error-free transformations: s + e = a + b and p + e = a * b exactly (Knuth's TwoSum and
+// Dekker's product with Veltkamp's 32/32 split of the 64-bit significand).
+struct ExactPair {
+  Extended hi;
+  Extended lo;
+};
+
+ExactPair TwoSum(Extended a, Extended b) {
+  const Extended s = a + b;
+  const Extended bb = s - a;
+  return {s, (a - (s - bb)) + (b - bb)};
+}
+
+ExactPair TwoProduct(Extended a, Extended b) {
+  constexpr Extended kSplitter = 4294967297.0L;  // 2^32 + 1
+  const Extended p = a * b;
+  const Extended ta = kSplitter * a;
+  const Extended a_hi = ta - (ta - a);
+  const Extended a_lo = a - a_hi;
+  const Extended tb = kSplitter * b;
+  const Extended b_hi = tb - (tb - b);
+  const Extended b_lo = b - b_hi;
+  return {p, ((a_hi * b_hi - p) + a_hi * b_lo + a_lo * b_hi) + a_lo * b_lo};
+}
+
+// s - (s + t) u for an exact u, with the products and the first difference carried exactly:
+// near the mean the result is a small difference of large terms.
+Extended ShiftedDifference(Extended s, Extended t, Extended u) {
+  const ExactPair su = TwoProduct(s, u);
+  const ExactPair tu = TwoProduct(t, u);
+  const ExactPair d = TwoSum(s, -su.hi);
+  return (d.hi - tu.hi) + ((d.lo - su.lo) - tu.lo);
+}
+
 // A point of the incomplete beta: x and y = 1 - x, where the smaller of the two is exact and
 // the larger may carry the rounding of 1 - (smaller).
 struct BetaPoint {
   Extended x;
   Extended y;
 };
+
+// lambda = a y - b x = a - (a + b) x, from the exact member of the pair.
+Extended BetaLambda(const BetaPoint& p, Extended a, Extended b) {
+  if (p.x <= 0.5L) return ShiftedDifference(a, b, p.x);
+  return -ShiftedDifference(b, a, p.y);
+}
 
 // ln x and ln y, each from the exact member of the pair.
 Extended LnX(const BetaPoint& p) { return p.x <= 0.5L ? std::log(p.x) : std::log1p(-p.y); }
@@ -215,68 +255,88 @@ Extended LnY(const BetaPoint& p) { return p.y <= 0.5L ? std::log(p.y) : std::log
 //   (x c / a)^a (y c / b)^b sqrt(a b / (2 pi c)) exp(Delta(c) - Delta(a) - Delta(b)),  c = a + b,
 // where the powers are exp(a log1p(-lambda/a) + b log1p(lambda/b)) with lambda = a y - b x:
 // near the mean both logarithms are small and their linear parts cancel exactly.
-Extended BetaPowerFactor(const BetaPoint& p, Extended a, Extended b) {
+Extended BetaPowerFactor(const BetaPoint& p, Extended a, Extended b, Extended lambda) {
   const Extended c = a + b;
-  const Extended lambda = a * p.y - b * p.x;
   const Extended ta = -lambda / a;
   const Extended tb = lambda / b;
-  // exponent = -(a ln(x c / a) + b ln(y c / b)) >= 0.
-  Extended exponent;
-  const bool small_a = std::fabs(ta) <= 0.5L;
-  const bool small_b = std::fabs(tb) <= 0.5L;
-  const Extended part_a =
-      small_a ? 0.0L : -a * (LnX(p) + std::log1p(b / a));  // -a ln(x c / a) when not small
-  const Extended part_b = small_b ? 0.0L : -b * (LnY(p) + std::log1p(a / b));
-  if (small_a && small_b) {
+  const bool near_a = std::fabs(ta) <= 0.5L;
+  const bool near_b = std::fabs(tb) <= 0.5L;
+  // factor = power * exp(-exponent) * scale * exp(correction). Away from the mean a term
+  // (x c / a)^a is split into x^a, taken by pow from the exact x (no exp of a large rounded
+  // logarithm), and (c / a)^a = exp(a log1p(b / a)).
+  Extended exponent = 0.0L;
+  Extended power = 1.0L;
+  Extended log_power = 0.0L;
+  if (near_a && near_b) {
     exponent = a * XMinusLog1p(ta) + b * XMinusLog1p(tb);
-  } else if (small_a) {
-    // -a ln(1 + ta) = a (ta - ln(1 + ta)) - a ta = a Log1pmx(ta) + lambda.
-    exponent = a * XMinusLog1p(ta) + lambda + part_b;
-  } else if (small_b) {
-    exponent = part_a + b * XMinusLog1p(tb) - lambda;
   } else {
-    exponent = part_a + part_b;
+    if (near_a) {
+      // -a ln(1 + ta) = a (ta - ln(1 + ta)) - a ta = a XMinusLog1p(ta) + lambda.
+      exponent += a * XMinusLog1p(ta) + lambda;
+    } else {
+      exponent -= a * std::log1p(b / a);
+      power *= p.x <= 0.5L ? std::pow(p.x, a) : std::exp(a * LnX(p));
+      log_power += a * LnX(p);
+    }
+    if (near_b) {
+      exponent += b * XMinusLog1p(tb) - lambda;
+    } else {
+      exponent -= b * std::log1p(a / b);
+      power *= p.y <= 0.5L ? std::pow(p.y, b) : std::exp(b * LnY(p));
+      log_power += b * LnY(p);
+    }
   }
   const Extended correction = StirlingRemainder(c) - StirlingRemainder(a) - StirlingRemainder(b);
   const Extended scale = std::sqrt(a) * std::sqrt(b / c) / kSqrt2Pi;
-  return scale * std::exp(correction - exponent);
+  if (!std::isnormal(power)) {
+    // The powers alone left the range although the whole may not: use logarithms throughout.
+    return scale * std::exp(correction - exponent + log_power);
+  }
+  return power * (scale * std::exp(correction - exponent));
 }
 
-// The continued fraction 1 / (1 + d1 / (1 + d2 / (1 + ...))) of I_x(a, b) a B(a, b) / (x^a y^b),
-// by the modified Lentz method. Converges quickly for x < (a + 1) / (a + b + 2).
-Extended BetaContinuedFraction(const BetaPoint& p, Extended a, Extended b) {
-  constexpr Extended kTiny = 1e-4000L;
-  constexpr int kMaxIterations = 1000000;
+// The continued fraction of I_x(a, b) B(a, b) / (x^a y^b) in the form of DiDonato and Morris
+// (TOMS 708, BFRAC), for lambda = a y - b x >= 0. Its partial denominators are built from
+// lambda itself, so near the mean nothing cancels. The convergents are rescaled every step.
+Extended BetaContinuedFraction(const BetaPoint& p, Extended a, Extended b, Extended lambda) {
+  constexpr int kMaxIterations = 100000;
   const Extended x = p.x;
-  const Extended apb = a + b;
-  Extended c = 1.0L;
-  Extended d = 1.0L - apb * x / (a + 1.0L);
-  if (std::fabs(d) < kTiny) d = kTiny;
-  d = 1.0L / d;
-  Extended h = d;
-  for (int m = 1; m <= kMaxIterations; ++m) {
-    const Extended mm = static_cast<Extended>(m);
-    const Extended m2 = 2.0L * mm;
-    // Even step.
-    Extended aa = mm * (b - mm) * x / ((a - 1.0L + m2) * (a + m2));
-    d = 1.0L + aa * d;
-    if (std::fabs(d) < kTiny) d = kTiny;
-    c = 1.0L + aa / c;
-    if (std::fabs(c) < kTiny) c = kTiny;
-    d = 1.0L / d;
-    h *= d * c;
-    // Odd step.
-    aa = -(a + mm) * (apb + mm) * x / ((a + m2) * (a + 1.0L + m2));
-    d = 1.0L + aa * d;
-    if (std::fabs(d) < kTiny) d = kTiny;
-    c = 1.0L + aa / c;
-    if (std::fabs(c) < kTiny) c = kTiny;
-    d = 1.0L / d;
-    const Extended delta = d * c;
-    h *= delta;
-    if (std::fabs(delta - 1.0L) <= kEpsilon) break;
+  const Extended c = lambda + 1.0L;
+  const Extended c0 = b / a;
+  const Extended c1 = 1.0L / a + 1.0L;
+  const Extended yp1 = p.y + 1.0L;
+  Extended pn = 1.0L;
+  Extended s = a + 1.0L;
+  Extended an = 0.0L;
+  Extended bn = 1.0L;
+  Extended anp1 = 1.0L;
+  Extended bnp1 = c / c1;
+  Extended r = c1 / c;
+  for (int i = 1; i <= kMaxIterations; ++i) {
+    const Extended n = static_cast<Extended>(i);
+    Extended t = n / a;
+    const Extended w = n * (b - n) * x;
+    Extended e = a / s;
+    const Extended alpha = pn * (pn + c0) * e * e * (w * x);
+    e = (t + 1.0L) / (c1 + t + t);
+    const Extended beta = n + w / s + e * (c + n * yp1);
+    pn = t + 1.0L;
+    s += 2.0L;
+    t = alpha * an + beta * anp1;
+    an = anp1;
+    anp1 = t;
+    t = alpha * bn + beta * bnp1;
+    bn = bnp1;
+    bnp1 = t;
+    const Extended r0 = r;
+    r = anp1 / bnp1;
+    if (!(std::fabs(r - r0) > kEpsilon * r)) break;
+    an /= bnp1;
+    bn /= bnp1;
+    anp1 = r;
+    bnp1 = 1.0L;
   }
-  return h;
+  return r;
 }
 
 // I_x(a, b) and its complement 1 - I_x(a, b), each to full relative accuracy when it is the
@@ -288,12 +348,15 @@ struct BetaValues {
 };
 
 BetaValues IncompleteBetaBoth(const BetaPoint& p, Extended a, Extended b) {
-  const bool swap = p.x * (a + b + 2.0L) > a + 1.0L;
+  // Below the mean (lambda >= 0) I_x is the smaller tail and is computed directly; above it
+  // the complement I_y(b, a) is.
+  const Extended lambda = BetaLambda(p, a, b);
+  const bool swap = lambda < 0.0L;
   const BetaPoint q = swap ? BetaPoint{p.y, p.x} : p;
   const Extended sa = swap ? b : a;
   const Extended sb = swap ? a : b;
-  const Extended factor = BetaPowerFactor(q, sa, sb);
-  const Extended tail = factor * BetaContinuedFraction(q, sa, sb) / sa;
+  const Extended factor = BetaPowerFactor(q, sa, sb, swap ? -lambda : lambda);
+  const Extended tail = factor * BetaContinuedFraction(q, sa, sb, std::fabs(lambda));
   if (swap) return {1.0L - tail, tail, factor};
   return {tail, 1.0L - tail, factor};
 }
@@ -376,8 +439,10 @@ Extended InverseBetaLowerHalf(Extended p, Extended q, Extended a, Extended b, Be
       if (lo > 0.0L && hi > 16.0L * lo) {
         next = std::sqrt(lo) * std::sqrt(hi);
       } else if (lo == 0.0L) {
-        next = hi / 16.0L;
-        if (next <= 0.0L) return hi;
+        // Nothing below yet: shrink the exponent, reaching the subnormals in a dozen steps.
+        next = hi * std::fmin(hi, 0.0625L);
+        if (next <= 0.0L) next = hi * 0x1p-64L;
+        if (next <= 0.0L) return 0.0L;
       } else {
         next = 0.5L * (lo + hi);
       }

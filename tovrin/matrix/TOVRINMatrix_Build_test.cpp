@@ -24,11 +24,11 @@ using Rows = std::vector<std::vector<long double>>;
 // The creators of each element type, so that typed tests can reach the per-type names.
 template <typename T>
 struct Creators;
-#define TOVRIN_CREATORS(T, Name)                                                    \
-  template <>                                                                       \
-  struct Creators<T> {                                                              \
+#define TOVRIN_CREATORS(T, Name)                                                      \
+  template <>                                                                         \
+  struct Creators<T> {                                                                \
     static auto Create(LongWord R, LongWord C) { return Create##Name##Matrix(R, C); } \
-    static auto Identity(LongWord N) { return Create##Name##IdentityMatrix(N); }   \
+    static auto Identity(LongWord N) { return Create##Name##IdentityMatrix(N); }      \
   };
 TOVRIN_CREATORS(PackedExtended, Float)
 TOVRIN_CREATORS(Double, Double)
@@ -201,8 +201,9 @@ TYPED_TEST(MatrixArithmetic, TwoMatrixChecksInOrder) {
     // Shapes that differ.
     ExpectMathError(rsSameDimensions, [&] { SubtractMatrices(a, Make<TypeParam>({{1, 2}})); });
     ExpectRaisesUntouched(rsSameDimensions, a, [&](M& m) { AddToMatrix(m, none); });
-    ExpectRaisesUntouched(rsSameDimensions, a,
-                          [&](M& m) { SubtractFromMatrix(m, Make<TypeParam>({{1, 2, 3}})); });
+    ExpectRaisesUntouched(rsSameDimensions, a, [&](M& m) {
+      SubtractFromMatrix(m, Make<TypeParam>({{1, 2, 3}}));
+    });
   }
   {
     RectangularCheckSwitch sw(true);

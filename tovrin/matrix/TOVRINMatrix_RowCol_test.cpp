@@ -55,9 +55,13 @@ TYPED_TEST(RowColAllTypes, SwapChecksInOrder) {
   ExpectRaisesUntouched(rsMatrixIsEmpty, M{}, [](M& x) { SwapMatrixRows(x, 0, 9); });
   ExpectRaisesUntouched(rsMatrixIsEmpty, Make<TypeParam>({{}, {}}),
                         [](M& x) { SwapMatrixCols(x, 0, 9); });
+  // Under the switch a ragged matrix reports no columns, so it fails the first check too.
   const auto ragged = Make<TypeParam>({{1, 2}, {3}});
-  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { SwapMatrixRows(x, 0, 9); });
-  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { SwapMatrixCols(x, 0, 9); });
+  ExpectRaisesUntouched(rsMatrixIsEmpty, ragged, [](M& x) { SwapMatrixRows(x, 0, 9); });
+  ExpectRaisesUntouched(rsMatrixIsEmpty, ragged, [](M& x) { SwapMatrixCols(x, 0, 9); });
+  // An index past the end, both for the first and for the second index.
+  const auto sq = Make<TypeParam>({{1, 2}, {3, 4}});
+  ExpectRaisesUntouched(rsInvalidCol, sq, [](M& x) { SwapMatrixCols(x, 2, 0); });
 }
 
 TYPED_TEST(RowColAllTypes, SwapsWithTheSwitchOffNeverPassARowEnd) {
@@ -85,7 +89,10 @@ TYPED_TEST(RowColAllTypes, SortsLeaveOneRowOrOneColumnAlone) {
   M none;
   QSortMatrixRowsOnCol(none, 0, true);
   auto ragged = Make<TypeParam>({{3, 1, 2}, {1}});
-  QSortMatrixRowsOnCol(ragged, 0, true);  // two rows but row 0 ... ragged: checks apply
+  // Under the switch a ragged matrix reports no columns: no check, no change.
+  RectangularCheckSwitch sw(true);
+  QSortMatrixRowsOnCol(ragged, 9, true);
+  QSortMatrixColsOnRow(ragged, 9, true);
   EXPECT_EQ(Values(ragged), (Rows{{3, 1, 2}, {1}}));
 }
 
@@ -100,10 +107,6 @@ TYPED_TEST(RowColAllTypes, SortRowsOnAColumn) {
   const auto sq = Make<TypeParam>({{2, 1}, {1, 2}});
   ExpectRaisesUntouched(rsInvalidCol, sq, [](M& x) { QSortMatrixRowsOnCol(x, 2, true); });
   ExpectRaisesUntouched(rsInvalidRow, sq, [](M& x) { QSortMatrixColsOnRow(x, 2, true); });
-  RectangularCheckSwitch sw(true);
-  const auto ragged = Make<TypeParam>({{2, 1}, {1}, {3, 3}});
-  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { QSortMatrixRowsOnCol(x, 9, true); });
-  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { QSortMatrixColsOnRow(x, 9, true); });
 }
 
 TYPED_TEST(RowColAllTypes, SortsOrderEqualKeysAsTheQuickSortLeavesThem) {
@@ -257,10 +260,11 @@ TYPED_TEST(RowColArithmetic, AddMultiplesOfRowsAndColumns) {
   ExpectRaisesUntouched(rsInvalidRow, m, [](M& x) { AddMatrixRows(x, 0, 2, 0); });
   ExpectRaisesUntouched(rsInvalidCol, m, [](M& x) { AddMatrixCols(x, 2, 0, 0); });
   ExpectRaisesUntouched(rsMatrixIsEmpty, M{}, [](M& x) { AddMatrixCols(x, 0, 0, 0); });
+  // Under the switch a ragged matrix reports no columns and fails the emptiness check.
   RectangularCheckSwitch sw(true);
   const auto ragged = Make<TypeParam>({{1, 2}, {3}});
-  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { AddMatrixRows(x, 0, 9, 1); });
-  ExpectRaisesUntouched(rsMatrixRect, ragged, [](M& x) { ScaleMatrixCol(x, 9, 2); });
+  ExpectRaisesUntouched(rsMatrixIsEmpty, ragged, [](M& x) { AddMatrixRows(x, 0, 9, 1); });
+  ExpectRaisesUntouched(rsMatrixIsEmpty, ragged, [](M& x) { ScaleMatrixCol(x, 9, 2); });
 }
 
 TYPED_TEST(RowColArithmetic, RaggedWithTheSwitchOff) {
@@ -309,14 +313,19 @@ TYPED_TEST(RowColProduct, ShapesAndValues) {
   {
     RectangularCheckSwitch sw(true);
     ExpectMathError(rsMatrixRect, [&] { MultiplyMatrices(M{}, b); });
-    ExpectMathError(rsMatrixRect, [&] { MultiplyMatrices(a, Make<TypeParam>({{1}, {2, 3}, {4}})); });
+    ExpectMathError(rsMatrixRect, [&] {
+      MultiplyMatrices(a, Make<TypeParam>({{1}, {2, 3}, {4}}));
+    });
   }
   {
     RectangularCheckSwitch sw(false);
     ExpectMathError(rsMatrixIsEmpty, [&] { MultiplyMatrices(M{}, b); });
     ExpectMathError(rsMatrixIsEmpty, [&] { MultiplyMatrices(a, M{}); });
     ExpectMathError(rsMatrixRect, [&] { MultiplyMatrices(Make<TypeParam>({{1, 2}, {3}}), a); });
-    ExpectMathError(rsMatrixRect, [&] { MultiplyMatrices(b, Make<TypeParam>({{1, 2}})); });
+    ExpectMathError(rsMatrixRect, [&] {
+      MultiplyMatrices(Make<TypeParam>({{1, 2}}), Make<TypeParam>({{1, 2}, {3}}));
+    });
+    ExpectMathError(rsMatrixMult, [&] { MultiplyMatrices(b, Make<TypeParam>({{1, 2}, {3, 4}})); });
     EXPECT_EQ(Values(MultiplyMatrices(Make<TypeParam>({{2}, {3, 9}}), Make<TypeParam>({{4, 5}}))),
               (Rows{{8, 10}, {12, 15}}));
   }
@@ -401,8 +410,9 @@ TYPED_TEST(RowColSums, SumsAndChecks) {
   ExpectMathError(rsMatrixIsEmpty, [&] { SumMatrixCol(Make<TypeParam>({{}, {}}), 0); });
   const auto ragged = Make<TypeParam>({{1, 2}, {3}});
   {
-    RectangularCheckSwitch sw(true);
-    ExpectMathError(rsMatrixRect, [&] { SumMatrixRow(ragged, 0); });
+    RectangularCheckSwitch sw(true);  // ragged: no columns reported
+    ExpectMathError(rsMatrixIsEmpty, [&] { SumMatrixRow(ragged, 0); });
+    ExpectMathError(rsMatrixIsEmpty, [&] { SumMatrixCol(ragged, 0); });
   }
   RectangularCheckSwitch sw(false);
   EXPECT_EQ(static_cast<long double>(SumMatrixRow(ragged, 0)), 3.0L);

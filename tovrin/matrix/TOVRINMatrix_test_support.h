@@ -93,9 +93,8 @@ void ExpectRaisesUntouched(TResStringId Ident, const Matrix<T>& M, CallFn Call) 
 }
 
 // The ten matrix types and the subsets of the family tables.
-using AllMatrixTypes =
-    ::testing::Types<PackedExtended, Double, Single, Int64, LongWord, LongInt, Word, SmallInt,
-                     Byte, ShortInt>;
+using AllMatrixTypes = ::testing::Types<PackedExtended, Double, Single, Int64, LongWord, LongInt,
+                                        Word, SmallInt, Byte, ShortInt>;
 using FloatMatrixTypes = ::testing::Types<PackedExtended, Double, Single>;
 using ArithmeticMatrixTypes = ::testing::Types<PackedExtended, Double, Single, Int64, LongInt>;
 

@@ -4,7 +4,8 @@
 // its last argument, its twin without it draws from VerdanRandom and behaves exactly as the
 // first given VerdanRandom. A generator keeps nothing between calls: two calls with the same
 // arguments differ only through the state of the uniform source. Argument checks raise
-// EMathError before the first uniform is drawn, unless a family says otherwise.
+// EMathError before the first uniform is drawn, unless a family says otherwise; a NaN argument
+// fails the range check it meets.
 //
 // Where a generator truncates a value to an integer (Trunc), a value that is NaN or lies outside
 // the Int64 range raises rsInvalidValue instead (the conversion would be undefined).
@@ -18,7 +19,7 @@
 
 namespace tovrin {
 
-// --- The uniform source -----------------------------------------------------------------------
+// --- The uniform source ---
 // A uniform on [0, 1) with 64 random mantissa bits (every multiple of 2^-64 below 1 is equally
 // likely). Safe to call from several threads; no lock is taken on the way.
 //
@@ -86,7 +87,7 @@ class TRandomGenFunction {
   Extended (*call_)(Target);
 };
 
-// --- Normal and log-normal ----------------------------------------------------------------------
+// --- Normal and log-normal ---
 // Standard normal by Leva's ratio of uniforms (two uniforms per attempt, u first, held as
 // doubles). Raises rsDivideByZero when the accepted u is below 5.0E-324.
 Extended Random_Normal(TRandomGenFunction Gen);
@@ -99,7 +100,7 @@ Extended Random_Normal(Extended Mean, Extended StdDev);
 Extended Random_LogNormal(Extended Mean, Extended StdDev, TRandomGenFunction Gen);
 Extended Random_LogNormal(Extended Mean, Extended StdDev);
 
-// --- Gamma, chi-square, exponential, Weibull ----------------------------------------------------
+// --- Gamma, chi-square, exponential, Weibull ---
 // Gamma(Shape, scale 1): Marsaglia-Tsang above 1, a power-law/exponential rejection below 1,
 // the exponential at exactly 1. Raises rsInvalidShape for Shape <= 0 and rsShapeTooSmall for
 // 0 < Shape < 5.0E-324.
@@ -116,19 +117,18 @@ Extended Random_Exponential();
 Extended Random_Weibull(Extended Shape, TRandomGenFunction Gen);
 Extended Random_Weibull(Extended Shape);
 
-// --- Beta and Student t
-// --------------------------------------------------------------------------- Beta(A, B) on [0, 1]
-// by Cheng's algorithm BA with the larger parameter leading, so that Random_Beta(A, B) = 1 -
-// Random_Beta(B, A) on the same uniforms when A != B. Raises rsInvalidValue for A <= 0 or B <= 0.
+// --- Beta and Student t ---
+// Beta(A, B) on [0, 1] by Cheng's algorithm BA with the larger parameter leading, so that
+// Random_Beta(A, B) = 1 - Random_Beta(B, A) on the same uniforms when A != B. Raises rsInvalidValue
+// for A <= 0 or B <= 0.
 Extended Random_Beta(Extended A, Extended B, TRandomGenFunction Gen);
 Extended Random_Beta(Extended A, Extended B);
 // Student t by ratio of uniforms. Raises rsInvalidValue for DF < 1.
 Extended Random_T(LongInt DF, TRandomGenFunction Gen);
 Extended Random_T(LongInt DF);
 
-// --- Multivariate normal
-// -------------------------------------------------------------------------- Covariance holds the
-// upper triangle of the n x n covariance matrix packed column by column
+// --- Multivariate normal ---
+// Covariance holds the upper triangle of the n x n covariance matrix packed column by column
 // ((i, j), i <= j, 1-based, at (j - 1) j / 2 + i - 1), n = Means.size(). Factor is resized to
 // n (n + 1) / 2 (keeping what it held in front) and receives the upper Cholesky factor U
 // (Covariance = U'U) packed row by row ((i, j) at (i - 1)(2n - i) / 2 + j - 1); Variate becomes
@@ -142,18 +142,18 @@ void Random_MVNorm(const TQENFloatVector& Means, const TQENFloatVector& Covarian
 void Random_MVNorm(const TQENFloatVector& Means, const TQENFloatVector& Covariance,
                    TQENFloatVector& Factor, TQENFloatVector& Variate, LongInt& ErrorCode);
 
-// --- Generalised inverse Gaussian
-// ----------------------------------------------------------------- Density proportional to
-// x^(Lambda - 1) exp(-(Omega / 2)(x + 1/x)). Raises rsInvalidValue for Lambda < 0, Omega <= 0,
-// Lambda > 0.25 Omega sqrt(1.7E+308), or when the method's bounds fall to 5.0E-324 or below.
+// --- Generalised inverse Gaussian ---
+// Density proportional to x^(Lambda - 1) exp(-(Omega / 2)(x + 1/x)). Raises rsInvalidValue for
+// Lambda < 0, Omega <= 0, Lambda > 0.25 Omega sqrt(1.7E+308), or when the method's bounds fall
+// to 5.0E-324 or below.
 Extended Random_Inv_Gauss(Extended Lambda, Extended Omega, TRandomGenFunction Gen);
 Extended Random_Inv_Gauss(Extended Lambda, Extended Omega);
 
-// --- Binomial and negative binomial
-// --------------------------------------------------------------- Binomial(N, P) by inversion
-// walking outward from the mode Trunc((N + 1) P); the mode is returned at once when the first
-// uniform lies below its probability. Arguments are not checked. If rounding leaves the walk
-// unfinished once both ends are reached (it could only step on for ever), rsInvalidValue is raised.
+// --- Binomial and negative binomial ---
+// Binomial(N, P) by inversion walking outward from the mode Trunc((N + 1) P); the mode is returned
+// at once when the first uniform lies below its probability. Arguments are not checked. If rounding
+// leaves the walk unfinished once both ends are reached (it could only step on for ever),
+// rsInvalidValue is raised.
 Int64 Random_Binomial1(LongInt N, Extended P, TRandomGenFunction Gen);
 Int64 Random_Binomial1(LongInt N, Extended P);
 // Binomial(N, P) by BTPE, or by inversion when N min(P, 1 - P) <= 30. Arguments are not
@@ -171,17 +171,16 @@ Int64 Random_Binomial2(Int64 N, Extended P);
 Int64 Random_Neg_Binomial(Extended R, Extended P, TRandomGenFunction Gen);
 Int64 Random_Neg_Binomial(Extended R, Extended P);
 
-// --- von Mises and Cauchy
-// ------------------------------------------------------------------------- An angle in [-pi, pi]
-// with density proportional to exp(K cos theta). Raises rsInvalidValue unless 0 <= K < 10.
+// --- von Mises and Cauchy ---
+// An angle in [-pi, pi] with density proportional to exp(K cos theta). Raises rsInvalidValue unless
+// 0 <= K < 10.
 Extended Random_von_Mises(Extended K, TRandomGenFunction Gen);
 Extended Random_von_Mises(Extended K);
 // Standard Cauchy: x / y for a point (x, y) uniform in the unit disc.
 Extended Random_Cauchy(TRandomGenFunction Gen);
 Extended Random_Cauchy();
 
-// --- Poisson
-// ----------------------------------------------------------------------------------------
+// --- Poisson ---
 // Poisson(Mu) by Ahrens-Dieter PD: table inversion for Mu <= 10, the normal-based method above.
 // Mu is read only. A non-positive Mu gives 0.
 Int64 Random_Poisson(Extended& Mu, TRandomGenFunction Gen);

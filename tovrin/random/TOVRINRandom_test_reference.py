@@ -45,9 +45,10 @@ def solve(f, lo, hi):
 
 def quantile(cdf, p, lo, hi, pdf=None):
     lo, hi = mp.mpf(lo), mp.mpf(hi)
-    while cdf(lo) > p:
+    # strict bracket: cdf(lo) < p < cdf(hi) (bisect needs a sign change)
+    while cdf(lo) >= p:
         lo = lo - (hi - lo)
-    while cdf(hi) < p:
+    while cdf(hi) <= p:
         hi = hi + (hi - lo)
     if pdf is None:
         return solve(lambda x: cdf(x) - p, lo, hi)

@@ -4,7 +4,7 @@
 #include <cmath>
 #include <cstddef>
 
-#include "tovrin/vector/TOVRINVector.h"
+#include "tovrin/foundation/TOVRINErrors.h"
 
 namespace tovrin {
 namespace {
@@ -15,16 +15,40 @@ void CheckSameLength(const TQENFloatVector& X, const TQENFloatVector& Y) {
   if (X.size() != Y.size()) RaiseMathError(rsSameDimensions);
 }
 
+// The sums behind the correlation and the line, gathered in one pass. Each is the sum that
+// SumVector, SumSqVector or DotProdVectors gives (the same additions in the same order), taken
+// directly so that the pairs are read once instead of five times. X and Y have equal lengths.
+struct PairSums {
+  Extended Sx = 0;
+  Extended Sy = 0;
+  Extended Sxx = 0;
+  Extended Syy = 0;
+  Extended Sxy = 0;
+};
+
+PairSums SumsOf(const TQENFloatVector& X, const TQENFloatVector& Y) {
+  PairSums sums;
+  for (std::size_t i = 0; i < X.size(); ++i) {
+    const Extended x = X[i];
+    const Extended y = Y[i];
+    sums.Sx += x;
+    sums.Sy += y;
+    sums.Sxx += x * x;
+    sums.Syy += y * y;
+    sums.Sxy += x * y;
+  }
+  return sums;
+}
+
 }  // namespace
 
 Extended CoeffCorrelation(const TQENFloatVector& X, const TQENFloatVector& Y) {
   if (X.size() != Y.size() || X.size() < 2) return 0;
   const auto n = static_cast<Extended>(X.size());
-  const Extended sx = SumVector(X);
-  const Extended sy = SumVector(Y);
-  const Extended ssx = SumSqVector(X) - sx * sx / n;
-  const Extended ssy = SumSqVector(Y) - sy * sy / n;
-  const Extended spxy = DotProdVectors(X, Y) - sx * sy / n;
+  const PairSums s = SumsOf(X, Y);
+  const Extended ssx = s.Sxx - s.Sx * s.Sx / n;
+  const Extended ssy = s.Syy - s.Sy * s.Sy / n;
+  const Extended spxy = s.Sxy - s.Sx * s.Sy / n;
   const Extended sdx = std::sqrt(ssx / (n - 1));
   const Extended sdy = std::sqrt(ssy / (n - 1));
   return (spxy / (n - 1)) / (sdx * sdy);
@@ -38,14 +62,14 @@ Extended CoeffDetermination(const TQENFloatVector& X, const TQENFloatVector& Y) 
 void GetRegressionLine(const TQENFloatVector& X, const TQENFloatVector& Y, Extended& Intercept,
                        Extended& Slope) {
   CheckSameLength(X, Y);
-  const Extended sx = SumVector(X);
-  const Extended sy = SumVector(Y);
+  if (X.empty()) RaiseMathError(rsVectorIsEmpty);  // as SumVector raises it
+  const PairSums s = SumsOf(X, Y);
   const auto n = static_cast<Extended>(X.size());
-  const Extended ssx = SumSqVector(X) - sx * sx / n;
-  const Extended spxy = DotProdVectors(X, Y) - sx * sy / n;
+  const Extended ssx = s.Sxx - s.Sx * s.Sx / n;
+  const Extended spxy = s.Sxy - s.Sx * s.Sy / n;
   const Extended slope = spxy / ssx;
   Slope = slope;
-  Intercept = (sy - slope * sx) / n;
+  Intercept = (s.Sy - slope * s.Sx) / n;
 }
 
 void GetQuadraticCurve(const TQENFloatVector& X, const TQENFloatVector& Y, Extended& A, Extended& B,

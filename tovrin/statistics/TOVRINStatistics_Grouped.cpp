@@ -3,7 +3,6 @@
 
 #include <cmath>
 #include <cstddef>
-#include <cstdint>
 #include <vector>
 
 #include "tovrin/foundation/detail/ElementRules.h"
@@ -27,20 +26,13 @@ Extended Midpoint(std::size_t i, Extended Start, Extended Width) {
   return ClassStart(i, Start, Width) + Width / 2;
 }
 
-// The total frequency as an unsigned 64-bit sum.
-std::uint64_t TotalFrequency(const TQENLWordVector& Freqs) {
-  std::uint64_t total = 0;
-  for (const LongWord f : Freqs) total += f;
-  return total;
-}
-
 Extended MeanOf(const TQENLWordVector& Freqs, Extended Start, Extended Width) {
   CheckNotEmpty(Freqs);
   Extended sum = 0;
   for (std::size_t i = 0; i < Freqs.size(); ++i) {
     sum += static_cast<Extended>(Freqs[i]) * Midpoint(i, Start, Width);
   }
-  const std::uint64_t total = TotalFrequency(Freqs);
+  const Int64 total = SumVector(Freqs);  // the 64-bit total, F
   if (total == 0) return 0;
   return sum / static_cast<Extended>(total);
 }
@@ -52,7 +44,7 @@ Extended VarianceOf(const TQENLWordVector& Freqs, Extended Start, Extended Width
     const Extended d = Midpoint(i, Start, Width) - mean;
     sum += static_cast<Extended>(Freqs[i]) * (d * d);
   }
-  const std::uint64_t total = TotalFrequency(Freqs);
+  const Int64 total = SumVector(Freqs);  // the 64-bit total, F
   if (Sample) {
     if (total < 2) return 0;
     return sum / static_cast<Extended>(total - 1);
@@ -243,7 +235,7 @@ Extended GetGroupedMeanDev(const TQENLWordVector& Freqs, Extended Start, Extende
   for (std::size_t i = 0; i < Freqs.size(); ++i) {
     sum += static_cast<Extended>(Freqs[i]) * std::fabs(Midpoint(i, Start, Width) - Mean);
   }
-  const std::uint64_t total = TotalFrequency(Freqs);
+  const Int64 total = SumVector(Freqs);  // the 64-bit total, F
   if (total == 0) return 0;
   return sum / static_cast<Extended>(total);
 }

@@ -149,6 +149,23 @@ Extended ValueAtPosition(const TQENFloatVector& X, Single P) {
   return X[static_cast<std::size_t>((k < n ? k : n) - 1)];
 }
 
+// Walks the runs of SameFloat neighbours of X (two elements at least): Closed(length, last
+// index) is called for every run of two or more that ends before the last element, in order;
+// the length of the final run, which the mode rules weigh on their own, is returned.
+template <typename OnRun>
+Int64 ForEachRepeatedRun(const TQENFloatVector& X, OnRun&& Closed) {
+  Int64 count = 1;
+  for (std::size_t i = 1; i < X.size(); ++i) {
+    if (SameFloat(Extended(X[i]), Extended(X[i - 1]))) {
+      ++count;
+    } else {
+      if (count != 1) Closed(count, i - 1);
+      count = 1;
+    }
+  }
+  return count;
+}
+
 template <typename T>
 Extended TrimmedMeanOf(const std::vector<T>& X, Extended Alpha, bool Excel) {
   if (FloatIsZero(Alpha)) return MeanOf(X);
@@ -421,25 +438,17 @@ bool GetMode(const TQENFloatVector& X, Extended& Mode) {
   }
   // The runtime's negated largest-Extended constant: what Mode holds when no value repeats.
   Extended mode = -1.1e4932L;
-  Int64 count = 1;
   Int64 max_count = 0;
   bool tie = false;
-  for (std::size_t i = 1; i < n; ++i) {
-    if (SameFloat(Extended(X[i]), Extended(X[i - 1]))) {
-      ++count;
-    } else {
-      if (count != 1) {
-        if (count == max_count) {
-          tie = true;
-        } else if (count > max_count) {
-          mode = X[i - 1];
-          max_count = count;
-          tie = false;
-        }
-      }
-      count = 1;
+  const Int64 count = ForEachRepeatedRun(X, [&](Int64 run, std::size_t last) {
+    if (run == max_count) {
+      tie = true;
+    } else if (run > max_count) {
+      mode = X[last];
+      max_count = run;
+      tie = false;
     }
-  }
+  });
   // The last run, weighed once.
   if (max_count <= 0 && count > 1) {
     mode = X[n - 1];
@@ -462,23 +471,15 @@ TQENFloatVector GetMostFrequent(const TQENFloatVector& X) {
     result.push_back(X[0]);
     return result;
   }
-  Int64 count = 1;
   Int64 max_count = 0;
-  for (std::size_t i = 1; i < n; ++i) {
-    if (SameFloat(Extended(X[i]), Extended(X[i - 1]))) {
-      ++count;
-    } else {
-      if (count != 1) {
-        if (count == max_count) {
-          result.push_back(X[i - 1]);
-        } else if (count > max_count) {
-          result.assign(1, X[i - 1]);
-          max_count = count;
-        }
-      }
-      count = 1;
+  const Int64 count = ForEachRepeatedRun(X, [&](Int64 run, std::size_t last) {
+    if (run == max_count) {
+      result.push_back(X[last]);
+    } else if (run > max_count) {
+      result.assign(1, X[last]);
+      max_count = run;
     }
-  }
+  });
   // When only the last run repeats, the first element of X is what is reported (by design).
   if (max_count < 1 && count > 1) {
     result.assign(1, X[0]);

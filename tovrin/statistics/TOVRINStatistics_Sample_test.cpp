@@ -167,7 +167,7 @@ TYPED_TEST(SampleFamilies, TrimmedMeansAndTheirCheckOrder) {
   EXPECT_EQ(TrimmedMean(Make<V>({1, 2, 3, 4}), 0.49L), 2.5L);
   EXPECT_EQ(TrimmedMean(Make<V>({5}), 0.3L), 5);
 
-  // The argument checks come before the emptiness check, and the two special values before
+  // The argument checks come before the emptiness check, and the two shortcut values before
   // the range check.
   const V empty;
   ExpectRaises(rsInvalidValue, [&] { TrimmedMean(empty, 0.7L); });
@@ -184,7 +184,7 @@ TYPED_TEST(SampleFamilies, TrimmedMeansAndTheirCheckOrder) {
 }
 
 // ---------------------------------------------------------------------------------------------
-// Type-specific accumulators and wrap-around.
+// Accumulators and wrap-around that differ by element type.
 
 TEST(SampleVarianceAndMean, FloatSamplesMatchTheEmulatedArithmeticBitForBit) {
   Extended variance = 0;

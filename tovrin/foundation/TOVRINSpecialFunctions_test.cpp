@@ -1,0 +1,312 @@
+// Tests of Gamma, LnGamma, Beta, IncompleteBeta and InverseIncompleteBeta against reference
+// values computed at 256 bits by testdata/special_reference.py, plus exact values, identities,
+// round trips and the domain errors.
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <cstdio>
+#include <limits>
+#include <string>
+
+#include "tovrin/foundation/TOVRINErrors.h"
+#include "tovrin/foundation/TOVRINMath.h"
+
+namespace tovrin {
+namespace {
+
+struct SpecialCase1 {
+  Extended x;
+  Extended expected;
+  Extended tolerance;
+};
+struct SpecialCase2 {
+  Extended a;
+  Extended b;
+  Extended expected;
+  Extended tolerance;
+};
+struct SpecialCase3 {
+  Extended x;
+  Extended a;
+  Extended b;
+  Extended expected;
+  Extended tolerance;
+};
+
+#include "tovrin/foundation/testdata/special_reference.inc"
+
+constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
+constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
+
+Extended RelativeError(Extended got, Extended expected) {
+  if (got == expected) return 0.0L;
+  if (expected == 0.0L) return std::fabs(got);
+  return std::fabs((got - expected) / expected);
+}
+
+std::string Describe(const char* name, Extended x, Extended a, Extended b) {
+  char buffer[160];
+  std::snprintf(buffer, sizeof buffer, "%s(%.21Lg, %.21Lg, %.21Lg)", name, x, a, b);
+  return buffer;
+}
+
+// Runs F over a table, checks each entry against its tolerance and reports the largest error.
+template <typename Table, typename Call>
+void CheckTable(const char* name, const Table& table, Call call) {
+  Extended worst = 0.0L;
+  for (const auto& row : table) {
+    const auto [got, label] = call(row);
+    const Extended err = RelativeError(got, row.expected);
+    EXPECT_LE(err, row.tolerance) << label << " = " << static_cast<double>(got) << ", expected "
+                                  << static_cast<double>(row.expected);
+    if (err > worst) worst = err;
+  }
+  std::printf("[ info     ] %s: %zu reference values, largest relative error %.3Lg\n", name,
+              std::size(table), worst);
+}
+
+template <typename F>
+void ExpectRaises(F call, TResStringId id) {
+  try {
+    call();
+    ADD_FAILURE() << "no EMathError raised";
+  } catch (const EMathError& e) {
+    EXPECT_EQ(e.Ident(), id);
+  }
+}
+
+// --- Gamma ------------------------------------------------------------------------------------
+
+TEST(SpecialGamma, MatchesReferenceTable) {
+  CheckTable("Gamma", kGammaTable, [](const SpecialCase1& r) {
+    return std::pair{Gamma(r.x), Describe("Gamma", r.x, 0, 0)};
+  });
+}
+
+TEST(SpecialGamma, SmallIntegersAreExactFactorials) {
+  Extended factorial = 1.0L;
+  for (int n = 1; n <= 11; ++n) {
+    EXPECT_EQ(Gamma(static_cast<Extended>(n)), factorial) << n;
+    factorial *= n;
+  }
+}
+
+TEST(SpecialGamma, OverflowEdge) {
+  // 1754! = Gamma(1755) is the largest finite factorial; Gamma(1754.5) fits as well.
+  EXPECT_TRUE(std::isfinite(Gamma(1755.0L)));
+  EXPECT_GT(Gamma(1755.0L), 1e4930L);
+  EXPECT_TRUE(std::isfinite(Gamma(1754.5L)));
+  EXPECT_EQ(Gamma(1755.5L), kInf);
+  EXPECT_EQ(Gamma(1e6L), kInf);
+  EXPECT_EQ(Gamma(kInf), kInf);
+}
+
+TEST(SpecialGamma, RecurrenceHoldsAcrossMethodBoundaries) {
+  // Gamma(x + 1) = x Gamma(x) on both sides of every switch between methods.
+  for (Extended x : {-12.25L, -11.75L, -0.6L, -0.4L, 0.4L, 0.6L, 1.4L, 1.6L, 2.4L, 2.6L, 11.4L,
+                     11.6L, 12.3L}) {
+    EXPECT_LE(RelativeError(Gamma(x + 1.0L), x * Gamma(x)), 1e-17L) << static_cast<double>(x);
+  }
+}
+
+TEST(SpecialGamma, PolesRaise) {
+  for (Extended x : {0.0L, -0.0L, -1.0L, -2.0L, -170.0L, -1754.0L, -1e30L, -kInf}) {
+    const Extended before = x;
+    ExpectRaises([x] { Gamma(x); }, rsGammaPole);
+    EXPECT_TRUE(x == before || (std::isnan(x) && std::isnan(before)));
+  }
+}
+
+TEST(SpecialGamma, NaNGivesNaN) { EXPECT_TRUE(std::isnan(Gamma(kNaN))); }
+
+TEST(SpecialGamma, NegativeArgumentsAlternateInSign) {
+  EXPECT_LT(Gamma(-0.5L), 0.0L);
+  EXPECT_GT(Gamma(-1.5L), 0.0L);
+  EXPECT_LT(Gamma(-2.5L), 0.0L);
+  // Far below the last representable value the result is a signed zero.
+  EXPECT_EQ(Gamma(-2000.5L), 0.0L);
+}
+
+// --- LnGamma ----------------------------------------------------------------------------------
+
+TEST(SpecialLnGamma, MatchesReferenceTable) {
+  CheckTable("LnGamma", kLnGammaTable, [](const SpecialCase1& r) {
+    return std::pair{LnGamma(r.x), Describe("LnGamma", r.x, 0, 0)};
+  });
+}
+
+TEST(SpecialLnGamma, ZerosAreExact) {
+  EXPECT_EQ(LnGamma(1.0L), 0.0L);
+  EXPECT_EQ(LnGamma(2.0L), 0.0L);
+}
+
+TEST(SpecialLnGamma, AgreesWithGammaWhereGammaIsFinite) {
+  for (Extended x : {0.01L, 3.7L, 20.5L, 170.25L, 1000.5L, 1750.0L}) {
+    const Extended lg = LnGamma(x);
+    EXPECT_LE(std::fabs(lg - std::log(Gamma(x))), 1e-17L * std::fabs(lg) + 1e-19L)
+        << static_cast<double>(x);
+  }
+}
+
+TEST(SpecialLnGamma, PolesRaiseAndInfinityIsInfinite) {
+  for (Extended x : {0.0L, -1.0L, -3.0L, -1e20L}) {
+    ExpectRaises([x] { LnGamma(x); }, rsGammaPole);
+  }
+  EXPECT_EQ(LnGamma(kInf), kInf);
+  EXPECT_EQ(LnGamma(std::numeric_limits<Extended>::max()), kInf);
+  EXPECT_TRUE(std::isnan(LnGamma(kNaN)));
+}
+
+// --- Beta -------------------------------------------------------------------------------------
+
+TEST(SpecialBeta, MatchesReferenceTable) {
+  CheckTable("Beta", kBetaTable, [](const SpecialCase2& r) {
+    return std::pair{Beta(r.a, r.b), Describe("Beta", r.a, r.b, 0)};
+  });
+}
+
+TEST(SpecialBeta, SymmetricAndExactForSmallIntegers) {
+  EXPECT_EQ(Beta(1.0L, 1.0L), 1.0L);
+  // B(2, 3) = 1! 2! / 4! = 1/12.
+  EXPECT_LE(RelativeError(Beta(2.0L, 3.0L), 1.0L / 12.0L), 1e-18L);
+  EXPECT_EQ(Beta(2.5L, 7.25L), Beta(7.25L, 2.5L));
+  EXPECT_EQ(Beta(0.1L, 3e4L), Beta(3e4L, 0.1L));
+}
+
+TEST(SpecialBeta, DomainErrorsAndNaN) {
+  for (auto [a, b] : {std::pair{0.0L, 1.0L}, std::pair{1.0L, 0.0L}, std::pair{-1.0L, 2.0L},
+                      std::pair{2.0L, -kInf}}) {
+    const Extended a0 = a, b0 = b;
+    ExpectRaises([a, b] { Beta(a, b); }, rsArgOutsideDomain);
+    EXPECT_EQ(a, a0);
+    EXPECT_EQ(b, b0);
+  }
+  EXPECT_TRUE(std::isnan(Beta(kNaN, 1.0L)));
+  EXPECT_TRUE(std::isnan(Beta(1.0L, kNaN)));
+}
+
+// --- IncompleteBeta ---------------------------------------------------------------------------
+
+TEST(SpecialIncompleteBeta, MatchesReferenceTable) {
+  CheckTable("IncompleteBeta", kIncompleteBetaTable, [](const SpecialCase3& r) {
+    return std::pair{IncompleteBeta(r.x, r.a, r.b), Describe("IncompleteBeta", r.x, r.a, r.b)};
+  });
+}
+
+TEST(SpecialIncompleteBeta, EndsAreExact) {
+  for (Extended a : {1e-3L, 0.5L, 1.0L, 7.5L, 1e5L}) {
+    for (Extended b : {1e-3L, 0.5L, 3.0L, 1e5L}) {
+      EXPECT_EQ(IncompleteBeta(0.0L, a, b), 0.0L);
+      EXPECT_EQ(IncompleteBeta(1.0L, a, b), 1.0L);
+    }
+  }
+}
+
+TEST(SpecialIncompleteBeta, ClosedForms) {
+  // I_x(1, 1) = x, I_x(a, 1) = x^a, I_x(1, b) = 1 - (1 - x)^b.
+  for (Extended x : {1e-12L, 0.125L, 0.5L, 0.875L, 0.999L}) {
+    EXPECT_LE(RelativeError(IncompleteBeta(x, 1.0L, 1.0L), x), 2e-19L);
+    EXPECT_LE(RelativeError(IncompleteBeta(x, 4.0L, 1.0L), x * x * x * x), 1e-17L);
+    const Extended y = 1.0L - x;  // exact for these x
+    EXPECT_LE(RelativeError(IncompleteBeta(x, 1.0L, 3.0L), 1.0L - y * y * y), 1e-17L);
+  }
+}
+
+TEST(SpecialIncompleteBeta, ReflectionSumsToOne) {
+  // I_x(a, b) + I_{1-x}(b, a) = 1, with x chosen so that 1 - x is exact.
+  for (auto [a, b] : {std::pair{0.5L, 0.5L}, std::pair{2.0L, 9.0L}, std::pair{40.0L, 0.3L},
+                      std::pair{1e4L, 2e4L}}) {
+    for (Extended x : {0.0625L, 0.25L, 0.3125L, 0.5L, 0.6875L, 0.9375L}) {
+      EXPECT_NEAR(IncompleteBeta(x, a, b) + IncompleteBeta(1.0L - x, b, a), 1.0L, 4e-19L);
+    }
+  }
+}
+
+TEST(SpecialIncompleteBeta, DomainErrorsLeaveArgumentsAlone) {
+  struct Args {
+    Extended x, a, b;
+  };
+  for (Args args : {Args{-0.1L, 1.0L, 1.0L}, Args{1.1L, 1.0L, 1.0L}, Args{0.5L, 0.0L, 1.0L},
+                    Args{0.5L, 1.0L, -2.0L}, Args{-kInf, 1.0L, 1.0L}}) {
+    const Args before = args;
+    ExpectRaises([args] { IncompleteBeta(args.x, args.a, args.b); }, rsArgOutsideDomain);
+    EXPECT_EQ(args.x, before.x);
+    EXPECT_EQ(args.a, before.a);
+    EXPECT_EQ(args.b, before.b);
+  }
+}
+
+TEST(SpecialIncompleteBeta, NaNGivesNaN) {
+  EXPECT_TRUE(std::isnan(IncompleteBeta(kNaN, 1.0L, 1.0L)));
+  EXPECT_TRUE(std::isnan(IncompleteBeta(0.5L, kNaN, 1.0L)));
+  EXPECT_TRUE(std::isnan(IncompleteBeta(0.5L, 1.0L, kNaN)));
+}
+
+TEST(SpecialIncompleteBeta, HugeShapesFinishWithAValue) {
+  // Far beyond the tested domain the result still comes back, bounded and ordered.
+  const Extended mid = IncompleteBeta(0.5L, 1e9L, 1e9L);
+  EXPECT_NEAR(mid, 0.5L, 1e-12L);
+  EXPECT_LT(IncompleteBeta(0.4999L, 1e9L, 1e9L), 1e-10L);
+  EXPECT_GT(IncompleteBeta(0.5001L, 1e9L, 1e9L), 1.0L - 1e-10L);
+}
+
+// --- InverseIncompleteBeta --------------------------------------------------------------------
+
+TEST(SpecialInverseIncompleteBeta, MatchesReferenceTable) {
+  CheckTable("InverseIncompleteBeta", kInverseIncompleteBetaTable, [](const SpecialCase3& r) {
+    return std::pair{InverseIncompleteBeta(r.x, r.a, r.b),
+                     Describe("InverseIncompleteBeta", r.x, r.a, r.b)};
+  });
+}
+
+TEST(SpecialInverseIncompleteBeta, RoundTrip) {
+  // I(InverseIncompleteBeta(P)) = P to within what one unit of x moves the value.
+  for (auto [a, b] : {std::pair{0.5L, 0.5L}, std::pair{1.0L, 1.0L}, std::pair{2.0L, 5.0L},
+                      std::pair{0.5L, 15.0L}, std::pair{12.0L, 0.5L}, std::pair{30.0L, 30.0L}}) {
+    for (Extended p : {1e-300L, 1e-40L, 1e-8L, 0.001L, 0.2L, 0.5L, 0.8L, 0.999L, 1.0L - 1e-12L,
+                       1.0L - 1e-18L}) {
+      const Extended x = InverseIncompleteBeta(p, a, b);
+      const Extended back = IncompleteBeta(x, a, b);
+      const Extended q = 1.0L - p;
+      // The smaller tail carries the relative accuracy.
+      if (p <= 0.5L) {
+        EXPECT_LE(RelativeError(back, p), 1e-15L) << Describe("round trip", p, a, b);
+      } else {
+        EXPECT_LE(RelativeError(1.0L - back, q), 1e-15L * (1.0L + 1e-3L / q))
+            << Describe("round trip", p, a, b);
+      }
+    }
+  }
+}
+
+TEST(SpecialInverseIncompleteBeta, EndsAndMonotonicity) {
+  EXPECT_EQ(InverseIncompleteBeta(0.0L, 2.0L, 3.0L), 0.0L);
+  EXPECT_EQ(InverseIncompleteBeta(1.0L, 2.0L, 3.0L), 1.0L);
+  Extended last = 0.0L;
+  for (int i = 1; i < 100; ++i) {
+    const Extended x = InverseIncompleteBeta(i / 100.0L, 3.5L, 0.75L);
+    EXPECT_GT(x, last);
+    last = x;
+  }
+  // I_x(1, 1) = x.
+  EXPECT_LE(RelativeError(InverseIncompleteBeta(0.3L, 1.0L, 1.0L), 0.3L), 1e-18L);
+}
+
+TEST(SpecialInverseIncompleteBeta, DomainErrorsAndNaN) {
+  struct Args {
+    Extended p, a, b;
+  };
+  for (Args args : {Args{-1e-20L, 1.0L, 1.0L}, Args{1.0000001L, 1.0L, 1.0L},
+                    Args{0.5L, 0.0L, 1.0L}, Args{0.5L, 1.0L, -0.5L}}) {
+    const Args before = args;
+    ExpectRaises([args] { InverseIncompleteBeta(args.p, args.a, args.b); },
+                 rsArgOutsideDomain);
+    EXPECT_EQ(args.p, before.p);
+  }
+  EXPECT_TRUE(std::isnan(InverseIncompleteBeta(kNaN, 1.0L, 1.0L)));
+  EXPECT_TRUE(std::isnan(InverseIncompleteBeta(0.5L, kNaN, 1.0L)));
+  EXPECT_TRUE(std::isnan(InverseIncompleteBeta(0.5L, 1.0L, kNaN)));
+}
+
+}  // namespace
+}  // namespace tovrin

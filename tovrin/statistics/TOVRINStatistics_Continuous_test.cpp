@@ -1,0 +1,617 @@
+// Tests of the continuous distributions against reference values computed with mpmath at
+// 40 digits (TOVRINStatistics_Distributions_reference.py), exact values and properties.
+#include <array>
+#include <cmath>
+#include <functional>
+#include <limits>
+#include <string>
+#include <vector>
+
+#include "gtest/gtest.h"
+#include "tovrin/statistics/TOVRINStatistics.h"
+
+namespace tovrin {
+namespace {
+
+constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
+constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
+constexpr Extended kEps = std::numeric_limits<Extended>::epsilon();  // 2^-63
+
+using Ref2 = std::array<Extended, 2>;
+using Ref3 = std::array<Extended, 3>;
+using Ref4 = std::array<Extended, 4>;
+using Ref5 = std::array<Extended, 5>;
+using Ref6 = std::array<Extended, 6>;
+using Ref7 = std::array<Extended, 7>;
+#include "tovrin/statistics/TOVRINStatistics_Distributions_reference.inc"
+
+LongWord DF(Extended v) { return static_cast<LongWord>(v); }
+
+// Runs Call and expects EMathError with Ident.
+template <typename Call>
+void ExpectRaises(TResStringId Ident, Call call) {
+  try {
+    call();
+    ADD_FAILURE() << "no EMathError, expected " << ResStringName(Ident);
+  } catch (const EMathError& e) {
+    EXPECT_EQ(e.Ident(), Ident) << "raised " << ResStringName(e.Ident()) << ", expected "
+                                << ResStringName(Ident);
+  }
+}
+
+::testing::AssertionResult Near(Extended actual, Extended expected, Extended bound) {
+  const Extended error = std::fabs(actual - expected);
+  if (error <= bound) return ::testing::AssertionSuccess();
+  return ::testing::AssertionFailure()
+         << "actual " << static_cast<double>(actual) << " expected "
+         << static_cast<double>(expected) << " error " << static_cast<double>(error) << " bound "
+         << static_cast<double>(bound);
+}
+::testing::AssertionResult RelNear(Extended actual, Extended expected, Extended relative) {
+  return Near(actual, expected, relative * std::fabs(expected));
+}
+
+// === Standard normal ===========================================================================
+
+TEST(NormalTest, DensityAndSeriesAgainstReference) {
+  for (const auto& [z, phi, cdf] : kNormalRef) {
+    SCOPED_TRACE(static_cast<double>(z));
+    // exp(-z^2/2): the rounding of z^2/2 costs z^2/2 ulps.
+    EXPECT_TRUE(RelNear(NormalZ(z), phi, 4 * kEps * (1 + z * z)));
+    // The series stops once a round changes the result by less than 1e-18 and sums in
+    // Extended around 0.5, so its error is absolute, a few 1e-18 at most; deep in the lower
+    // tail that is large relative to the result (the method's own limit).
+    EXPECT_TRUE(Near(NormalLess(z), cdf, 5e-18L));
+    EXPECT_TRUE(Near(NormalGreater(z), 1 - cdf, 5e-18L));
+  }
+}
+
+TEST(NormalTest, SeriesEdges) {
+  EXPECT_EQ(NormalLess(0), 0.5L);
+  EXPECT_EQ(NormalLess(40), 1);
+  EXPECT_EQ(NormalLess(-40), 0);
+  EXPECT_EQ(NormalLess(kInf), 1);
+  EXPECT_EQ(NormalLess(-kInf), 0);
+  EXPECT_EQ(NormalLess(kNaN), 0);  // unordered density: treated like a negligible one
+  EXPECT_EQ(NormalGreater(40), 0);
+  // phi(z) < 1e-20 from about |z| = 9.6 on.
+  EXPECT_EQ(NormalLess(9.7L), 1);
+  EXPECT_GT(NormalLess(-9.5L), 0);
+}
+
+TEST(NormalTest, InverseAgainstReference) {
+  for (const auto& [p, x, density] : kInvNormalRef) {
+    SCOPED_TRACE(static_cast<double>(p));
+    // AS 241 is accurate to about 1 part in 1e16 (its rational approximations).
+    EXPECT_TRUE(Near(InvNormalLess(p), x, 1.2e-16L * std::fabs(x) + 4 * kEps * kEps));
+    if (p >= 1e-15L) {
+      // InvNormalGreater goes through 1 - p, whose rounding (half an ulp of 1) moves the
+      // result by that much over the density.
+      EXPECT_TRUE(Near(InvNormalGreater(1 - p), x, 1.2e-16L * std::fabs(x) + kEps / density));
+    }
+  }
+  EXPECT_EQ(InvNormalLess(0.5L), 0);
+  EXPECT_TRUE(RelNear(ZAlpha(0.025L), 1.95996398454005423552L, 2e-16L));
+}
+
+TEST(NormalTest, InverseRaisesOutsideOpenInterval) {
+  for (Extended p : {Extended(0), Extended(1), Extended(-0.5L), Extended(1.5L), kNaN, kInf}) {
+    ExpectRaises(rsValue01, [&] { InvNormalLess(p); });
+    ExpectRaises(rsValue01, [&] { InvNormalGreater(p); });
+    ExpectRaises(rsValue01, [&] { ZAlpha(p); });
+    ExpectRaises(rsValue01, [&] { InvNormalDistLess(0, 1, p); });
+    ExpectRaises(rsValue01, [&] { InvNormalDistGreater(0, 1, p); });
+  }
+  // P is checked before the standard deviation.
+  ExpectRaises(rsValue01, [] { InvNormalDistLess(0, -1, 2); });
+  ExpectRaises(rsStdDev, [] { InvNormalDistLess(0, -1, 0.5L); });
+  ExpectRaises(rsStdDev, [] { InvNormalDistGreater(0, 1e-13L, 0.5L); });
+}
+
+// === Normal with parameters ====================================================================
+
+TEST(NormalDistTest, ShiftedAndScaled) {
+  // X - Mean and the division by StdDev = 2 are exact, so the standard values apply.
+  for (const auto& [z, phi, cdf] : kNormalRef) {
+    if (std::fabs(z) > 8) continue;
+    const Extended x = 3 + 2 * z;
+    SCOPED_TRACE(static_cast<double>(x));
+    EXPECT_TRUE(RelNear(NormalPDF(3, 2, x), phi / 2, 4 * kEps * (2 + z * z)));
+    if (z >= 0) {
+      EXPECT_TRUE(Near(NormalDistLess(3, 2, x), cdf, 5e-18L));
+    } else {
+      // Mirrored: 1 - NormalLess(-z), an absolute error of the same size.
+      EXPECT_TRUE(Near(NormalDistLess(3, 2, x), cdf, 5e-18L));
+    }
+    EXPECT_TRUE(Near(NormalDistGreater(3, 2, x), 1 - cdf, 5e-18L));
+  }
+  EXPECT_TRUE(RelNear(InvNormalDistLess(3, 2, 0.975L), 3 + 2 * 1.95996398454005423552L, 2e-16L));
+  EXPECT_TRUE(RelNear(InvNormalDistGreater(3, 2, 0.025L), 3 + 2 * 1.95996398454005423552L, 2e-16L));
+}
+
+TEST(NormalDistTest, BetweenIgnoresOrder) {
+  const Extended expected = 0.682689492137085897170465091264075844955825933453L;
+  EXPECT_TRUE(Near(NormalDistBetween(0, 1, 1, -1), expected, 1e-17L));
+  EXPECT_TRUE(Near(NormalDistBetween(0, 1, -1, 1), expected, 1e-17L));
+  EXPECT_EQ(NormalDistBetween(0, 1, 2, 2 + 1e-13L), 0);  // the same within the tolerance
+}
+
+TEST(NormalDistTest, StdDevMustBePositive) {
+  for (Extended sd : {Extended(0), Extended(-1), Extended(1e-13L), kNaN}) {
+    ExpectRaises(rsStdDev, [&] { NormalPDF(0, sd, 1); });
+    ExpectRaises(rsStdDev, [&] { NormalDistLess(0, sd, 1); });
+    ExpectRaises(rsStdDev, [&] { NormalDistGreater(0, sd, 1); });
+    ExpectRaises(rsStdDev, [&] { NormalDistBetween(0, sd, 1, 2); });
+    ExpectRaises(rsStdDev, [&] { LogNormalPDF(0, sd, 1); });
+    ExpectRaises(rsStdDev, [&] { LogNormalLess(0, sd, 1); });
+    ExpectRaises(rsStdDev, [&] { LogNormalGreater(0, sd, 1); });
+    ExpectRaises(rsStdDev, [&] { LogNormalBetween(0, sd, 1, 2); });
+    ExpectRaises(rsStdDev, [&] { InvLogNormalLess(0, sd, 0.5L); });
+    ExpectRaises(rsStdDev, [&] { InvLogNormalGreater(0, sd, 0.5L); });
+  }
+}
+
+// === Log-normal ================================================================================
+
+TEST(LogNormalTest, AgainstReference) {
+  for (const auto& [mean, sd, x, density, cdf] : kLogNormalRef) {
+    SCOPED_TRACE(static_cast<double>(x));
+    EXPECT_TRUE(RelNear(LogNormalPDF(mean, sd, x), density, 1e-16L));
+    // ln x is rounded (half an ulp, carried through the density of ln X) on top of the series.
+    EXPECT_TRUE(Near(LogNormalLess(mean, sd, x), cdf, 1e-17L));
+    EXPECT_TRUE(Near(LogNormalGreater(mean, sd, x), 1 - cdf, 1e-17L));
+  }
+  EXPECT_TRUE(Near(LogNormalBetween(0, 1, 1, std::exp(1.0L)), 0.341344746068542948585L, 1e-17L));
+  EXPECT_EQ(LogNormalLess(0, 1, 0), 0);
+  EXPECT_EQ(LogNormalLess(0, 1, -3), 0);
+  // Round trip through the inverse.
+  for (Extended p : {1e-6L, 0.2L, 0.5L, 0.9L}) {
+    EXPECT_TRUE(
+        RelNear(InvLogNormalLess(1, 0.5L, p), std::exp(1 + 0.5L * InvNormalLess(p)), 4 * kEps));
+    EXPECT_TRUE(Near(LogNormalLess(1, 0.5L, InvLogNormalLess(1, 0.5L, p)), p, 1e-16L));
+    EXPECT_TRUE(Near(LogNormalGreater(1, 0.5L, InvLogNormalGreater(1, 0.5L, p)), p, 1e-16L));
+  }
+}
+
+TEST(LogNormalTest, Checks) {
+  ExpectRaises(rsValueGZero, [] { LogNormalPDF(0, 1, 0); });
+  ExpectRaises(rsValueGZero, [] { LogNormalPDF(0, 1, -1); });
+  ExpectRaises(rsValue01, [] { InvLogNormalLess(0, -1, 0); });
+  ExpectRaises(rsValue01, [] { InvLogNormalGreater(0, 1, 1); });
+}
+
+// === Incomplete gamma ==========================================================================
+
+TEST(IncompleteGammaTest, AgainstReference) {
+  for (const auto& [a, x, p] : kIncompleteGammaRef) {
+    SCOPED_TRACE(::testing::Message()
+                 << "a=" << static_cast<double>(a) << " x=" << static_cast<double>(x));
+    // Both the series and the continued fraction stop at QENTolerance = 5e-12. The series
+    // stops at a term <= 5e-12 of a sum >= 1, with a tail of at most term * x / (b + 1 - x);
+    // the fraction stops when a step is at most 5e-12 relative. Both leave errors of the
+    // order of 1e-11 relative (in P for the series, in 1 - P for the fraction), growing
+    // where x is near a large a (the tail ratio x / b approaches 1); the exponent
+    // a ln x - x - ln Gamma(a) adds its rounding, a few ulps of a ln x.
+    const Extended slack = a > 1000 ? 2e-9L : 4e-11L;
+    const Extended scale = std::fmin(p, 1 - p) + 16 * kEps * a * std::fabs(std::log(x));
+    EXPECT_TRUE(Near(IncompleteGamma(a, x), p, slack * scale + 4 * kEps));
+  }
+}
+
+TEST(IncompleteGammaTest, Edges) {
+  EXPECT_EQ(IncompleteGamma(2.5L, 0), 0);
+  EXPECT_EQ(IncompleteGamma(0.01L, 4e-12L), 0);  // zero within the tolerance
+  EXPECT_EQ(IncompleteGamma(2.5L, 2e8L), 1);
+  EXPECT_EQ(IncompleteGamma(1e9L, kInf), 1);
+  // Results below exp(-88) are flushed to 0.
+  EXPECT_EQ(IncompleteGamma(50, 1e-3L), 0);
+  EXPECT_GT(IncompleteGamma(10, 0.1L), 0);
+  EXPECT_TRUE(std::isnan(IncompleteGamma(kNaN, 2)));
+  EXPECT_TRUE(std::isnan(IncompleteGamma(2, kNaN)));
+  EXPECT_EQ(IncompleteGamma(kInf, 2), 0);
+  ExpectRaises(rsValueGEZero, [] { IncompleteGamma(1, -1); });
+  ExpectRaises(rsValueGEZero, [] { IncompleteGamma(-1, -1); });  // X is checked first
+  ExpectRaises(rsValueGZero, [] { IncompleteGamma(0, 1); });
+  ExpectRaises(rsValueGZero, [] { IncompleteGamma(-2, 1); });
+}
+
+TEST(IncompleteGammaTest, UpperUnregularised) {
+  for (const auto& [a, x, upper] : kIncompleteGamma2Ref) {
+    SCOPED_TRACE(static_cast<double>(a));
+    // 1 - P(a, x) keeps the 1e-11 of the incomplete gamma relative to the smaller tail.
+    EXPECT_TRUE(RelNear(IncompleteGamma2(a, x), upper, 1e-10L));
+  }
+  ExpectRaises(rsValueGEZero, [] { IncompleteGamma2(1, -1); });
+  ExpectRaises(rsValueGZero, [] { IncompleteGamma2(0, 1); });
+  ExpectRaises(rsDF, [] { IncompleteGamma2(0.2L, 1); });  // Round(0.4) = 0 degrees of freedom
+}
+
+// === Chi-square ================================================================================
+
+TEST(ChiSquareTest, AgainstReference) {
+  for (const auto& [x, df, p, density] : kChiSquareRef) {
+    SCOPED_TRACE(::testing::Message()
+                 << "x=" << static_cast<double>(x) << " df=" << static_cast<double>(df));
+    const Extended slack = df > 1000 ? 2e-9L : 4e-11L;  // as for the incomplete gamma
+    EXPECT_TRUE(Near(ChiSquareLess(x, DF(df)), p, slack * std::fmin(p, 1 - p) + 4 * kEps));
+    EXPECT_TRUE(Near(ChiSquareGreater(x, DF(df)), 1 - p, slack * std::fmin(p, 1 - p) + 4 * kEps));
+    // x^(df/2-1) e^(-x/2) / (2^(df/2) Gamma(df/2)): a few roundings, each growing with the
+    // size of the exponents.
+    EXPECT_TRUE(RelNear(ChiSquarePDF(x, DF(df)), density, 8 * kEps * (4 + x + df)));
+  }
+  EXPECT_TRUE(Near(ChiSquareBetween(2, 7.5L, 5), ChiSquareLess(7.5L, 5) - ChiSquareLess(2, 5), 0));
+  EXPECT_LT(ChiSquareBetween(7.5L, 2, 5), 0);  // no reordering
+  EXPECT_EQ(ChiSquarePDF(0, 2), 0.5L);
+  EXPECT_EQ(ChiSquarePDF(0, 1), kInf);
+  EXPECT_EQ(ChiSquareLess(0, 3), 0);
+}
+
+TEST(ChiSquareTest, Checks) {
+  ExpectRaises(rsDF, [] { ChiSquareLess(1, 0); });
+  ExpectRaises(rsDF, [] { ChiSquareGreater(1, 0); });
+  ExpectRaises(rsDF, [] { ChiSquareBetween(1, 2, 0); });
+  ExpectRaises(rsDF, [] { ChiSquarePDF(1, 0); });
+  ExpectRaises(rsDF, [] { InvChiSquareLess(0.5L, 0); });
+  ExpectRaises(rsDF, [] { InvChiSquareGreater(0.5L, 0); });
+  ExpectRaises(rsValueGEZero, [] { ChiSquareLess(-1, 3); });
+  ExpectRaises(rsValueGEZero, [] { ChiSquareLess(-1, 0); });  // X first
+  ExpectRaises(rsValueGEZero, [] { ChiSquarePDF(-1, 3); });
+  ExpectRaises(rsValueGEZero, [] { ChiSquareBetween(-1, 2, 3); });
+  // Outside AS 91's probability range there is no start and no bracket above zero.
+  for (Extended p : {0.0L, 1e-7L, 0.9999999L, 1.0L, -1.0L, 2.0L}) {
+    ExpectRaises(rsValueGEZero, [&] { InvChiSquareLess(p, 4); });
+  }
+  ExpectRaises(rsValueGEZero, [] { InvChiSquareLess(kNaN, 4); });
+}
+
+TEST(ChiSquareTest, InverseAgainstReference) {
+  for (const auto& [p, df, x, density] : kInvChiSquareRef) {
+    SCOPED_TRACE(::testing::Message()
+                 << "p=" << static_cast<double>(p) << " df=" << static_cast<double>(df));
+    // Bisection stops when ChiSquareLess is within 1e-16 of P; ChiSquareLess itself is good
+    // to about 4e-11 of the smaller tail (2e-9 for df > 1000). Either error in probability
+    // moves x by itself over the density, plus the last halving's rounding.
+    const Extended slack = df > 1000 ? 2e-9L : 4e-11L;
+    const Extended bound = (1e-16L + slack * std::fmin(p, 1 - p)) / density + 8 * kEps * x;
+    EXPECT_TRUE(Near(InvChiSquareLess(p, DF(df)), x, bound));
+    EXPECT_TRUE(Near(InvChiSquareGreater(1 - p, DF(df)), x, bound + kEps / density));
+  }
+}
+
+// === F =========================================================================================
+
+TEST(FDistTest, AgainstReference) {
+  for (const auto& [x, d1, d2, p, density] : kFDistRef) {
+    SCOPED_TRACE(::testing::Message() << "x=" << static_cast<double>(x) << " " << d1 << "," << d2);
+    // 1 - I_w(d2/2, d1/2) with w rounded: absolute error of a few ulps of 1 plus the
+    // incomplete beta's relative 1e-17.
+    EXPECT_TRUE(Near(FDistLess(x, DF(d1), DF(d2)), p,
+                     1e-17L * (1 + d1 + d2) * std::fmin(1, 8 * p) + 8 * kEps));
+    EXPECT_TRUE(Near(FDistGreater(x, DF(d1), DF(d2)), 1 - p, 1e-17L * (1 + d1 + d2) + 8 * kEps));
+    EXPECT_TRUE(RelNear(FDistPDF(x, DF(d1), DF(d2)), density, 1e-17L * (8 + d1 + d2)));
+  }
+  EXPECT_EQ(FDistLess(kInf, 3, 4), 1);
+  EXPECT_EQ(FDistPDF(0, 2, 5), 1);  // the density at 0 is 1 for two numerator degrees
+  EXPECT_EQ(FDistPDF(0, 5, 5), 0);
+  EXPECT_TRUE(Near(FDistBetween(1, 3.5L, 5, 10), FDistLess(3.5L, 5, 10) - FDistLess(1, 5, 10), 0));
+}
+
+TEST(FDistTest, InverseAgainstReference) {
+  for (const auto& [p, d1, d2, x, density] : kInvFDistRef) {
+    SCOPED_TRACE(::testing::Message() << "p=" << static_cast<double>(p) << " " << d1 << "," << d2);
+    // Ridders' search stops when FDistLess is within QENTolerance (5e-12) of P or the
+    // estimate moves by at most 1e-16: up to 5e-12 in probability, over the density.
+    const Extended bound = 5e-12L / density + 1e-16L + 8 * kEps * x;
+    EXPECT_TRUE(Near(InvFDistLess(p, DF(d1), DF(d2)), x, bound));
+    EXPECT_TRUE(Near(InvFDistGreater(1 - p, DF(d1), DF(d2)), x, bound));
+  }
+  EXPECT_EQ(InvFDistLess(1, 3, 4), 0);
+  EXPECT_EQ(InvFDistGreater(0, 3, 4), 0);
+  // A probability below FDistLess(1e-16) pushes the bracket below zero: FDistLess raises.
+  ExpectRaises(rsValueGZero, [] { InvFDistLess(0, 3, 4); });
+  ExpectRaises(rsValueGZero, [] { InvFDistLess(1e-9L, 1, 5); });
+  // A root far beyond what 99 expansions reach: no sign change.
+  ExpectRaises(rsInvalidValue, [] { InvFDistLess(1 - 1e-18L, 1, 1); });
+}
+
+TEST(FDistTest, Checks) {
+  ExpectRaises(rsValueGZero, [] { FDistLess(0, 3, 4); });
+  ExpectRaises(rsValueGZero, [] { FDistLess(-1, 3, 4); });
+  ExpectRaises(rsValueGZero, [] { FDistLess(kNaN, 3, 4); });
+  ExpectRaises(rsValueGZero, [] { FDistLess(0, 0, 4); });  // X first
+  ExpectRaises(rsValueGZero, [] { FDistGreater(0, 3, 4); });
+  ExpectRaises(rsValueGZero, [] { FDistBetween(0, 1, 3, 4); });
+  ExpectRaises(rsDF, [] { FDistLess(1, 0, 4); });
+  ExpectRaises(rsDF, [] { FDistLess(1, 3, 0); });
+  ExpectRaises(rsDF, [] { FDistPDF(1, 3, 0); });
+  ExpectRaises(rsValueGEZero, [] { FDistPDF(-1, 3, 4); });
+  ExpectRaises(rsDF, [] { InvFDistLess(0.5L, 0, 4); });
+  ExpectRaises(rsDF, [] { InvFDistGreater(0.5L, 3, 0); });
+  for (Extended p : {-0.1L, 1.1L, static_cast<Extended>(kNaN)}) {
+    ExpectRaises(rsValue01Inc, [&] { InvFDistLess(p, 3, 4); });
+    ExpectRaises(rsValue01Inc, [&] { InvFDistGreater(p, 3, 4); });
+  }
+  ExpectRaises(rsValue01Inc, [] { InvFDistLess(2, 0, 4); });  // P first
+}
+
+// === Student t =================================================================================
+
+TEST(StudentTTest, AgainstReference) {
+  for (const auto& [t, df, p, density] : kStudentTRef) {
+    SCOPED_TRACE(::testing::Message()
+                 << "t=" << static_cast<double>(t) << " df=" << static_cast<double>(df));
+    // Through the incomplete beta at x = df / (df + t^2) (rounded, which moves I by
+    // x I'(x) ulps, about df/2 for large df): relative in the tail below 0, absolute above.
+    const Extended bound = 4e-17L * (1 + df / 2) * std::fmin(p, 1 - p) + 4 * kEps;
+    EXPECT_TRUE(Near(StudentTLess(t, DF(df)), p, bound));
+    EXPECT_TRUE(Near(StudentTGreater(t, DF(df)), 1 - p, bound));
+    EXPECT_TRUE(RelNear(StudentTPDF(t, DF(df)), density, 16 * kEps * (4 + t * t)));
+  }
+  for (LongWord df : {1U, 2U, 3U, 10U, 1000U, 4000000000U}) EXPECT_EQ(StudentTLess(0, df), 0.5L);
+  EXPECT_EQ(StudentTLess(kInf, 3), 1);
+  EXPECT_EQ(StudentTLess(-kInf, 3), 0);
+  EXPECT_TRUE(std::isnan(StudentTLess(kNaN, 3)));
+  EXPECT_TRUE(Near(StudentTBetween(-2, 2, 1), 2 * std::atan(2.0L) / QENPi, 8 * kEps));
+}
+
+TEST(StudentTTest, InverseAgainstReference) {
+  for (const auto& [p, df, t, density] : kInvStudentTRef) {
+    SCOPED_TRACE(::testing::Message()
+                 << "p=" << static_cast<double>(p) << " df=" << static_cast<double>(df));
+    // Bisection to 1e-16 in probability, on top of StudentTLess's own error (as above),
+    // both divided by the density; the bracket comes from our Hill-type start.
+    const Extended lessError = 4e-17L * (1 + df / 2) * std::fmin(p, 1 - p) + 4 * kEps;
+    const Extended bound = (1e-16L + lessError) / density + 8 * kEps * std::fabs(t);
+    EXPECT_TRUE(Near(InvStudentTLess(p, DF(df)), t, bound));
+    EXPECT_TRUE(Near(InvStudentTGreater(1 - p, DF(df)), t, bound + kEps / density));
+  }
+  EXPECT_EQ(InvStudentTLess(0.5L, 7), 0);
+  EXPECT_EQ(InvStudentTLess(0, 7), -kInf);
+  EXPECT_EQ(InvStudentTLess(1, 7), kInf);
+}
+
+TEST(StudentTTest, StartIsInsideTheBracketEverywhere) {
+  // The bisection can only reach a root within 10 % of the start; a scan over degrees of
+  // freedom and probabilities shows the result always satisfies the 1e-16 stopping rule
+  // (allowing for StudentTLess's resolution near 1).
+  for (LongWord df : {1U, 2U, 3U, 4U, 5U, 6U, 9U, 15U, 40U, 300U, 5000U, 1000000U}) {
+    for (Extended p :
+         {1e-300L, 1e-30L, 1e-12L, 1e-5L, 0.01L, 0.1L, 0.3L, 0.49L, 0.51L, 0.8L, 0.975L, 0.9999L}) {
+      SCOPED_TRACE(::testing::Message() << "df=" << df << " p=" << static_cast<double>(p));
+      const Extended t = InvStudentTLess(p, df);
+      EXPECT_TRUE(Near(StudentTLess(t, df), p, 1e-16L + 64 * kEps * p));
+    }
+  }
+}
+
+TEST(StudentTTest, Checks) {
+  ExpectRaises(rsDF, [] { StudentTLess(1, 0); });
+  ExpectRaises(rsDF, [] { StudentTGreater(1, 0); });
+  ExpectRaises(rsDF, [] { StudentTBetween(1, 2, 0); });
+  ExpectRaises(rsDF, [] { StudentTPDF(1, 0); });
+  ExpectRaises(rsDF, [] { InvStudentTLess(0.5L, 0); });
+  ExpectRaises(rsDF, [] { InvStudentTGreater(0.5L, 0); });
+  for (Extended p : {-0.1L, 1.1L, static_cast<Extended>(kNaN)}) {
+    ExpectRaises(rsValue01Inc, [&] { InvStudentTLess(p, 3); });
+    ExpectRaises(rsValue01Inc, [&] { InvStudentTGreater(p, 3); });
+  }
+  ExpectRaises(rsValue01Inc, [] { InvStudentTLess(-1, 0); });  // P first
+}
+
+// === Exponential ===============================================================================
+
+TEST(ExponentialTest, AgainstReferenceWithReversedDensityArguments) {
+  for (const auto& [mean, x, p, density] : kExponentialRef) {
+    SCOPED_TRACE(static_cast<double>(x));
+    EXPECT_TRUE(Near(ExponentialLess(mean, x), p, 4 * kEps * (1 + x / mean)));
+    EXPECT_TRUE(Near(ExponentialGreater(mean, x), 1 - p, 4 * kEps * (1 + x / mean)));
+    EXPECT_TRUE(RelNear(ExponentialPDF(x, mean), density, 4 * kEps * (1 + x / mean)));
+  }
+  EXPECT_EQ(ExponentialPDF(0, 4), 0.25L);
+  EXPECT_TRUE(Near(ExponentialBetween(1, 1, 2), std::exp(-1.0L) - std::exp(-2.0L), 4 * kEps));
+  EXPECT_LT(ExponentialBetween(1, 2, 1), 0);
+}
+
+TEST(ExponentialTest, Checks) {
+  ExpectRaises(rsExpDistInvalid, [] { ExponentialLess(0, 1); });
+  ExpectRaises(rsExpDistInvalid, [] { ExponentialLess(-1, 1); });
+  ExpectRaises(rsExpDistInvalid, [] { ExponentialLess(1, -1); });
+  ExpectRaises(rsExpDistInvalid, [] { ExponentialGreater(1, -1); });
+  ExpectRaises(rsExpDistInvalid, [] { ExponentialBetween(1, -1, 2); });
+  ExpectRaises(rsExpDistInvalid, [] { ExponentialPDF(1, 0); });
+  ExpectRaises(rsExpDistInvalid, [] { ExponentialPDF(-1, 1); });
+  ExpectRaises(rsExpDistInvalid, [] { ExponentialPDF(1, kNaN); });
+  // The order matters: ExponentialPDF(Mean = 2, X = -1) would be valid the other way round.
+  ExpectRaises(rsExpDistInvalid, [] { ExponentialPDF(2, -1); });
+  EXPECT_NO_THROW(ExponentialLess(2, 1));
+}
+
+// === Beta ======================================================================================
+
+TEST(BetaTest, AgainstReference) {
+  for (const auto& [x, a, b, p, density] : kBetaRef) {
+    SCOPED_TRACE(::testing::Message() << "x=" << static_cast<double>(x) << " a="
+                                      << static_cast<double>(a) << " b=" << static_cast<double>(b));
+    EXPECT_TRUE(RelNear(BetaDistLess(x, a, b), p, 1e-16L));
+    EXPECT_TRUE(Near(BetaDistGreater(x, a, b), 1 - p, 1e-16L * p + 4 * kEps));
+    // The power factors lose (a + b) ulps of their arguments' rounding.
+    EXPECT_TRUE(RelNear(BetaPDF(x, a, b), density, 8 * kEps * (4 + a + b)));
+    // The same through an interval, given with its bounds in reverse order: x maps from
+    // -2 + 4x in [-2, 2], exactly.
+    const Extended y = -2 + 4 * x;
+    EXPECT_TRUE(RelNear(BetaDistLess(y, a, b, 2, -2), p, 1e-16L));
+    EXPECT_TRUE(RelNear(BetaPDF(y, a, b, -2, 2), density / 4, 8 * kEps * (4 + a + b)));
+  }
+  EXPECT_EQ(BetaDistLess(-0.5L, 2, 3), 0);
+  EXPECT_EQ(BetaDistLess(1.5L, 2, 3), 1);
+  EXPECT_EQ(BetaPDF(1.5L, 2, 3), 0);
+  EXPECT_EQ(BetaPDF(-0.5L, 2, 3), 0);
+  EXPECT_TRUE(Near(BetaDistBetween(0.2L, 0.7L, 2, 3),
+                   BetaDistLess(0.7L, 2, 3) - BetaDistLess(0.2L, 2, 3), 0));
+  EXPECT_LT(BetaDistBetween(0.7L, 0.2L, 2, 3), 0);
+  EXPECT_TRUE(Near(BetaDistBetween(10.5L, 11, 1, 1, 10, 12), 0.25L, 4 * kEps));
+  EXPECT_TRUE(Near(BetaDistGreater(11.5L, 1, 1, 10, 12), 0.25L, 4 * kEps));
+}
+
+TEST(BetaTest, InverseAgainstReference) {
+  for (const auto& [p, a, b, x] : kInvBetaRef) {
+    SCOPED_TRACE(static_cast<double>(p));
+    EXPECT_TRUE(RelNear(InvBetaDistLess(p, a, b), x, 1e-15L));
+    EXPECT_TRUE(RelNear(InvBetaDistGreater(1 - p, a, b), x, 1e-15L));
+    EXPECT_TRUE(RelNear(InvBetaDistLess(p, a, b, 3, 1), 1 + 2 * x, 1e-15L));
+    EXPECT_TRUE(RelNear(InvBetaDistGreater(1 - p, a, b, 1, 3), 1 + 2 * x, 1e-15L));
+  }
+  EXPECT_EQ(InvBetaDistLess(0, 2, 3), 0);
+  EXPECT_EQ(InvBetaDistLess(1, 2, 3), 1);
+  EXPECT_EQ(InvBetaDistLess(0, 2, 3, 5, 7), 5);
+  EXPECT_EQ(InvBetaDistLess(1, 2, 3, 7, 5), 7);
+}
+
+TEST(BetaTest, Checks) {
+  for (Extended bad : {Extended(0), Extended(-1), kNaN}) {
+    ExpectRaises(rsValueGZero, [&] { BetaDistLess(0.5L, bad, 1); });
+    ExpectRaises(rsValueGZero, [&] { BetaDistGreater(0.5L, 1, bad); });
+    ExpectRaises(rsValueGZero, [&] { BetaDistBetween(0.1L, 0.5L, bad, 1); });
+    ExpectRaises(rsValueGZero, [&] { InvBetaDistLess(0.5L, 1, bad); });
+    ExpectRaises(rsValueGZero, [&] { InvBetaDistGreater(0.5L, bad, 1); });
+    ExpectRaises(rsValueGZero, [&] { BetaPDF(0.5L, bad, 1); });
+    ExpectRaises(rsValueGZero, [&] { BetaDistLess(0.5L, bad, 1, 0, 2); });
+    ExpectRaises(rsValueGZero, [&] { BetaPDF(0.5L, 1, bad, 0, 2); });
+    ExpectRaises(rsValueGZero, [&] { InvBetaDistLess(0.5L, 1, bad, 0, 2); });
+  }
+  for (Extended p : {-0.1L, 1.1L, static_cast<Extended>(kNaN)}) {
+    ExpectRaises(rsValue01Inc, [&] { InvBetaDistLess(p, 2, 3); });
+    ExpectRaises(rsValue01Inc, [&] { InvBetaDistGreater(p, 2, 3); });
+    ExpectRaises(rsValue01Inc, [&] { InvBetaDistLess(p, 2, 3, 0, 1); });
+  }
+  ExpectRaises(rsValue01Inc, [] { InvBetaDistLess(2, -1, 3); });  // P before the shapes
+  // Equal bounds raise rsSameValue before anything else.
+  ExpectRaises(rsSameValue, [] { BetaDistLess(0.5L, -1, 3, 2, 2); });
+  ExpectRaises(rsSameValue, [] { BetaDistGreater(0.5L, 2, 3, 2, 2); });
+  ExpectRaises(rsSameValue, [] { BetaDistBetween(0.5L, 1, 2, 3, 2, 2); });
+  ExpectRaises(rsSameValue, [] { InvBetaDistLess(2, 2, 3, 2, 2); });
+  ExpectRaises(rsSameValue, [] { InvBetaDistGreater(0.5L, 2, 3, 2, 2); });
+  ExpectRaises(rsSameValue, [] { BetaPDF(0.5L, 2, 3, 2, 2); });
+}
+
+// === Density tables ============================================================================
+
+// One table function with its density, for the shared tests below.
+struct TableCase {
+  std::string name;
+  std::function<void(Extended, Extended, LongWord, TQENFloatVector&, TQENFloatVector&)> table;
+  std::function<Extended(Extended)> density;
+  bool zeroBelowZero;
+  std::function<void(TQENFloatVector&, TQENFloatVector&)> failing;
+  TResStringId failure;
+  Extended offset = 0;  // the table's points are the requested ones plus this
+};
+
+std::vector<TableCase> TableCases() {
+  using V = TQENFloatVector;
+  return {
+      {"Normal",
+       [](Extended lo, Extended hi, LongWord n, V& x, V& y) {
+         NormalPDFValues(1, 2, lo, hi, n, x, y);
+       },
+       [](Extended x) { return NormalPDF(1, 2, x); }, false,
+       [](V& x, V& y) { NormalPDFValues(1, 0, 0, 1, 4, x, y); }, rsStdDev},
+      {"LogNormal",
+       [](Extended lo, Extended hi, LongWord n, V& x, V& y) {
+         LogNormalPDFValues(0, 1, lo + 4, hi + 4, n, x, y);
+       },
+       [](Extended x) { return LogNormalPDF(0, 1, x); }, false,
+       [](V& x, V& y) { LogNormalPDFValues(0, 1, 0, 2, 4, x, y); }, rsValueGZero, 4},
+      {"ChiSquare",
+       [](Extended lo, Extended hi, LongWord n, V& x, V& y) {
+         ChiSquarePDFValues(3, lo, hi, n, x, y);
+       },
+       [](Extended x) { return ChiSquarePDF(x, 3); }, true,
+       [](V& x, V& y) { ChiSquarePDFValues(0, 0, 1, 4, x, y); }, rsDF},
+      {"F",
+       [](Extended lo, Extended hi, LongWord n, V& x, V& y) {
+         FDistPDFValues(3, 7, lo, hi, n, x, y);
+       },
+       [](Extended x) { return FDistPDF(x, 3, 7); }, true,
+       [](V& x, V& y) { FDistPDFValues(3, 0, 0, 1, 4, x, y); }, rsDF},
+      {"StudentT",
+       [](Extended lo, Extended hi, LongWord n, V& x, V& y) {
+         StudentTPDFValues(5, lo, hi, n, x, y);
+       },
+       [](Extended x) { return StudentTPDF(x, 5); }, false,
+       [](V& x, V& y) { StudentTPDFValues(0, 0, 1, 4, x, y); }, rsDF},
+      {"Exponential",
+       [](Extended lo, Extended hi, LongWord n, V& x, V& y) {
+         ExponentialPDFValues(2, lo, hi, n, x, y);
+       },
+       [](Extended x) { return ExponentialPDF(x, 2); }, true,
+       [](V& x, V& y) { ExponentialPDFValues(-2, 0, 1, 4, x, y); }, rsExpDistInvalid},
+      {"Beta",
+       [](Extended lo, Extended hi, LongWord n, V& x, V& y) {
+         BetaPDFValues(2, 3, lo, hi, n, x, y);
+       },
+       [](Extended x) { return BetaPDF(x, 2, 3); }, false,
+       [](V& x, V& y) { BetaPDFValues(0, 3, 0, 1, 4, x, y); }, rsValueGZero},
+      {"BetaInterval",
+       [](Extended lo, Extended hi, LongWord n, V& x, V& y) {
+         BetaPDFValues(2, 3, 4, -1, lo, hi, n, x, y);
+       },
+       [](Extended x) { return BetaPDF(x, 2, 3, -1, 4); }, false,
+       [](V& x, V& y) { BetaPDFValues(2, 3, 1, 1, 0, 1, 4, x, y); }, rsSameValue},
+  };
+}
+
+TEST(PDFValuesTest, PointsAndDensities) {
+  for (const TableCase& c : TableCases()) {
+    SCOPED_TRACE(c.name);
+    TQENFloatVector xs{1, 2, 3}, ys{4};
+    c.table(-1, 1, 4, xs, ys);
+    ASSERT_EQ(xs.size(), 5U);
+    ASSERT_EQ(ys.size(), 5U);
+    for (std::size_t i = 0; i < 5; ++i) {
+      const Extended x = c.offset - 1 + 0.5L * static_cast<Extended>(i);  // exact
+      EXPECT_EQ(Extended(xs[i]), x);
+      if (c.zeroBelowZero && x < 0) {
+        EXPECT_EQ(Extended(ys[i]), 0);
+      } else {
+        EXPECT_EQ(Extended(ys[i]), c.density(x));
+      }
+    }
+  }
+}
+
+TEST(PDFValuesTest, ZeroPointsGiveOnePointAtXLow) {
+  for (const TableCase& c : TableCases()) {
+    SCOPED_TRACE(c.name);
+    TQENFloatVector xs, ys;
+    c.table(0.25L, 0.75L, 0, xs, ys);
+    ASSERT_EQ(xs.size(), 1U);
+    ASSERT_EQ(ys.size(), 1U);
+    EXPECT_EQ(Extended(xs[0]), c.offset + 0.25L);
+    EXPECT_EQ(Extended(ys[0]), c.density(c.offset + 0.25L));
+  }
+}
+
+TEST(PDFValuesTest, FailedChecksLeaveBothOutputsEmpty) {
+  for (const TableCase& c : TableCases()) {
+    SCOPED_TRACE(c.name);
+    TQENFloatVector xs{1, 2, 3}, ys{4, 5};
+    ExpectRaises(c.failure, [&] { c.failing(xs, ys); });
+    EXPECT_TRUE(xs.empty());
+    EXPECT_TRUE(ys.empty());
+  }
+}
+
+TEST(PDFValuesTest, DescendingRange) {
+  TQENFloatVector xs, ys;
+  ChiSquarePDFValues(2, 2, -2, 2, xs, ys);
+  ASSERT_EQ(xs.size(), 3U);
+  EXPECT_EQ(Extended(xs[0]), 2);
+  EXPECT_EQ(Extended(xs[1]), 0);
+  EXPECT_EQ(Extended(xs[2]), -2);
+  EXPECT_EQ(Extended(ys[1]), 0.5L);
+  EXPECT_EQ(Extended(ys[2]), 0);
+}
+
+}  // namespace
+}  // namespace tovrin
