@@ -117,8 +117,8 @@ void ReportErrors(const char* name, const char* who, F call) {
     if (err > worst) worst = err;
     if (row.tolerance < 1e-16L && err > worst_ordinary) worst_ordinary = err;
   }
-  std::printf("| %s | %s | %zu | %.2Le | %.2Le |\n", name, who, Ops::Table().size(),
-              worst_ordinary, worst);
+  std::printf("| %s | %s | %zu | %.2Le | %.2Le |\n", name, who, Ops::Table().size(), worst_ordinary,
+              worst);
 }
 
 template <typename Ops>
@@ -127,9 +127,9 @@ void BM_Ours(benchmark::State& state) {
   for (auto _ : state) {
     for (const auto& row : table) benchmark::DoNotOptimize(Ops::Ours(row));
   }
-  state.counters["ns_per_call"] = benchmark::Counter(
-      static_cast<double>(state.iterations() * table.size()),
-      benchmark::Counter::kIsRate | benchmark::Counter::kInvert);
+  state.counters["ns_per_call"] =
+      benchmark::Counter(static_cast<double>(state.iterations() * table.size()),
+                         benchmark::Counter::kIsRate | benchmark::Counter::kInvert);
   state.counters["ns_per_call"] = state.counters["ns_per_call"] * 1e9;
 }
 
@@ -140,15 +140,15 @@ void BM_Boost(benchmark::State& state) {
   for (auto _ : state) {
     for (const auto& row : table) benchmark::DoNotOptimize(Ops::Boost(row));
   }
-  state.counters["ns_per_call"] = benchmark::Counter(
-      static_cast<double>(state.iterations() * table.size()),
-      benchmark::Counter::kIsRate | benchmark::Counter::kInvert);
+  state.counters["ns_per_call"] =
+      benchmark::Counter(static_cast<double>(state.iterations() * table.size()),
+                         benchmark::Counter::kIsRate | benchmark::Counter::kInvert);
   state.counters["ns_per_call"] = state.counters["ns_per_call"] * 1e9;
 }
 #endif
 
 #ifdef TOVRIN_HAVE_BOOST
-#define TOVRIN_SPECIAL_BENCH(Ops)   \
+#define TOVRIN_SPECIAL_BENCH(Ops)                \
   BENCHMARK(BM_Ours<Ops>)->Name("tovrin/" #Ops); \
   BENCHMARK(BM_Boost<Ops>)->Name("boost/" #Ops);
 #else

@@ -60,8 +60,8 @@ bool IsNegativeNumber(std::string_view Word);
 Extended ParseRealArgument(std::string_view Text, std::string_view What);
 std::uint64_t ParseUnsignedArgument(std::string_view Text, std::string_view What,
                                     std::uint64_t Max);
-std::int64_t ParseSignedArgument(std::string_view Text, std::string_view What,
-                                 std::int64_t Min, std::int64_t Max);
+std::int64_t ParseSignedArgument(std::string_view Text, std::string_view What, std::int64_t Min,
+                                 std::int64_t Max);
 // The --decimals option: 0 to 20, 4 when absent.
 Byte ParseDecimals(const Arguments& Args);
 

@@ -54,8 +54,7 @@ void AddFoundation(CallableTable& t) {
   AddScalar<E>(t, "CubeRoot", {"X"}, TOVRIN_CALLABLE(CubeRoot));
   AddScalar<E>(t, "QENArcCos", {"X"}, TOVRIN_CALLABLE(QENArcCos));
   AddScalar<E>(t, "QENTan", {"X"}, TOVRIN_CALLABLE(QENTan));
-  AddScalar<E, E, E, E>(t, "QENDistance", {"X1", "Y1", "X2", "Y2"},
-                        TOVRIN_CALLABLE(QENDistance));
+  AddScalar<E, E, E, E>(t, "QENDistance", {"X1", "Y1", "X2", "Y2"}, TOVRIN_CALLABLE(QENDistance));
   AddScalar<E>(t, "Gamma", {"X"}, TOVRIN_CALLABLE(Gamma));
   AddScalar<E>(t, "LnGamma", {"X"}, TOVRIN_CALLABLE(LnGamma));
   AddScalar<E, E>(t, "Beta", {"A", "B"}, TOVRIN_CALLABLE(Beta));
@@ -76,8 +75,7 @@ void AddContinuous(CallableTable& t) {
   AddScalar<E>(t, "InvNormalGreater", {"P"}, TOVRIN_CALLABLE(InvNormalGreater));
   AddScalar<E>(t, "ZAlpha", {"Alpha"}, TOVRIN_CALLABLE(ZAlpha));
   AddScalar<E, E, E>(t, "NormalPDF", {"Mean", "StdDev", "X"}, TOVRIN_CALLABLE(NormalPDF));
-  AddScalar<E, E, E>(t, "NormalDistLess", {"Mean", "StdDev", "X"},
-                     TOVRIN_CALLABLE(NormalDistLess));
+  AddScalar<E, E, E>(t, "NormalDistLess", {"Mean", "StdDev", "X"}, TOVRIN_CALLABLE(NormalDistLess));
   AddScalar<E, E, E>(t, "NormalDistGreater", {"Mean", "StdDev", "X"},
                      TOVRIN_CALLABLE(NormalDistGreater));
   AddScalar<E, E, E, E>(t, "NormalDistBetween", {"Mean", "StdDev", "X1", "X2"},
@@ -87,8 +85,7 @@ void AddContinuous(CallableTable& t) {
   AddScalar<E, E, E>(t, "InvNormalDistGreater", {"Mean", "StdDev", "P"},
                      TOVRIN_CALLABLE(InvNormalDistGreater));
   AddScalar<E, E, E>(t, "LogNormalPDF", {"Mean", "StdDev", "X"}, TOVRIN_CALLABLE(LogNormalPDF));
-  AddScalar<E, E, E>(t, "LogNormalLess", {"Mean", "StdDev", "X"},
-                     TOVRIN_CALLABLE(LogNormalLess));
+  AddScalar<E, E, E>(t, "LogNormalLess", {"Mean", "StdDev", "X"}, TOVRIN_CALLABLE(LogNormalLess));
   AddScalar<E, E, E>(t, "LogNormalGreater", {"Mean", "StdDev", "X"},
                      TOVRIN_CALLABLE(LogNormalGreater));
   AddScalar<E, E, E, E>(t, "LogNormalBetween", {"Mean", "StdDev", "X1", "X2"},
@@ -101,8 +98,7 @@ void AddContinuous(CallableTable& t) {
   AddScalar<E, E>(t, "IncompleteGamma2", {"A", "X"}, TOVRIN_CALLABLE(IncompleteGamma2));
   AddScalar<E, U>(t, "ChiSquareLess", {"X", "DF"}, TOVRIN_CALLABLE(ChiSquareLess));
   AddScalar<E, U>(t, "ChiSquareGreater", {"X", "DF"}, TOVRIN_CALLABLE(ChiSquareGreater));
-  AddScalar<E, E, U>(t, "ChiSquareBetween", {"X1", "X2", "DF"},
-                     TOVRIN_CALLABLE(ChiSquareBetween));
+  AddScalar<E, E, U>(t, "ChiSquareBetween", {"X1", "X2", "DF"}, TOVRIN_CALLABLE(ChiSquareBetween));
   AddScalar<E, U>(t, "InvChiSquareLess", {"P", "DF"}, TOVRIN_CALLABLE(InvChiSquareLess));
   AddScalar<E, U>(t, "InvChiSquareGreater", {"P", "DF"}, TOVRIN_CALLABLE(InvChiSquareGreater));
   AddScalar<E, U>(t, "ChiSquarePDF", {"X", "DF"}, TOVRIN_CALLABLE(ChiSquarePDF));
@@ -111,8 +107,7 @@ void AddContinuous(CallableTable& t) {
   AddScalar<E, E, U, U>(t, "FDistBetween", {"X1", "X2", "DF1", "DF2"},
                         TOVRIN_CALLABLE(FDistBetween));
   AddScalar<E, U, U>(t, "InvFDistLess", {"P", "DF1", "DF2"}, TOVRIN_CALLABLE(InvFDistLess));
-  AddScalar<E, U, U>(t, "InvFDistGreater", {"P", "DF1", "DF2"},
-                     TOVRIN_CALLABLE(InvFDistGreater));
+  AddScalar<E, U, U>(t, "InvFDistGreater", {"P", "DF1", "DF2"}, TOVRIN_CALLABLE(InvFDistGreater));
   AddScalar<E, U, U>(t, "FDistPDF", {"X", "DF1", "DF2"}, TOVRIN_CALLABLE(FDistPDF));
   AddScalar<E, U>(t, "StudentTLess", {"T", "DF"}, TOVRIN_CALLABLE(StudentTLess));
   AddScalar<E, U>(t, "StudentTGreater", {"T", "DF"}, TOVRIN_CALLABLE(StudentTGreater));
@@ -138,8 +133,7 @@ void AddContinuous(CallableTable& t) {
   AddScalar<E, E, E>(t, "InvBetaDistLess", {"P", "A", "B"}, TOVRIN_CALLABLE(InvBetaDistLess));
   AddScalar<E, E, E, E, E>(t, "InvBetaDistLess", {"P", "A", "B", "Lower", "Upper"},
                            TOVRIN_CALLABLE(InvBetaDistLess));
-  AddScalar<E, E, E>(t, "InvBetaDistGreater", {"P", "A", "B"},
-                     TOVRIN_CALLABLE(InvBetaDistGreater));
+  AddScalar<E, E, E>(t, "InvBetaDistGreater", {"P", "A", "B"}, TOVRIN_CALLABLE(InvBetaDistGreater));
   AddScalar<E, E, E, E, E>(t, "InvBetaDistGreater", {"P", "A", "B", "Lower", "Upper"},
                            TOVRIN_CALLABLE(InvBetaDistGreater));
   AddScalar<E, E, E>(t, "BetaPDF", {"X", "A", "B"}, TOVRIN_CALLABLE(BetaPDF));
@@ -174,8 +168,7 @@ void AddGeometry(CallableTable& t) {
   AddScalar<E, E, E>(t, "AreaTriangle", {"A", "B", "C"}, TOVRIN_CALLABLE(AreaTriangle));
   AddScalar<E>(t, "AreaSquare", {"Side"}, TOVRIN_CALLABLE(AreaSquare));
   AddScalar<E, E>(t, "AreaRectangle", {"Length", "Width"}, TOVRIN_CALLABLE(AreaRectangle));
-  AddScalar<E, E>(t, "AreaParallelogram", {"Base", "Height"},
-                  TOVRIN_CALLABLE(AreaParallelogram));
+  AddScalar<E, E>(t, "AreaParallelogram", {"Base", "Height"}, TOVRIN_CALLABLE(AreaParallelogram));
   AddScalar<E, E>(t, "AreaRhombus", {"D1", "D2"}, TOVRIN_CALLABLE(AreaRhombus));
   AddScalar<E, E, E>(t, "AreaTrapezium", {"A", "B", "Height"}, TOVRIN_CALLABLE(AreaTrapezium));
   AddScalar<E>(t, "AreaCircle", {"R"}, TOVRIN_CALLABLE(AreaCircle));
@@ -190,14 +183,12 @@ void AddGeometry(CallableTable& t) {
   AddScalar<E>(t, "AreaOctagon", {"Side"}, TOVRIN_CALLABLE(AreaOctagon));
   AddScalar<E>(t, "AreaNonagon", {"Side"}, TOVRIN_CALLABLE(AreaNonagon));
   AddScalar<E>(t, "AreaDecagon", {"Side"}, TOVRIN_CALLABLE(AreaDecagon));
-  AddScalar<E, E, E>(t, "PerimeterTriangle", {"A", "B", "C"},
-                     TOVRIN_CALLABLE(PerimeterTriangle));
+  AddScalar<E, E, E>(t, "PerimeterTriangle", {"A", "B", "C"}, TOVRIN_CALLABLE(PerimeterTriangle));
   AddScalar<E>(t, "PerimeterSquare", {"Side"}, TOVRIN_CALLABLE(PerimeterSquare));
   AddScalar<E, E>(t, "PerimeterRectangle", {"Length", "Width"},
                   TOVRIN_CALLABLE(PerimeterRectangle));
   AddScalar<E>(t, "CircumferenceCircle", {"R"}, TOVRIN_CALLABLE(CircumferenceCircle));
-  AddScalar<E>(t, "CircumferenceCircle2Radius", {"C"},
-               TOVRIN_CALLABLE(CircumferenceCircle2Radius));
+  AddScalar<E>(t, "CircumferenceCircle2Radius", {"C"}, TOVRIN_CALLABLE(CircumferenceCircle2Radius));
   AddScalar<E>(t, "CircumferenceSemiCircle", {"R"}, TOVRIN_CALLABLE(CircumferenceSemiCircle));
   AddScalar<E>(t, "CircumferenceSemiCircle2Radius", {"C"},
                TOVRIN_CALLABLE(CircumferenceSemiCircle2Radius));
@@ -233,15 +224,12 @@ void AddGeometry(CallableTable& t) {
                TOVRIN_CALLABLE(SurfaceAreaHemiSphere2Radius));
   AddScalar<E, E>(t, "SurfaceAreaRectangularPrism", {"Side", "Length"},
                   TOVRIN_CALLABLE(SurfaceAreaRectangularPrism));
-  AddScalar<E, E>(t, "SurfaceAreaCylinder", {"R", "Height"},
-                  TOVRIN_CALLABLE(SurfaceAreaCylinder));
-  AddScalar<E, E>(t, "SurfaceAreaPyramid", {"Side", "Height"},
-                  TOVRIN_CALLABLE(SurfaceAreaPyramid));
+  AddScalar<E, E>(t, "SurfaceAreaCylinder", {"R", "Height"}, TOVRIN_CALLABLE(SurfaceAreaCylinder));
+  AddScalar<E, E>(t, "SurfaceAreaPyramid", {"Side", "Height"}, TOVRIN_CALLABLE(SurfaceAreaPyramid));
   AddScalar<E, E>(t, "SurfaceAreaCone", {"R", "Slant"}, TOVRIN_CALLABLE(SurfaceAreaCone));
   AddScalar<E>(t, "SurfaceAreaTetrahedron", {"Edge"}, TOVRIN_CALLABLE(SurfaceAreaTetrahedron));
   AddScalar<E>(t, "SurfaceAreaOctahedron", {"Edge"}, TOVRIN_CALLABLE(SurfaceAreaOctahedron));
-  AddScalar<E>(t, "SurfaceAreaDodecahedron", {"Edge"},
-               TOVRIN_CALLABLE(SurfaceAreaDodecahedron));
+  AddScalar<E>(t, "SurfaceAreaDodecahedron", {"Edge"}, TOVRIN_CALLABLE(SurfaceAreaDodecahedron));
   AddScalar<E>(t, "SurfaceAreaIcosahedron", {"Edge"}, TOVRIN_CALLABLE(SurfaceAreaIcosahedron));
   AddScalar<E, E, E>(t, "TriangleThirdSide", {"A", "B", "Angle"},
                      TOVRIN_CALLABLE(TriangleThirdSide));

@@ -50,8 +50,8 @@ int RunGrouped(std::span<const std::string> Words) {
   if (args.Operands().empty()) throw UsageError("grouped needs the class frequencies FREQ...");
   TQENLWordVector freqs;
   for (const std::string& word : args.Operands()) {
-    freqs.push_back(static_cast<LongWord>(ParseUnsignedArgument(
-        word, "a frequency", std::numeric_limits<LongWord>::max())));
+    freqs.push_back(static_cast<LongWord>(
+        ParseUnsignedArgument(word, "a frequency", std::numeric_limits<LongWord>::max())));
   }
 
   // Everything is computed before anything is printed, so an error leaves no half report.

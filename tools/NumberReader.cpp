@@ -55,8 +55,10 @@ std::optional<Extended> ParseNumber(std::string_view Token) {
   std::size_t digits = 0;
   for (; p != end && IsDigit(*p); ++p, ++digits) {
     if (mantissa != 0 || *p != '0') {
-      if (significant < 19) mantissa = mantissa * 10 + static_cast<unsigned>(*p - '0');
-      else ++exponent;
+      if (significant < 19)
+        mantissa = mantissa * 10 + static_cast<unsigned>(*p - '0');
+      else
+        ++exponent;
       ++significant;
     }
   }
@@ -188,8 +190,8 @@ void ScanTokens(const std::string& Source,
 namespace {
 
 [[noreturn]] void NotANumber(const std::string& Source, std::size_t Line, std::string_view Token) {
-  throw InputError(SourceName(Source) + ":" + std::to_string(Line) + ": not a number: " +
-                   Quoted(Token));
+  throw InputError(SourceName(Source) + ":" + std::to_string(Line) +
+                   ": not a number: " + Quoted(Token));
 }
 
 // Values gathered in fixed blocks, so that collecting n values never holds more than n plus
@@ -203,7 +205,9 @@ class BlockList {
     }
     blocks_.back()[used_++] = X;
   }
-  std::size_t Size() const { return blocks_.empty() ? 0 : (blocks_.size() - 1) * kBlockValues + used_; }
+  std::size_t Size() const {
+    return blocks_.empty() ? 0 : (blocks_.size() - 1) * kBlockValues + used_;
+  }
   TQENFloatVector Release() {
     TQENFloatVector result(Size());
     std::size_t at = 0;

@@ -47,8 +47,8 @@ std::size_t MVNormDimension(std::size_t Count) {
 
 void AddMVNorm(CallableTable& t) {
   auto generate = [](auto& means, auto& covariance, auto& factor, auto& variate,
-                     auto& error_code) -> decltype(Random_MVNorm(means, covariance, factor,
-                                                                 variate, error_code)) {
+                     auto& error_code) -> decltype(Random_MVNorm(means, covariance, factor, variate,
+                                                                 error_code)) {
     return Random_MVNorm(means, covariance, factor, variate, error_code);
   };
   using V = TQENFloatVector;
@@ -92,8 +92,7 @@ const CallableTable& RandomTable() {
     AddScalar<>(t, "VerdanRandom", {}, TOVRIN_CALLABLE(VerdanRandom));
     AddScalar<>(t, "Random_Normal", {}, TOVRIN_CALLABLE(Random_Normal));
     AddScalar<E, E>(t, "Random_Normal", {"Mean", "StdDev"}, TOVRIN_CALLABLE(Random_Normal));
-    AddScalar<E, E>(t, "Random_LogNormal", {"Mean", "StdDev"},
-                    TOVRIN_CALLABLE(Random_LogNormal));
+    AddScalar<E, E>(t, "Random_LogNormal", {"Mean", "StdDev"}, TOVRIN_CALLABLE(Random_LogNormal));
     AddScalar<E>(t, "Random_Gamma", {"Shape"}, TOVRIN_CALLABLE(Random_Gamma));
     AddScalar<LongInt>(t, "Random_ChiSq", {"DF"}, TOVRIN_CALLABLE(Random_ChiSq));
     AddScalar<>(t, "Random_Exponential", {}, TOVRIN_CALLABLE(Random_Exponential));
@@ -101,8 +100,7 @@ const CallableTable& RandomTable() {
     AddScalar<E, E>(t, "Random_Beta", {"A", "B"}, TOVRIN_CALLABLE(Random_Beta));
     AddScalar<LongInt>(t, "Random_T", {"DF"}, TOVRIN_CALLABLE(Random_T));
     AddMVNorm(t);
-    AddScalar<E, E>(t, "Random_Inv_Gauss", {"Lambda", "Omega"},
-                    TOVRIN_CALLABLE(Random_Inv_Gauss));
+    AddScalar<E, E>(t, "Random_Inv_Gauss", {"Lambda", "Omega"}, TOVRIN_CALLABLE(Random_Inv_Gauss));
     AddScalar<LongInt, E>(t, "Random_Binomial1", {"N", "P"}, TOVRIN_CALLABLE(Random_Binomial1));
     AddScalar<Int64, E>(t, "Random_Binomial2", {"N", "P"}, TOVRIN_CALLABLE(Random_Binomial2));
     AddScalar<E, E>(t, "Random_Neg_Binomial", {"R", "P"}, TOVRIN_CALLABLE(Random_Neg_Binomial));
@@ -119,8 +117,10 @@ void SeedSource(const std::optional<std::uint64_t>& Seed) {
   auto randomize = [](auto... none) -> decltype(Randomize(none...)) { return Randomize(none...); };
   if constexpr (std::is_invocable_v<decltype(seed), std::uint64_t> &&
                 std::is_invocable_v<decltype(randomize)>) {
-    if (Seed) seed(*Seed);
-    else randomize();
+    if (Seed)
+      seed(*Seed);
+    else
+      randomize();
   } else {
     throw InputError("this build of the library has no seedable uniform source");
   }
@@ -142,7 +142,8 @@ int RunRandom(std::span<const std::string> Words) {
     return kExitOk;
   }
   const std::vector<std::string>& operands = args.Operands();
-  if (operands.empty()) throw UsageError("random needs a GENERATOR name (random --list shows them)");
+  if (operands.empty())
+    throw UsageError("random needs a GENERATOR name (random --list shows them)");
   std::uint64_t count = 1;
   if (const auto text = args.Value("--count")) {
     count = ParseUnsignedArgument(*text, "--count", std::numeric_limits<std::uint32_t>::max());

@@ -31,8 +31,8 @@ std::function<std::string()> BindByName(const CallableTable& Table, const std::s
       return entry->bind(Arguments);
     }
   }
-  std::string message = Name + " does not take " + std::to_string(Arguments.size()) +
-                        " argument" + (Arguments.size() == 1 ? "" : "s") + "; it takes:";
+  std::string message = Name + " does not take " + std::to_string(Arguments.size()) + " argument" +
+                        (Arguments.size() == 1 ? "" : "s") + "; it takes:";
   for (const Callable* entry : found) message += "\n  " + Signature(*entry);
   throw UsageError(message);
 }

@@ -10,8 +10,8 @@
 #include <limits>
 #include <span>
 #include <string>
-#include <type_traits>
 #include <tuple>
+#include <type_traits>
 #include <utility>
 #include <vector>
 
@@ -73,9 +73,10 @@ std::function<std::string()> BindScalar(F Function,
                                         std::index_sequence<I...>) {
   // Arguments are parsed once; the bound call keeps copies (an lvalue Extended serves the
   // generators that take their parameter by reference).
-  return [Function, args = std::tuple<Args...>(ParseArgument<Args>(Text[I], Params[I])...)]() mutable {
-    return FormatResult(Function(std::get<I>(args)...));
-  };
+  return
+      [Function, args = std::tuple<Args...>(ParseArgument<Args>(Text[I], Params[I])...)]() mutable {
+        return FormatResult(std::apply(Function, args));
+      };
 }
 }  // namespace detail
 

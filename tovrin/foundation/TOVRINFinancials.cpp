@@ -9,36 +9,40 @@ namespace {
 constexpr Extended kTwo63 = 9223372036854775808.0L;   // 2^63
 constexpr Extended kTwo64 = 18446744073709551616.0L;  // 2^64
 
-// The integer nearest to the exact product X * Scale (exact halves to even), for a finite X
-// with |X * Scale| < 2^64. Scale is a small positive integer (at most 2^20), so the product's
-// rounding error is recovered exactly by Dekker's two-product with X split into halves of 32
-// bits each and Scale left whole: Hi * Scale and Lo * Scale are then exact.
-Extended RoundExactProduct(Extended X, Int64 Scale) {
+// The integer nearest to the exact product X * Scale (exact halves to even) as the stored
+// integer of a type whose range is [Low, High]; rsInvalidValue beyond it, for a NaN and for an
+// infinity. Scale is a small positive integer (at most 2^20), so the rounding error of the
+// product p = X * Scale is recovered exactly by Dekker's two-product with X split into halves
+// of 32 bits and Scale left whole (Hi * Scale and Lo * Scale are then exact). Only a half at
+// p's own level can be moved by that error: |err| is at most half an ulp of p and, below 2^63,
+// a fraction other than a half lies at least one ulp away from it.
+Int64 ScaleFloat(Extended X, Int64 Scale, Int64 Low, Int64 High) {
   const auto s = static_cast<Extended>(Scale);
+  // False for a NaN; the bound keeps the splitting free of overflow.
+  if (!(std::fabs(X) < kTwo64 / s)) detail::RaiseMathError(rsInvalidValue);
   const Extended p = X * s;
   constexpr Extended kSplitter = 4294967297.0L;  // 2^32 + 1
   const Extended c = X * kSplitter;
   const Extended hi = c - (c - X);
   const Extended lo = X - hi;
   const Extended err = (hi * s - p) + lo * s;  // X * Scale = p + err exactly
-  Extended n = detail::RoundHalfEven(p);
-  // Only a half at p's level can be moved by err (|err| is at most half an ulp of p, and
-  // every p below 2^63 has an ulp of at most 1/2).
-  const Extended d = p - n;
-  if (d == 0.5L && err > 0) n += 1;
-  if (d == -0.5L && err < 0) n -= 1;
-  return n;
-}
-
-// The rounded product as the stored integer of a type whose range is [Low, High].
-Int64 ScaleFloat(Extended X, Int64 Scale, Extended Low, Extended High) {
-  // The comparison is false for a NaN, and the bound keeps the splitting free of overflow.
-  if (!(std::fabs(X) < kTwo64 / static_cast<Extended>(Scale))) {
-    detail::RaiseMathError(rsInvalidValue);
+  Int64 n = INT64_MIN;                         // p = -2^63 rounds to itself
+  if (p != -kTwo63) {
+    const Extended a = std::fabs(p);
+    if (!(a < kTwo63)) detail::RaiseMathError(rsInvalidValue);
+    const detail::MagnitudeAtHalf m = detail::SplitAtHalf(a);
+    const Extended away = p < 0 ? -err : err;  // the error measured away from zero
+    const bool up = m.VsHalf > 0 || (m.VsHalf == 0 && (away > 0 || (away == 0 && (m.Whole & 1))));
+    const std::uint64_t magnitude = m.Whole + (up ? 1 : 0);  // at most 2^63
+    if (p < 0) {
+      n = static_cast<Int64>(std::uint64_t{0} - magnitude);  // -2^63 included
+    } else {
+      if (magnitude > static_cast<std::uint64_t>(INT64_MAX)) detail::RaiseMathError(rsInvalidValue);
+      n = static_cast<Int64>(magnitude);
+    }
   }
-  const Extended n = RoundExactProduct(X, Scale);
   if (n < Low || n > High) detail::RaiseMathError(rsInvalidValue);
-  return static_cast<Int64>(n);
+  return n;
 }
 
 TQENCurrency CheckedCurr(Int64 X) {
@@ -66,25 +70,29 @@ Int64 DivRoundHalfEven(Int64 Q, Int64 D) {
 
 Int64 RoundWrapping(Extended X) {
   if (!std::isfinite(X)) return INT64_MIN;
-  Extended r = std::fmod(RoundHalfEven(X), kTwo64);  // exact, in (-2^64, 2^64)
-  if (r < 0) r += kTwo64;                            // exact: an integer below 2^64
-  return static_cast<Int64>(static_cast<std::uint64_t>(r));
+  const Extended a = std::fabs(X);
+  std::uint64_t magnitude = 0;  // |X| rounded, modulo 2^64
+  if (a < kTwo63) {
+    magnitude = RoundMagnitudeHalfEven(a);
+  } else {
+    magnitude = static_cast<std::uint64_t>(std::fmod(a, kTwo64));  // whole already; exact
+  }
+  return static_cast<Int64>(X < 0 ? std::uint64_t{0} - magnitude : magnitude);
 }
 
 template <>
 TQENCurrency Float2Money<TQENCurrency>(Extended X) {
-  return static_cast<TQENCurrency>(static_cast<LongInt>(
-      ScaleFloat(X, kMoneyScale<TQENCurrency>, static_cast<Extended>(INT32_MIN),
-                 static_cast<Extended>(INT32_MAX))));
+  return static_cast<TQENCurrency>(
+      static_cast<LongInt>(ScaleFloat(X, kMoneyScale<TQENCurrency>, INT32_MIN, INT32_MAX)));
 }
 template <>
 TQENLongCurrency Float2Money<TQENLongCurrency>(Extended X) {
   return static_cast<TQENLongCurrency>(
-      ScaleFloat(X, kMoneyScale<TQENLongCurrency>, -kTwo63, kTwo63 - 1));
+      ScaleFloat(X, kMoneyScale<TQENLongCurrency>, INT64_MIN, INT64_MAX));
 }
 template <>
 Currency Float2Money<Currency>(Extended X) {
-  return static_cast<Currency>(ScaleFloat(X, kMoneyScale<Currency>, -kTwo63, kTwo63 - 1));
+  return static_cast<Currency>(ScaleFloat(X, kMoneyScale<Currency>, INT64_MIN, INT64_MAX));
 }
 
 }  // namespace detail

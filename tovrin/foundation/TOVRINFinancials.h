@@ -7,8 +7,8 @@
 // nearest to the exact value (the exact product X * scale for a float, the exact quotient for
 // a conversion to a coarser money type); an exact half goes to the even integer. The product
 // is never rounded to Extended first, so Float2QENCurrency(0.125) is 12 (a true half) while
-// Float2QENCurrency(1.005L) is 100 or 101 as the binary value of 1.005L lies below or above
-// the half.
+// Float2QENCurrency(2.675L) is 267: the binary value of 2.675L lies just below 2.675, although
+// its product by 100 rounded to Extended would be exactly 267.5.
 //
 // Range rule: a result that does not fit the stored integer of its type, and a NaN or an
 // infinity, raise EMathError(rsInvalidValue); nothing is stored then.
@@ -16,6 +16,7 @@
 
 #include <cmath>
 #include <cstdint>
+#include <cstring>
 #include <type_traits>
 #include <utility>
 
@@ -33,7 +34,8 @@ TQENCurrency Float2QENCurrency(Extended X);
 TQENLongCurrency Float2QENLongCurrency(Extended X);
 
 // --- Between money types ----------------------------------------------------------------------
-// Widening conversions are exact; only QENCurrency2... never raises.
+// QENCurrency2QENLongCurrency and QENCurrency2Currency are exact and never raise; the others
+// round by the rule above and raise rsInvalidValue for a result out of range.
 TQENLongCurrency QENCurrency2QENLongCurrency(TQENCurrency X);
 Currency QENCurrency2Currency(TQENCurrency X);
 TQENCurrency QENLongCurrency2QENCurrency(TQENLongCurrency X);  // round(stored / 10000)
@@ -66,19 +68,45 @@ constexpr Int64 StoredOf(T X) {
   return static_cast<Int64>(static_cast<std::underlying_type_t<T>>(X));
 }
 
-// X rounded to the nearest integer, an exact half to the even one, whatever the floating-point
-// rounding mode. X must be finite.
+// A magnitude 0 <= A < 2^63 split into its whole part and how its fraction compares with
+// one half (-1 below, 0 equal, +1 above), read from the bits of the 80-bit value (explicit
+// integer bit, biased exponent): no floating-point rounding or conversion takes part, so the
+// answer is the same whatever the rounding mode.
+struct MagnitudeAtHalf {
+  std::uint64_t Whole;
+  int VsHalf;
+};
+inline MagnitudeAtHalf SplitAtHalf(Extended A) {
+  std::uint64_t significand = 0;
+  std::uint16_t signAndExponent = 0;
+  std::memcpy(&significand, &A, sizeof significand);
+  std::memcpy(&signAndExponent, reinterpret_cast<const unsigned char*>(&A) + 8,
+              sizeof signAndExponent);
+  const int k = (signAndExponent & 0x7fff) - 16383;  // A in [2^k, 2^(k+1))
+  constexpr std::uint64_t kHalf = std::uint64_t{1} << 63;
+  if (k < -1) return {0, -1};
+  if (k == -1) return {0, significand > kHalf ? 1 : significand == kHalf ? 0 : -1};
+  const std::uint64_t whole = significand >> (63 - k);
+  const std::uint64_t fraction = significand << (k + 1);  // k <= 62 here
+  return {whole, fraction > kHalf ? 1 : fraction == kHalf ? 0 : -1};
+}
+
+// The nearest whole number to a magnitude 0 <= A < 2^63, an exact half to the even one.
+inline std::uint64_t RoundMagnitudeHalfEven(Extended A) {
+  const MagnitudeAtHalf s = SplitAtHalf(A);
+  return s.Whole + ((s.VsHalf > 0 || (s.VsHalf == 0 && (s.Whole & 1) != 0)) ? 1 : 0);
+}
+
+// X rounded to the nearest integer, an exact half to the even one, whatever the rounding mode.
 inline Extended RoundHalfEven(Extended X) {
   const Extended a = std::fabs(X);
-  if (!(a < 9223372036854775808.0L)) return X;             // 2^63 and beyond hold no fraction
-  const auto whole = static_cast<std::uint64_t>(a);        // truncation is floor here
-  const Extended frac = a - static_cast<Extended>(whole);  // exact (Sterbenz, or whole = 0)
-  const std::uint64_t r = (frac > 0.5L || (frac == 0.5L && (whole & 1) != 0)) ? whole + 1 : whole;
-  return X < 0 ? -static_cast<Extended>(r) : static_cast<Extended>(r);
+  if (!(a < 9223372036854775808.0L)) return X;  // 2^63 and beyond hold no fraction (or NaN)
+  const auto r = static_cast<Extended>(RoundMagnitudeHalfEven(a));
+  return X < 0 ? -r : r;
 }
 
 // The rounding of the money arithmetic whose overflow is not reported (products by a
-// constant, the Currency linear transform, grand means): X rounded half to even and reduced
+// constant, the Currency linear transform): X rounded half to even and reduced
 // modulo 2^64 into an Int64 (two's complement); a NaN or an infinity gives -2^63, the x87
 // integer indefinite. Storing into a TQENCurrency then keeps the low 32 bits.
 Int64 RoundWrapping(Extended X);

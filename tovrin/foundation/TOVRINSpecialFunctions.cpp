@@ -161,44 +161,6 @@ Extended LnGammaFinite(Extended x) {
   return kLnPi - std::log(y) - std::log(std::fabs(SinPi(x))) - LnGammaFinite(y);
 }
 
-// Stirling's remainder Delta(z) = ln Gamma(z) - ((z - 1/2) ln z - z + ln(2 pi)/2) for z > 0.
-Extended StirlingRemainder(Extended z) {
-  if (z >= kStirlingStart) return StirlingSeries(z);
-  return LnGammaFinite(z) - ((z - 0.5L) * std::log(z) - z + kHalfLn2Pi);
-}
-
-// t - log1p(t) for t > -1, accurate also for small |t|.
-Extended XMinusLog1p(Extended t) {
-  if (std::fabs(t) > 0.25L) return t - std::log1p(t);
-  // t - log1p(t) = 2 u^2 / (1 + u)... written with u = t / (2 + t):
-  // log1p(t) = 2 atanh(u) = 2 (u + u^3/3 + u^5/5 + ...), and t = 2u / (1 - u).
-  const Extended u = t / (2.0L + t);
-  const Extended u2 = u * u;
-  // t - 2u = 2u^2 / (1 - u) = u t; so t - log1p(t) = u t - 2 (u^3/3 + u^5/5 + ...).
-  Extended term = u * u2;
-  Extended series = 0.0L;
-  for (int k = 3; k < 200; k += 2) {
-    const Extended next = term / k;
-    series += next;
-    if (std::fabs(next) <= kEpsilon * std::fabs(series)) break;
-    term *= u2;
-  }
-  return u * t - 2.0L * series;
-}
-
-// Beta(a, b) for finite a, b > 0.
-Extended BetaFinite(Extended a, Extended b) {
-  if (a > b) std::swap(a, b);
-  const Extended c = a + b;
-  if (b < kStirlingStart) {
-    return GammaFinite(a) * (GammaFinite(b) / GammaFinite(c));
-  }
-  // B = sqrt(2 pi c / (a b)) (a/c)^a (b/c)^b exp(Delta(a) + Delta(b) - Delta(c)).
-  const Extended exponent = a * std::log1p(b / a) + b * std::log1p(a / b);
-  const Extended correction = StirlingRemainder(a) + StirlingRemainder(b) - StirlingRemainder(c);
-  return kSqrt2Pi * std::sqrt(c / b) / std::sqrt(a) * std::exp(correction - exponent);
-}
-
 // Error-free transformations: s + e = a + b and p + e = a * b exactly (Knuth's TwoSum and
 // Dekker's product with Veltkamp's 32/32 split of the 64-bit significand).
 struct ExactPair {
@@ -233,12 +195,98 @@ Extended ShiftedDifference(Extended s, Extended t, Extended u) {
   return (d.hi - tu.hi) + ((d.lo - su.lo) - tu.lo);
 }
 
+// Stirling's remainder Delta(z) = ln Gamma(z) - ((z - 1/2) ln z - z + ln(2 pi)/2) for z > 0.
+Extended StirlingRemainder(Extended z) {
+  if (z >= kStirlingStart) return StirlingSeries(z);
+  return LnGammaFinite(z) - ((z - 0.5L) * std::log(z) - z + kHalfLn2Pi);
+}
+
+// t - log1p(t) for t > -1, accurate also for small |t|.
+Extended XMinusLog1p(Extended t) {
+  if (t > 1.0L || t < -0.5L) return t - std::log1p(t);
+  // With u = t / (2 + t): log1p(t) = 2 atanh(u) = 2 (u + u^3/3 + u^5/5 + ...) and t - 2u = u t,
+  // so t - log1p(t) = u t - 2 (u^3/3 + u^5/5 + ...), free of cancellation for small t.
+  const Extended u = t / (2.0L + t);
+  const Extended u2 = u * u;
+  Extended term = u * u2;
+  Extended series = 0.0L;
+  for (int k = 3; k < 400; k += 2) {
+    const Extended next = term / k;
+    series += next;
+    if (std::fabs(next) <= kEpsilon * std::fabs(series)) break;
+    term *= u2;
+  }
+  return u * t - 2.0L * series;
+}
+
+// (x (a + b) / a)^a for x = x_hi + x_lo, with x (1 + b/a) carried to twice the working
+// precision, so that the result carries little more than pow's own rounding (pow of the 80-bit
+// library is correctly rounded to within about 0.6 units in the last place, whatever the
+// size of the exponent). Also sets log_power to the logarithm of the result, for when the power
+// itself leaves the range.
+Extended ScaledPower(Extended x_hi, Extended x_lo, Extended a, Extended b, Extended& log_power) {
+  const Extended q = b / a;
+  const ExactPair qa = TwoProduct(q, a);
+  const Extended q_lo = ((b - qa.hi) - qa.lo) / a;  // b/a = q + q_lo
+  const ExactPair xq = TwoProduct(x_hi, q);
+  const ExactPair z = TwoSum(x_hi, xq.hi);
+  const Extended z_lo = z.lo + xq.lo + x_hi * q_lo + x_lo * (1.0L + q);
+  const Extended delta = z_lo / z.hi;
+  const Extended power = std::pow(z.hi, a);
+  const Extended ad = a * delta;
+  if (std::isnormal(power)) {
+    if (std::fabs(ad) < 1e-6L) return power * (1.0L + ad);
+    return power * std::exp(a * std::log1p(delta));
+  }
+  log_power = a * (std::log(z.hi) + std::log1p(delta));
+  return power;
+}
+
+// Beta(a, b) for finite a, b > 0.
+Extended BetaFinite(Extended a, Extended b) {
+  if (a > b) std::swap(a, b);
+  const Extended c = a + b;
+  if (b < kStirlingStart) {
+    return GammaFinite(a) * (GammaFinite(b) / GammaFinite(c));
+  }
+  // B = sqrt(2 pi c / (a b)) (a/c)^a (b/c)^b exp(Delta(a) + Delta(b) - Delta(c)), with the
+  // powers taken by pow from bases carried to twice the working precision.
+  const Extended correction = StirlingRemainder(a) + StirlingRemainder(b) - StirlingRemainder(c);
+  const Extended scale = kSqrt2Pi * std::sqrt(c / b) / std::sqrt(a) * std::exp(correction);
+  Extended log_a;
+  Extended log_b;
+  const Extended pa = ScaledPower(1.0L, 0.0L, a, b, log_a);  // (c/a)^a
+  const Extended pb = ScaledPower(1.0L, 0.0L, b, a, log_b);  // (c/b)^b
+  if (std::isnormal(pa) && std::isnormal(pb) && std::isnormal(pa * pb)) return scale / (pa * pb);
+  // Far outside the range of the powers: logarithms throughout.
+  const Extended exponent = a * std::log1p(b / a) + b * std::log1p(a / b);
+  return scale * std::exp(-exponent);
+}
+
+// s phi(t) = s (t - log1p(t)) for t >= -1/2, given st = s t exactly: for a large t the product
+// is taken as st itself rather than s (st / s) rounded twice.
+Extended ShapeTimesPhi(Extended s, Extended t, Extended st) {
+  if (t > 1.0L) return st - s * std::log1p(t);
+  return s * XMinusLog1p(t);
+}
+
 // A point of the incomplete beta: x and y = 1 - x, where the smaller of the two is exact and
 // the larger may carry the rounding of 1 - (smaller).
 struct BetaPoint {
   Extended x;
   Extended y;
+  Extended x_lo = 0.0L;  // x + x_lo and y + y_lo are the exact coordinates
+  Extended y_lo = 0.0L;
 };
+
+// The point (x, 1 - x) for an exact x; the rounding of 1 - x is kept in y_lo (exactly, as in
+// Fast2Sum).
+BetaPoint PointFromX(Extended x) {
+  const Extended y = 1.0L - x;
+  return {x, y, 0.0L, (1.0L - y) - x};
+}
+
+BetaPoint Swapped(const BetaPoint& p) { return {p.y, p.x, p.y_lo, p.x_lo}; }
 
 // lambda = a y - b x = a - (a + b) x, from the exact member of the pair.
 Extended BetaLambda(const BetaPoint& p, Extended a, Extended b) {
@@ -246,50 +294,64 @@ Extended BetaLambda(const BetaPoint& p, Extended a, Extended b) {
   return -ShiftedDifference(b, a, p.y);
 }
 
-// ln x and ln y, each from the exact member of the pair.
-Extended LnX(const BetaPoint& p) { return p.x <= 0.5L ? std::log(p.x) : std::log1p(-p.y); }
-Extended LnY(const BetaPoint& p) { return p.y <= 0.5L ? std::log(p.y) : std::log1p(-p.x); }
-
 // x^a y^b / B(a, b), the factor shared by the incomplete beta and its derivative
 // (the density is this divided by x y). Written as
 //   (x c / a)^a (y c / b)^b sqrt(a b / (2 pi c)) exp(Delta(c) - Delta(a) - Delta(b)),  c = a + b,
 // where the powers are exp(a log1p(-lambda/a) + b log1p(lambda/b)) with lambda = a y - b x:
 // near the mean both logarithms are small and their linear parts cancel exactly.
+// pow(x_hi + x_lo, a) for a small correction x_lo.
+Extended PowerOfPair(Extended x_hi, Extended x_lo, Extended a) {
+  const Extended power = std::pow(x_hi, a);
+  if (x_lo == 0.0L) return power;
+  return power * (1.0L + a * (x_lo / x_hi));
+}
+
 Extended BetaPowerFactor(const BetaPoint& p, Extended a, Extended b, Extended lambda) {
-  const Extended c = a + b;
-  const Extended ta = -lambda / a;
-  const Extended tb = lambda / b;
-  const bool near_a = std::fabs(ta) <= 0.5L;
-  const bool near_b = std::fabs(tb) <= 0.5L;
-  // factor = power * exp(-exponent) * scale * exp(correction). Away from the mean a term
-  // (x c / a)^a is split into x^a, taken by pow from the exact x (no exp of a large rounded
-  // logarithm), and (c / a)^a = exp(a log1p(b / a)).
-  Extended exponent = 0.0L;
-  Extended power = 1.0L;
-  Extended log_power = 0.0L;
-  if (near_a && near_b) {
-    exponent = a * XMinusLog1p(ta) + b * XMinusLog1p(tb);
-  } else {
-    if (near_a) {
-      // -a ln(1 + ta) = a (ta - ln(1 + ta)) - a ta = a XMinusLog1p(ta) + lambda.
-      exponent += a * XMinusLog1p(ta) + lambda;
-    } else {
-      exponent -= a * std::log1p(b / a);
-      power *= p.x <= 0.5L ? std::pow(p.x, a) : std::exp(a * LnX(p));
-      log_power += a * LnX(p);
-    }
-    if (near_b) {
-      exponent += b * XMinusLog1p(tb) - lambda;
-    } else {
-      exponent -= b * std::log1p(a / b);
-      power *= p.y <= 0.5L ? std::pow(p.y, b) : std::exp(b * LnY(p));
-      log_power += b * LnY(p);
-    }
+  if (a < kStirlingStart && b < kStirlingStart) {
+    // Small shapes: the powers and B(a, b) directly.
+    const Extended xa = PowerOfPair(p.x, p.x_lo, a);
+    const Extended yb = PowerOfPair(p.y, p.y_lo, b);
+    const Extended factor = xa * yb / BetaFinite(a, b);
+    if (std::isnormal(xa) && std::isnormal(yb) && std::isnormal(factor)) return factor;
   }
+  const Extended c = a + b;
   const Extended correction = StirlingRemainder(c) - StirlingRemainder(a) - StirlingRemainder(b);
   const Extended scale = std::sqrt(a) * std::sqrt(b / c) / kSqrt2Pi;
+  {
+    // Both powers from exact bases: near the mean and far from it alike, the result carries
+    // only pow's rounding of each.
+    Extended log_a;
+    Extended log_b;
+    const Extended pa = ScaledPower(p.x, p.x_lo, a, b, log_a);
+    const Extended pb = ScaledPower(p.y, p.y_lo, b, a, log_b);
+    const Extended product = pa * pb;
+    if (std::isnormal(pa) && std::isnormal(pb) && std::isnormal(product)) {
+      return product * (scale * std::exp(correction));
+    }
+  }
+  // A power left the range: fall back to the exponent form, which needs no intermediate
+  // power at all.
+  const Extended ta = -lambda / a;
+  const Extended tb = lambda / b;
+  // -(a ln(x c / a) + b ln(y c / b)) = a phi(ta) + b phi(tb) with phi(t) = t - log1p(t) >= 0:
+  // a sum of two non-negative terms. Only when x c / a = 1 + ta (or y c / b) falls below 1/2
+  // is 1 + t too inexact; that term is then split into x^a, taken by pow from the exact x
+  // (lambda > 0 there, so x is the smaller member of the pair), and (c / a)^a.
+  // At most one of the two terms is split, since ta and tb have opposite signs.
+  Extended exponent;
+  Extended power = 1.0L;
+  Extended log_power = 0.0L;
+  if (ta < -0.5L) {
+    exponent = ShapeTimesPhi(b, tb, lambda) - lambda;
+    power = ScaledPower(p.x, p.x_lo, a, b, log_power);
+  } else if (tb < -0.5L) {
+    exponent = ShapeTimesPhi(a, ta, -lambda) + lambda;
+    power = ScaledPower(p.y, p.y_lo, b, a, log_power);
+  } else {
+    exponent = ShapeTimesPhi(a, ta, -lambda) + ShapeTimesPhi(b, tb, lambda);
+  }
   if (!std::isnormal(power)) {
-    // The powers alone left the range although the whole may not: use logarithms throughout.
+    // The power alone left the range although the whole may not: use logarithms throughout.
     return scale * std::exp(correction - exponent + log_power);
   }
   return power * (scale * std::exp(correction - exponent));
@@ -352,7 +414,7 @@ BetaValues IncompleteBetaBoth(const BetaPoint& p, Extended a, Extended b) {
   // the complement I_y(b, a) is.
   const Extended lambda = BetaLambda(p, a, b);
   const bool swap = lambda < 0.0L;
-  const BetaPoint q = swap ? BetaPoint{p.y, p.x} : p;
+  const BetaPoint q = swap ? Swapped(p) : p;
   const Extended sa = swap ? b : a;
   const Extended sb = swap ? a : b;
   const Extended factor = BetaPowerFactor(q, sa, sb, swap ? -lambda : lambda);
@@ -376,9 +438,9 @@ BetaPoint InverseBetaEstimate(Extended p, Extended q, Extended a, Extended b) {
     if (p < 0.5L) z = -z;
     const Extended al = (z * z - 3.0L) / 6.0L;
     const Extended h = 2.0L / (1.0L / (2.0L * a - 1.0L) + 1.0L / (2.0L * b - 1.0L));
-    const Extended w = z * std::sqrt(al + h) / h -
-                       (1.0L / (2.0L * b - 1.0L) - 1.0L / (2.0L * a - 1.0L)) *
-                           (al + 5.0L / 6.0L - 2.0L / (3.0L * h));
+    const Extended w =
+        z * std::sqrt(al + h) / h - (1.0L / (2.0L * b - 1.0L) - 1.0L / (2.0L * a - 1.0L)) *
+                                        (al + 5.0L / 6.0L - 2.0L / (3.0L * h));
     // x = a / (a + b e^(2w)), y = b e^(2w) / (a + b e^(2w)), in a form that cannot overflow.
     const Extended lr = std::log(b / a) + 2.0L * w;  // ln(y / x)
     if (lr > 0.0L) {
@@ -412,7 +474,7 @@ Extended InverseBetaLowerHalf(Extended p, Extended q, Extended a, Extended b, Be
   if (!(x > lo && x < hi)) x = 0.25L;
   const bool use_lower = p <= 0.5L;
   for (int i = 0; i < kMaxIterations; ++i) {
-    const BetaPoint pt{x, 1.0L - x};
+    const BetaPoint pt = PointFromX(x);
     const BetaValues v = IncompleteBetaBoth(pt, a, b);
     // f(x) = I_x - p, written in the tail that is known accurately.
     const Extended f = use_lower ? v.lower - p : q - v.upper;
@@ -486,7 +548,7 @@ Extended IncompleteBeta(Extended X, Extended A, Extended B) {
     if (std::isinf(A) && std::isinf(B)) return kNaN;
     return std::isinf(A) ? 0.0L : 1.0L;
   }
-  return IncompleteBetaBoth(BetaPoint{X, 1.0L - X}, A, B).lower;
+  return IncompleteBetaBoth(PointFromX(X), A, B).lower;
 }
 
 Extended InverseIncompleteBeta(Extended P, Extended A, Extended B) {
@@ -499,11 +561,11 @@ Extended InverseIncompleteBeta(Extended P, Extended A, Extended B) {
     return std::isinf(A) ? 1.0L : 0.0L;
   }
   const Extended Q = 1.0L - P;
-  const BetaValues half = IncompleteBetaBoth(BetaPoint{0.5L, 0.5L}, A, B);
+  const BetaValues half = IncompleteBetaBoth(PointFromX(0.5L), A, B);
   const BetaPoint start = InverseBetaEstimate(P, Q, A, B);
   if (P <= half.lower) return InverseBetaLowerHalf(P, Q, A, B, start);
   // The root lies above 1/2: solve I_y(b, a) = 1 - P for y = 1 - x.
-  const Extended y = InverseBetaLowerHalf(Q, P, B, A, BetaPoint{start.y, start.x});
+  const Extended y = InverseBetaLowerHalf(Q, P, B, A, Swapped(start));
   return 1.0L - y;
 }
 

@@ -1,8 +1,9 @@
 // Plane and solid geometry formulas.
 //
 // Every argument and result is an Extended passed by value (the outputs of the two coordinate
-// constructions are references). Lengths are checked in argument order before any arithmetic:
-// a length below 0 raises EMathError(rsLengthNotNeg); 0 is accepted. The ...2Radius inverses
+// constructions are references). Every argument of an area, perimeter, volume or surface
+// function (angles included) is checked in argument order before any arithmetic: a value
+// below 0 raises EMathError(rsLengthNotNeg); 0 is accepted. The ...2Radius inverses
 // and the coordinate functions check nothing: a negative root or a division by zero gives the
 // IEEE 754 result (a NaN or an infinity).
 #pragma once

@@ -144,7 +144,8 @@ TQENInt64Vector TQENDescStats::Int64Values() const {
 TQENLIntVector TQENDescStats::LIntValues() const {
   TQENLIntVector result(FValues.size());
   for (std::size_t i = 0; i < FValues.size(); ++i) {
-    const auto low = static_cast<std::uint32_t>(static_cast<std::uint64_t>(RoundToInt64(FValues[i])));
+    const auto low =
+        static_cast<std::uint32_t>(static_cast<std::uint64_t>(RoundToInt64(FValues[i])));
     result[i] = static_cast<LongInt>(low);
   }
   return result;
@@ -273,7 +274,8 @@ void TQENDescStats::LoadFromStream(std::istream& Stream) {
   std::size_t line_number = 0;
   std::string line;
   const auto next_line = [&](const char* expected) {
-    if (!std::getline(Stream, line)) StreamError(line_number + 1, std::string("missing ") + expected);
+    if (!std::getline(Stream, line))
+      StreamError(line_number + 1, std::string("missing ") + expected);
     ++line_number;
     if (!line.empty() && line.back() == '\r') line.pop_back();
   };
@@ -310,9 +312,12 @@ void TQENDescStats::LoadFromStream(std::istream& Stream) {
       decimals = static_cast<Byte>(parsed);
     } else if (name == "Population" && !seen_population) {
       seen_population = true;
-      if (text == "True") population = true;
-      else if (text == "False") population = false;
-      else StreamError(line_number, "Population must be True or False");
+      if (text == "True")
+        population = true;
+      else if (text == "False")
+        population = false;
+      else
+        StreamError(line_number, "Population must be True or False");
     } else if (name == "Version" && !seen_version) {
       seen_version = true;  // accepted and ignored, as SetVersion does
     } else {

@@ -19,25 +19,30 @@ void CheckSameLength(const TQENFloatVector& X, const TQENFloatVector& Y) {
 // SumVector, SumSqVector or DotProdVectors gives (the same additions in the same order), taken
 // directly so that the pairs are read once instead of five times. X and Y have equal lengths.
 struct PairSums {
-  Extended Sx = 0;
-  Extended Sy = 0;
-  Extended Sxx = 0;
-  Extended Syy = 0;
-  Extended Sxy = 0;
+  Extended Sx;
+  Extended Sy;
+  Extended Sxx;
+  Extended Syy;
+  Extended Sxy;
 };
 
 PairSums SumsOf(const TQENFloatVector& X, const TQENFloatVector& Y) {
-  PairSums sums;
+  // Local accumulators: the result is written once, so the loop keeps them in registers.
+  Extended sx = 0;
+  Extended sy = 0;
+  Extended sxx = 0;
+  Extended syy = 0;
+  Extended sxy = 0;
   for (std::size_t i = 0; i < X.size(); ++i) {
     const Extended x = X[i];
     const Extended y = Y[i];
-    sums.Sx += x;
-    sums.Sy += y;
-    sums.Sxx += x * x;
-    sums.Syy += y * y;
-    sums.Sxy += x * y;
+    sx += x;
+    sy += y;
+    sxx += x * x;
+    syy += y * y;
+    sxy += x * y;
   }
-  return sums;
+  return PairSums{sx, sy, sxx, syy, sxy};
 }
 
 }  // namespace

@@ -112,6 +112,7 @@ TEST(GroupedMode, TiesAndEnds) {
   Extended mode = 123;
   EXPECT_FALSE(GroupedMode(TQENLWordVector{2, 2}, 0, 1, mode));
   EXPECT_FALSE(GroupedMode(TQENLWordVector{1, 5, 3, 5}, 0, 1, mode));
+  EXPECT_EQ(mode, 123);  // left as it was on a tie
   // A later larger class clears an earlier tie.
   EXPECT_TRUE(GroupedMode(TQENLWordVector{2, 2, 6}, 0, 5, mode));
   // Last class: d1 = 4, d2 = 6 (f[k] itself): 2 * 5 + 4 * 5 / 10.

@@ -513,14 +513,14 @@ void GetDeciles(const TQENFloatVector& X, std::array<Extended, 9>& Deciles) {
   CheckNotEmpty(X);
   const std::size_t n = X.size();
   std::array<Extended, 9> deciles{};
-  for (int j = 1; j <= 9; ++j) {
-    if (n == 1) {
-      deciles[static_cast<std::size_t>(j - 1)] = X[0];
-      continue;
+  if (n == 1) {
+    deciles.fill(X[0]);
+  } else {
+    for (Int64 j = 1; j <= 9; ++j) {
+      const auto scaled = static_cast<Extended>(static_cast<Int64>(n) * j);
+      const auto p = static_cast<Single>(scaled / 10 + 0.5L);
+      deciles[static_cast<std::size_t>(j - 1)] = ValueAtPosition(X, p);
     }
-    const Extended scaled = static_cast<Extended>(static_cast<Int64>(n) * j);
-    const auto p = static_cast<Single>(scaled / 10 + 0.5L);
-    deciles[static_cast<std::size_t>(j - 1)] = ValueAtPosition(X, p);
   }
   Deciles = deciles;
 }

@@ -186,16 +186,13 @@ def beta_cases(rng):
         v = mp.beta(a, b)
         if v < mpf("1e-4900"):
             continue
-        # Very large shapes make B itself span thousands of binary orders; the power of
-        # such a number can only be as good as the exponent's rounding.
-        lv = abs(mp.log(v))
-        rows.append((a, b, v, ORDINARY if lv < 200 else HARD))
+        rows.append((a, b, v, ORDINARY))
     for a, b in [(1, 1), (0.5, 0.5), (2, 3), (1e-3, 1e-3), (1e5, 1e5), (0.5, 1e5), (12, 12)]:
         a, b = ld(a), ld(b)
         v = mp.beta(a, b)
         if v < mpf("1e-4900"):
             continue
-        rows.append((a, b, v, ORDINARY if abs(mp.log(v)) < 200 else HARD))
+        rows.append((a, b, v, ORDINARY))
     return rows
 
 
@@ -257,8 +254,7 @@ def inverse_cases(rng):
             # A start for Newton's method: the normal or power-law estimate in mpmath.
             x = inverse_start(p, a, b)
             try:
-                print("  inverse p=%s a=%s b=%s" % (mp.nstr(p, 5), a, b), file=sys.stderr)
-                root = inverse_ibeta(p, a, b, x)
+                    root = inverse_ibeta(p, a, b, x)
             except RuntimeError:
                 continue
             if root < mpf("1e-4900"):

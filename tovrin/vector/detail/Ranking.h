@@ -106,8 +106,8 @@ TQENLIntVector RankVector(const std::vector<T>& V, bool Ascending, Equal equal =
     std::vector<T> W(V);
     QuickSortVector(W, Ascending);
     for (std::size_t i = 0; i < V.size(); ++i) {
-      const LongInt rank = FirstEqualPosition(W, static_cast<ValueOf<T>>(V[i]), Ascending,
-                                              equal, /*sorted=*/false);
+      const LongInt rank =
+          FirstEqualPosition(W, static_cast<ValueOf<T>>(V[i]), Ascending, equal, /*sorted=*/false);
       if (rank >= 0) result[i] = rank;  // an element equal to nothing keeps rank 0
     }
     return result;
@@ -126,8 +126,8 @@ TQENLIntVector RankVector(const std::vector<T>& V, bool Ascending, Equal equal =
   std::size_t first = 0;
   for (std::size_t k = 0; k < entries.size(); ++k) {
     const ValueOf<T> x = static_cast<ValueOf<T>>(entries[k].value);
-    while (SortsBeforeAndDiffers(static_cast<ValueOf<T>>(entries[first].value), x, Ascending,
-                                 equal)) {
+    while (
+        SortsBeforeAndDiffers(static_cast<ValueOf<T>>(entries[first].value), x, Ascending, equal)) {
       ++first;
     }
     result[static_cast<std::size_t>(entries[k].position)] = static_cast<LongInt>(first);

@@ -1,0 +1,344 @@
+#!/usr/bin/env bash
+# Runs the built tovrin program and checks its output and exit statuses.
+# Usage: cli_test.sh PATH/TO/tovrin SOURCE_DIR
+set -u
+TOVRIN=$1
+SRC=$2
+DATA=$SRC/data/michelson1879.txt
+WORK=$(mktemp -d)
+trap 'rm -rf "$WORK"' EXIT
+failures=0
+checks=0
+
+fail() {
+  echo "FAIL: $*" >&2
+  failures=$((failures + 1))
+}
+
+# run EXPECTED_STATUS ARGS... ; leaves stdout in $WORK/out and stderr in $WORK/err.
+run() {
+  local expected=$1
+  shift
+  checks=$((checks + 1))
+  "$TOVRIN" "$@" >"$WORK/out" 2>"$WORK/err" <"${STDIN:-/dev/null}"
+  local status=$?
+  if [ "$status" -ne "$expected" ]; then
+    fail "tovrin $* exited $status, expected $expected (stderr: $(head -c 300 "$WORK/err"))"
+  fi
+}
+
+# expect_out TEXT: stdout is exactly TEXT (plus the final newline).
+expect_out() {
+  checks=$((checks + 1))
+  if [ "$(cat "$WORK/out")" != "$1" ]; then
+    fail "unexpected output:"$'\n'"$(cat "$WORK/out")"$'\n'"expected:"$'\n'"$1"
+  fi
+}
+# expect_line TEXT: stdout has a line exactly TEXT.
+expect_line() {
+  checks=$((checks + 1))
+  grep -qxF -- "$1" "$WORK/out" || fail "no line '$1' in:"$'\n'"$(cat "$WORK/out")"
+}
+expect_err() {
+  checks=$((checks + 1))
+  grep -qF -- "$1" "$WORK/err" || fail "stderr lacks '$1': $(cat "$WORK/err")"
+}
+expect_no_out() {
+  checks=$((checks + 1))
+  [ ! -s "$WORK/out" ] || fail "stdout should be empty: $(head -c 300 "$WORK/out")"
+}
+
+TAB=$'\t'
+
+# --- top level ---------------------------------------------------------------------------------
+run 0 --version
+checks=$((checks + 1))
+grep -qE '^tovrin [0-9]+\.[0-9]+\.[0-9]+$' "$WORK/out" || fail "--version: $(cat "$WORK/out")"
+run 0 --help
+for sub in describe regress grouped eval random; do
+  expect_line "$(grep -m1 "^  $sub" "$WORK/out")"
+  grep -q "^  $sub" "$WORK/out" || fail "--help does not list $sub"
+done
+run 2
+expect_no_out
+run 2 frobnicate
+expect_err "unknown subcommand 'frobnicate'"
+for sub in describe regress grouped eval random; do
+  run 0 "$sub" --help
+  expect_line "$(head -n1 "$WORK/out")"
+  grep -q "^Usage: tovrin $sub" "$WORK/out" || fail "$sub --help: $(head -n1 "$WORK/out")"
+done
+
+# --- describe ----------------------------------------------------------------------------------
+# Michelson's 100 measurements; reference values by exact rational arithmetic (python3
+# fractions): sum 29985240, sum of squares 8991146796600, variance 6242.6666..., standard
+# deviation 79.01054781905177, skew -0.018538863775218, kurtosis 0.339684598420114; 299810
+# and 299880 occur ten times each (no mode); quartile positions 25.5 and 75.5.
+run 0 describe "$DATA"
+expect_out "Number of Values:${TAB}100
+Maximum:${TAB}300070.0000
+Minimum:${TAB}299620.0000
+Range:${TAB}450.0000
+Sum:${TAB}29985240.0000
+Sum of Squares:${TAB}8991146796600.0000
+Mean:${TAB}299852.4000
+No Modal Value
+Median:${TAB}299850.0000
+Variance:${TAB}6242.6667
+Standard Deviation:${TAB}79.0105
+Kurtosis:${TAB}0.3397
+Skew:${TAB}-0.0185
+First Quartile:${TAB}299805.0000
+Third Quartile:${TAB}299895.0000
+Inter-Quartile Range:${TAB}90.0000
+Lower Fence for Outliers:${TAB}299670.0000
+Upper Fence for Outliers:${TAB}300030.0000"
+
+# Standard input, commas, comments, blank lines, CRLF line ends.
+printf '4,2 # first line\r\n\r\n# only a comment\n1\t3\n' >"$WORK/in1"
+STDIN=$WORK/in1 run 0 describe
+expect_line "Number of Values:${TAB}4"
+expect_line "Sum of Squares:${TAB}30.0000"
+expect_line "Variance:${TAB}1.6667"
+expect_line "Kurtosis:${TAB}-1.2000"
+expect_line "First Quartile:${TAB}1.5000"
+expect_line "No Modal Value"
+
+# Several files and '-' in order; population and decimals.
+printf '1\n' >"$WORK/a"
+printf '2 3\n' >"$WORK/b"
+printf '4' >"$WORK/c"  # no final newline
+STDIN=$WORK/b run 0 describe --population --decimals 2 "$WORK/a" - "$WORK/c"
+expect_line "Number of Values:${TAB}4"
+expect_line "Variance:${TAB}1.25"
+expect_line "Standard Deviation:${TAB}1.12"
+expect_line "Kurtosis:${TAB}-1.36"
+run 0 describe --decimals=0 "$WORK/a" "$WORK/b"
+expect_line "Mean:${TAB}2"
+expect_line "Not enough Values for Kurtosis"
+expect_line "Skew:${TAB}0"
+
+# One value: the sample report's bare lines.
+printf '2.5\n' >"$WORK/one"
+run 0 describe "$WORK/one"
+expect_line "Not enough Values for Variance"
+expect_line "Not enough Values for Standard Deviation"
+expect_line "Mode:${TAB}2.5000"
+
+# Exponents, signs and a long mantissa are read exactly.
+printf '1e-3 -2.5E+1 +.5 3. 0.1000000000000000000000000001\n' >"$WORK/forms"
+run 0 describe --decimals 20 "$WORK/forms"
+expect_line "Minimum:${TAB}-25.00000000000000000000"
+expect_line "Maximum:${TAB}3.00000000000000000000"
+
+# JSON.
+run 0 describe --json "$DATA"
+checks=$((checks + 1))
+python3 - "$WORK/out" <<'PY' || fail "describe --json"
+import json, sys
+d = json.load(open(sys.argv[1]))
+keys = ["NoOfValues", "Maximum", "Minimum", "Range", "Sum", "SumSq", "Mean", "Mode", "Median",
+        "Variance", "StdDev", "Kurtosis", "Skew", "Quartile1st", "Quartile3rd", "IQR",
+        "FenceLower", "FenceUpper"]
+assert list(d) == keys, list(d)
+assert d["NoOfValues"] == 100 and d["Mode"] is None
+assert d["Sum"] == 29985240 and d["SumSq"] == 8991146796600
+assert abs(d["Mean"] - 299852.4) < 1e-9 and abs(d["Variance"] - 18728 / 3) < 1e-9
+assert abs(d["StdDev"] - 79.01054781905177) < 1e-12
+assert abs(d["Skew"] + 0.018538863775218) < 1e-13 and abs(d["Kurtosis"] - 0.339684598420114) < 1e-13
+PY
+printf '5 5 1\n' >"$WORK/mode"
+run 0 describe --json "$WORK/mode"
+checks=$((checks + 1))
+python3 -c 'import json,sys; d=json.load(open(sys.argv[1])); assert d["Mode"] == 5, d' "$WORK/out" ||
+  fail "describe --json mode"
+
+# No numbers at all.
+run 0 describe
+expect_out "Vector is empty"
+printf '# nothing here\n\n' >"$WORK/blank"
+run 0 describe "$WORK/blank"
+expect_out "Vector is empty"
+
+# Bad input: nothing on stdout, file, line and token on stderr, status 1.
+printf '1 2\n3 4,x5\n' >"$WORK/bad"
+run 1 describe "$WORK/bad"
+expect_no_out
+expect_err "$WORK/bad:2: not a number: 'x5'"
+for token in nan inf 1,5e 0x10 1e 1e+ . - 1..2 1e5000; do
+  printf '1\n%s\n' "$token" >"$WORK/bad"
+  run 1 describe "$WORK/bad"
+  expect_no_out
+done
+printf '7\n8 oops\n' >"$WORK/bad"
+STDIN=$WORK/bad run 1 describe
+expect_err "<stdin>:2: not a number: 'oops'"
+run 1 describe "$WORK/does-not-exist"
+expect_err "does-not-exist"
+
+# Usage errors.
+run 2 describe --decimals 21 "$DATA"
+expect_no_out
+run 2 describe --decimals
+run 2 describe --decimals x "$DATA"
+run 2 describe --json=1 "$DATA"
+run 2 describe --frobnicate "$DATA"
+expect_err "unknown option --frobnicate"
+
+# --- regress -----------------------------------------------------------------------------------
+printf '0 1\n1 3\n\n2 5 # exact line\n' >"$WORK/pairs"
+run 0 regress "$WORK/pairs"
+expect_line "Number of Pairs:${TAB}3"
+expect_line "Mean of X Values:${TAB}1.0000"
+expect_line "Standard Deviation of X Values:${TAB}1.0000"
+expect_line "Mean of Y Values:${TAB}3.0000"
+expect_line "Standard Deviation of Y Values:${TAB}2.0000"
+expect_line "Covariance:${TAB}2.0000"
+expect_line "Coefficient of Correlation${TAB}1.0000"
+expect_line "Coefficient of Determination${TAB}1.0000"
+expect_line "Regression Line:${TAB}y = 1.0000 + 2.0000x"
+expect_line "Intercept:${TAB}1.0000"
+expect_line "Slope:${TAB}2.0000"
+expect_line "Sum of Squares Error:${TAB}0.0000"
+printf '0 1\n1 2\n2 5\n3 10\n' >"$WORK/parabola"  # y = 1 + x^2
+run 0 regress --decimals 2 "$WORK/parabola"
+expect_line "Quadratic Curve:${TAB}y = 1.00 + 0.00x + 1.00x^2"
+printf '0 1\n1 3\n2 5 7\n' >"$WORK/pairs3"
+run 1 regress "$WORK/pairs3"
+expect_no_out
+expect_err ":3: more than two numbers on a line: '7'"
+printf '0 1\n1\n' >"$WORK/pairs1"
+run 1 regress "$WORK/pairs1"
+expect_err ":2: a pair needs two numbers"
+printf '0 1\n' >"$WORK/pair"
+run 1 regress "$WORK/pair"
+run 2 regress --population "$WORK/pairs"
+
+# --- grouped -----------------------------------------------------------------------------------
+# Frequencies 1, 2, 1 over [0, 10), [10, 20), [20, 30): midpoints 5, 15, 25; mean 15;
+# median class 1: 10 + (2 - 1) 10 / 2 = 15; mode 15; Q1 target 1: class 0, 0 + 1*10/1 = 10;
+# Q3 target 3: class 1, 10 + (3 - 1) 10 / 2 = 20; sample variance (100 + 0 + 100) / 3.
+run 0 grouped --start 0 --width 10 1 2 1
+expect_line "Mean:${TAB}15.0000"
+expect_line "Median:${TAB}15.0000"
+expect_line "Mode:${TAB}15.0000"
+expect_line "First Quartile:${TAB}10.0000"
+expect_line "Third Quartile:${TAB}20.0000"
+expect_line "Sample Variance:${TAB}66.6667"
+expect_line "Population Variance:${TAB}50.0000"
+expect_line "Decile 5:${TAB}15.0000"
+run 0 grouped --width 1 --start -0.5 --decimals 1 2 2
+expect_line "No Modal Value"
+run 2 grouped --width 10 1 2 1
+expect_err "--start"
+run 2 grouped --start 0 --width 10
+run 2 grouped --start 0 --width 10 1 -2 1
+run 2 grouped --start 0 --width 10 1 2.5
+run 2 grouped --start zero --width 10 1
+
+# --- eval --------------------------------------------------------------------------------------
+run 0 eval NormalLess 0
+expect_out "0.5"
+run 0 eval AreaTriangle 3 4 5
+expect_out "6"
+run 0 eval BinomialBetween 0.5 4 1 3
+expect_out "0.375"
+run 0 eval BinomialBetween 0.5 4 3 1
+expect_out "0.875"
+run 0 eval BinomialCoeff 10 3
+expect_out "120"
+run 0 eval Factorial 20
+expect_out "2432902008176640000"
+run 0 eval SameFloat 1 1.0000000000001
+expect_out "True"
+run 0 eval FloatIsNegative -1e-3
+expect_out "True"
+run 0 eval XtoY 2 -2
+expect_out "0.25"
+run 0 eval ZAlpha 0.025
+checks=$((checks + 1))
+case $(cat "$WORK/out") in 1.95996398454005*) ;; *) fail "ZAlpha 0.025: $(cat "$WORK/out")" ;; esac
+run 0 eval InvStudentTLess 0.975 10
+checks=$((checks + 1))
+case $(cat "$WORK/out") in 2.228138851986*) ;; *) fail "InvStudentTLess: $(cat "$WORK/out")" ;; esac
+run 0 eval NormalLess 1.96
+checks=$((checks + 1))
+# 21 significant digits: 0. then 21 digits.
+grep -qE '^0\.975002104851[0-9]{9}$' "$WORK/out" || fail "NormalLess 1.96: $(cat "$WORK/out")"
+run 0 eval BetaDistLess 0.5 2 2
+expect_out "0.5"
+run 0 eval BetaDistLess 5 2 2 0 10
+expect_out "0.5"
+run 0 eval LineIntersection 0 0 2 2 0 2 2 0
+expect_out "True
+X${TAB}1
+Y${TAB}1"
+run 0 eval LinesAreParallel 0 0 1 1 0 1 1 2
+expect_out "True"
+run 0 eval GetCircleWithPoints 0 0 2 0 0 2
+expect_line "CX${TAB}1"
+expect_line "CY${TAB}1"
+run 1 eval AreaTriangle 1 1 3
+expect_no_out
+expect_err "Sides do not form a triangle"
+run 1 eval Factorial 1755
+run 2 eval NoSuchFunction 1
+expect_err "unknown function 'NoSuchFunction'"
+run 2 eval NormalLess
+expect_err "NormalLess Z"
+run 2 eval NormalLess 1 2
+run 2 eval NormalLess abc
+expect_err "'abc'"
+run 2 eval ChiSquareLess 1 -2
+run 2 eval ChiSquareLess 1 2.5
+run 2 eval
+run 0 eval --list
+expect_line "NormalLess Z"
+expect_line "BinomialBetween P N R1 R2"
+expect_line "AreaTriangle A B C"
+expect_line "Gamma X"
+checks=$((checks + 1))
+[ "$(wc -l <"$WORK/out")" -ge 150 ] || fail "eval --list lists only $(wc -l <"$WORK/out") functions"
+
+# --- random ------------------------------------------------------------------------------------
+run 0 random Random_Normal --count 5 --seed 42
+cp "$WORK/out" "$WORK/first"
+checks=$((checks + 1))
+[ "$(wc -l <"$WORK/out")" -eq 5 ] || fail "random --count 5 printed $(wc -l <"$WORK/out") lines"
+run 0 random --seed 42 Random_Normal --count=5
+checks=$((checks + 1))
+cmp -s "$WORK/out" "$WORK/first" || fail "the same seed gave different output"
+run 0 random Random_Normal --count 5 --seed 43
+checks=$((checks + 1))
+cmp -s "$WORK/out" "$WORK/first" && fail "different seeds gave the same output"
+run 0 random Random_Normal 100 -2 --count 3 --seed 1
+run 0 random Random_Binomial2 100 0.3 --count 200 --seed 7
+checks=$((checks + 1))
+awk '!/^[0-9]+$/ || $1 > 100 { bad = 1 } END { exit bad }' "$WORK/out" ||
+  fail "Random_Binomial2 out of range: $(head -c 200 "$WORK/out")"
+run 0 random Random_Gamma 2.5 --count 1000 --seed 3
+checks=$((checks + 1))
+awk '{ s += $1; if ($1 <= 0) bad = 1 } END { m = s / NR; exit (bad || m < 2.2 || m > 2.8) }' \
+  "$WORK/out" || fail "Random_Gamma 2.5: mean off"
+run 0 random Random_MVNorm 0 0 1 0.5 1 --count 4 --seed 9
+checks=$((checks + 1))
+awk 'NF != 2 { bad = 1 } END { exit bad || NR != 4 }' "$WORK/out" || fail "Random_MVNorm lines"
+run 1 random Random_MVNorm 0 0 -1 0 1
+expect_err "not positive definite"
+run 2 random Random_MVNorm 0 0 1 0.5
+run 1 random Random_Gamma 0
+expect_no_out
+expect_err "Invalid shape parameter"
+run 0 random Random_Poisson 4 --count 0 --seed 1
+expect_no_out
+run 2 random Random_Gamma
+run 2 random NoSuchGenerator
+run 2 random Random_Normal --count -1
+run 2 random Random_Normal --seed x
+run 2 random
+run 0 random --list
+expect_line "Random_Gamma Shape"
+expect_line "Random_Binomial2 N P"
+
+echo "$checks checks, $failures failures"
+[ "$failures" -eq 0 ]
