@@ -11,6 +11,7 @@
 #include <array>
 #include <cmath>
 #include <cstdio>
+#include <cstdlib>
 #include <limits>
 #include <span>
 #include <string>
@@ -183,26 +184,48 @@ const Case<Ref4>& PoissonLessCase() {
   return c;
 }
 
+// The relative error of one value; a reference below 1e-30 in size (the zero of a quantile)
+// is compared absolutely.
+Extended RelativeError(Extended value, Extended expected) {
+  if (std::fabs(expected) < 1e-30L) return std::fabs(value - expected);
+  return std::fabs(value / expected - 1);
+}
+
+struct Errors {
+  Extended relative = 0;
+  Extended absolute = 0;
+};
+
 template <typename Row>
-Extended LargestRelativeError(const Case<Row>& c, Extended (*side)(const Row&)) {
-  Extended largest = 0;
+Errors LargestErrors(const Case<Row>& c, Extended (*side)(const Row&), const char* label) {
+  static const bool verbose = std::getenv("TOVRIN_BENCH_ROWS") != nullptr;
+  Errors largest;
   for (const Row& r : c.rows) {
     const Extended expected = c.expected(r);
     const Extended value = side(r);
-    const Extended error = expected == 0 ? std::fabs(value) : std::fabs(value / expected - 1);
-    if (!(error <= largest)) largest = error;  // a NaN sticks
+    const Extended relative = RelativeError(value, expected);
+    const Extended absolute = std::fabs(value - expected);
+    if (verbose) {
+      std::printf("  %s %s row (%g, %g): %.3e\n", c.name, label, static_cast<double>(r[0]),
+                  static_cast<double>(r[1]), static_cast<double>(relative));
+    }
+    if (!(relative <= largest.relative)) largest.relative = relative;  // a NaN sticks
+    if (!(absolute <= largest.absolute)) largest.absolute = absolute;
   }
   return largest;
 }
 
 template <typename Row>
 void ReportErrors(const Case<Row>& c) {
-  const double ours = static_cast<double>(LargestRelativeError(c, c.ours));
+  const Errors ours = LargestErrors(c, c.ours, "tovrin");
+  std::printf("| %-16s | %4zu | %9.2e | %9.2e |", c.name, c.rows.size(),
+              static_cast<double>(ours.relative), static_cast<double>(ours.absolute));
   if (c.boost != nullptr) {
-    std::printf("| %-16s | %2zu | %9.2e | %9.2e |\n", c.name, c.rows.size(), ours,
-                static_cast<double>(LargestRelativeError(c, c.boost)));
+    const Errors boost = LargestErrors(c, c.boost, "boost");
+    std::printf(" %9.2e | %9.2e |\n", static_cast<double>(boost.relative),
+                static_cast<double>(boost.absolute));
   } else {
-    std::printf("| %-16s | %2zu | %9.2e | %9s |\n", c.name, c.rows.size(), ours, "-");
+    std::printf(" %9s | %9s |\n", "-", "-");
   }
 }
 
@@ -243,8 +266,8 @@ void ForEachCase(F f) {
 }  // namespace
 
 int main(int argc, char** argv) {
-  std::printf("Largest relative error against the mpmath reference\n");
-  std::printf("| function         | rows | tovrin   | Boost    |\n");
+  std::printf("Largest errors against the mpmath reference (relative, absolute)\n");
+  std::printf("| function         | rows | tovrin rel | tovrin abs | Boost rel | Boost abs |\n");
   ForEachCase([](const auto& c) { ReportErrors(c); });
   std::printf("\n");
   ForEachCase([](const auto& c) { Register(c); });

@@ -27,6 +27,11 @@ constexpr std::string_view kHelp =
     "  tovrin eval BinomialBetween 0.5 4 1 3\n"
     "  tovrin eval AreaTriangle 3 4 5\n"
     "\n"
+    "Money values are written and printed as their stored integers: TQENCurrency is the\n"
+    "amount x 100, TQENLongCurrency x 1000000, Currency x 10000. An argument may name its\n"
+    "type, as in 'Currency2Float Currency:15000' (1.5), to choose among overloads; a bare\n"
+    "integer takes the first form listed.\n"
+    "\n"
     "An error raised by the function is printed on standard error (exit status 1).\n"
     "\n"
     "Options:\n"
@@ -61,6 +66,29 @@ void AddFoundation(CallableTable& t) {
   AddScalar<E, E, E>(t, "IncompleteBeta", {"X", "A", "B"}, TOVRIN_CALLABLE(IncompleteBeta));
   AddScalar<E, E, E>(t, "InverseIncompleteBeta", {"P", "A", "B"},
                      TOVRIN_CALLABLE(InverseIncompleteBeta));
+}
+
+void AddMoney(CallableTable& t) {
+  using C = TQENCurrency;
+  using L = TQENLongCurrency;
+  using Y = Currency;
+  AddScalar<C>(t, "Currency2Float", {"X:TQENCurrency"}, TOVRIN_CALLABLE(Currency2Float));
+  AddScalar<L>(t, "Currency2Float", {"X:TQENLongCurrency"}, TOVRIN_CALLABLE(Currency2Float));
+  AddScalar<Y>(t, "Currency2Float", {"X:Currency"}, TOVRIN_CALLABLE(Currency2Float));
+  AddScalar<E>(t, "Float2QENCurrency", {"X"}, TOVRIN_CALLABLE(Float2QENCurrency));
+  AddScalar<E>(t, "Float2QENLongCurrency", {"X"}, TOVRIN_CALLABLE(Float2QENLongCurrency));
+  AddScalar<C>(t, "QENCurrency2QENLongCurrency", {"X:TQENCurrency"},
+               TOVRIN_CALLABLE(QENCurrency2QENLongCurrency));
+  AddScalar<C>(t, "QENCurrency2Currency", {"X:TQENCurrency"},
+               TOVRIN_CALLABLE(QENCurrency2Currency));
+  AddScalar<L>(t, "QENLongCurrency2QENCurrency", {"X:TQENLongCurrency"},
+               TOVRIN_CALLABLE(QENLongCurrency2QENCurrency));
+  AddScalar<L>(t, "QENLongCurrency2Currency", {"X:TQENLongCurrency"},
+               TOVRIN_CALLABLE(QENLongCurrency2Currency));
+  AddScalar<Y>(t, "Currency2QENCurrency", {"X:Currency"}, TOVRIN_CALLABLE(Currency2QENCurrency));
+  AddScalar<Y>(t, "Currency2QENLongCurrency", {"X:Currency"},
+               TOVRIN_CALLABLE(Currency2QENLongCurrency));
+  AddScalar<Y, Y>(t, "SameCurrency", {"X:Currency", "Y:Currency"}, TOVRIN_CALLABLE(SameCurrency));
 }
 
 void AddSample(CallableTable& t) {
@@ -264,6 +292,7 @@ const CallableTable& EvalTable() {
   static const CallableTable table = [] {
     CallableTable t;
     AddFoundation(t);
+    AddMoney(t);
     AddSample(t);
     AddContinuous(t);
     AddDiscrete(t);

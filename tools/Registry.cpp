@@ -26,11 +26,17 @@ std::function<std::string()> BindByName(const CallableTable& Table, const std::s
   if (found.empty()) {
     throw UsageError("unknown " + What + " '" + Name + "' (the names are case-sensitive)");
   }
+  bool other_overload = false;
   for (const Callable* entry : found) {
     if (entry->variadic || entry->params.size() == Arguments.size()) {
-      return entry->bind(Arguments);
+      try {
+        return entry->bind(Arguments);
+      } catch (const OtherOverload&) {
+        other_overload = true;
+      }
     }
   }
+  if (other_overload) throw UsageError(Name + " has no form for those money types");
   std::string message = Name + " does not take " + std::to_string(Arguments.size()) + " argument" +
                         (Arguments.size() == 1 ? "" : "s") + "; it takes:";
   for (const Callable* entry : found) message += "\n  " + Signature(*entry);

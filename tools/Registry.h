@@ -36,9 +36,39 @@ using CallableTable = std::vector<Callable>;
 // looked up only when the lambda is instantiated with the argument types.
 #define TOVRIN_CALLABLE(Name) [](auto&&... a) -> decltype(Name(a...)) { return Name(a...); }
 
+// Raised while binding when a money argument names another money type than the signature's:
+// the next signature of the same name is tried.
+struct OtherOverload {};
+
+template <typename T>
+constexpr const char* MoneyTypeName() {
+  if constexpr (std::is_same_v<T, TQENCurrency>)
+    return "TQENCurrency";
+  else if constexpr (std::is_same_v<T, TQENLongCurrency>)
+    return "TQENLongCurrency";
+  else
+    return "Currency";
+}
+
 template <typename T>
 T ParseArgument(const std::string& Text, const std::string& Name) {
-  if constexpr (std::is_same_v<T, Extended>) {
+  if constexpr (std::is_enum_v<T>) {
+    // Money is written as its stored integer, optionally tagged with its type
+    // ("Currency:15000" is the Currency amount 1.5), which chooses among overloads.
+    std::string digits = Text;
+    if (const auto colon = Text.find(':'); colon != std::string::npos) {
+      const std::string type = Text.substr(0, colon);
+      if (type != "TQENCurrency" && type != "TQENLongCurrency" && type != "Currency") {
+        throw UsageError(Name + ": unknown money type '" + type + "'");
+      }
+      if (type != MoneyTypeName<T>()) throw OtherOverload{};
+      digits = Text.substr(colon + 1);
+    }
+    using Stored = std::underlying_type_t<T>;
+    return static_cast<T>(static_cast<Stored>(ParseSignedArgument(
+        digits, Name + " (" + MoneyTypeName<T>() + ", the stored integer)",
+        std::numeric_limits<Stored>::min(), std::numeric_limits<Stored>::max())));
+  } else if constexpr (std::is_same_v<T, Extended>) {
     return ParseRealArgument(Text, Name);
   } else if constexpr (std::is_same_v<T, bool>) {
     if (Text == "True" || Text == "true" || Text == "1") return true;
@@ -60,6 +90,8 @@ std::string FormatResult(const R& Result) {
     return FormatSignificant(static_cast<Extended>(Result));
   } else if constexpr (std::is_integral_v<R>) {
     return std::to_string(Result);
+  } else if constexpr (std::is_enum_v<R>) {
+    return std::to_string(static_cast<std::underlying_type_t<R>>(Result));
   } else {
     return std::string(Result);
   }

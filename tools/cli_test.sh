@@ -43,6 +43,12 @@ expect_err() {
   checks=$((checks + 1))
   grep -qF -- "$1" "$WORK/err" || fail "stderr lacks '$1': $(cat "$WORK/err")"
 }
+# expect_near VALUE TOLERANCE: stdout is one number within TOLERANCE of VALUE.
+expect_near() {
+  checks=$((checks + 1))
+  awk -v want="$1" -v tol="$2" 'NR == 1 { d = $1 - want; if (d < 0) d = -d; ok = (d <= tol) }
+      END { exit !(ok && NR == 1) }' "$WORK/out" || fail "expected $1 +- $2, got $(cat "$WORK/out")"
+}
 expect_no_out() {
   checks=$((checks + 1))
   [ ! -s "$WORK/out" ] || fail "stdout should be empty: $(head -c 300 "$WORK/out")"
@@ -266,9 +272,11 @@ checks=$((checks + 1))
 # 21 significant digits: 0. then 21 digits.
 grep -qE '^0\.975002104851[0-9]{9}$' "$WORK/out" || fail "NormalLess 1.96: $(cat "$WORK/out")"
 run 0 eval BetaDistLess 0.5 2 2
-expect_out "0.5"
+expect_near 0.5 1e-15
 run 0 eval BetaDistLess 5 2 2 0 10
-expect_out "0.5"
+expect_near 0.5 1e-15
+run 0 eval BetaDistLess 2.5 2 2 10 0  # bounds in either order
+expect_near 0.15625 1e-15
 run 0 eval LineIntersection 0 0 2 2 0 2 2 0
 expect_out "True
 X${TAB}1
@@ -278,6 +286,18 @@ expect_out "True"
 run 0 eval GetCircleWithPoints 0 0 2 0 0 2
 expect_line "CX${TAB}1"
 expect_line "CY${TAB}1"
+run 0 eval Currency2Float 150
+expect_out "1.5"
+run 0 eval Currency2Float Currency:15000
+expect_out "1.5"
+run 0 eval Currency2Float TQENLongCurrency:1500000
+expect_out "1.5"
+run 0 eval Float2QENCurrency 0.125
+expect_out "12"
+run 0 eval SameCurrency Currency:5 5
+expect_out "True"
+run 2 eval Currency2Float Euro:1
+run 2 eval QENCurrency2Currency Currency:1
 run 1 eval AreaTriangle 1 1 3
 expect_no_out
 expect_err "Sides do not form a triangle"

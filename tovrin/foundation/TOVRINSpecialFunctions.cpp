@@ -473,6 +473,8 @@ Extended InverseBetaLowerHalf(Extended p, Extended q, Extended a, Extended b, Be
   Extended x = start.x;
   if (!(x > lo && x < hi)) x = 0.25L;
   const bool use_lower = p <= 0.5L;
+  const Extended target = use_lower ? p : q;
+  bool hi_evaluated = false;
   for (int i = 0; i < kMaxIterations; ++i) {
     const BetaPoint pt = PointFromX(x);
     const BetaValues v = IncompleteBetaBoth(pt, a, b);
@@ -483,20 +485,37 @@ Extended InverseBetaLowerHalf(Extended p, Extended q, Extended a, Extended b, Be
       lo = x;
     } else {
       hi = x;
+      hi_evaluated = true;
     }
     const Extended density = v.factor / (pt.x * pt.y);
-    Extended next;
+    Extended next = kNaN;
     if (density > 0.0L && std::isfinite(density)) {
-      const Extended step = f / density;
-      // Halley's correction with f'' / f' = (a - 1)/x - (b - 1)/y.
-      const Extended curvature = (a - 1.0L) / pt.x - (b - 1.0L) / pt.y;
-      Extended denom = 1.0L - 0.5L * step * curvature;
-      if (!(denom > 0.5L && denom < 2.0L)) denom = 1.0L;
-      next = x - step / denom;
-    } else {
-      next = kNaN;
+      const Extended tail = use_lower ? v.lower : v.upper;
+      if (target < 0.01L && tail > 0.0L) {
+        // Far in a tail: Newton's method for ln(tail) as a function of ln x, close to a
+        // straight line there (the tail behaves as a power of x), so it converges from far
+        // away.
+        const Extended g = use_lower ? std::log(tail / p) : std::log(q / tail);
+        const Extended slope = x * density / tail;  // d ln(tail) / d ln x, up to sign
+        next = x * std::exp(-g / slope);
+      } else {
+        const Extended step = f / density;
+        // Halley's correction with f'' / f' = (a - 1)/x - (b - 1)/y.
+        const Extended curvature = (a - 1.0L) / pt.x - (b - 1.0L) / pt.y;
+        Extended denom = 1.0L - 0.5L * step * curvature;
+        if (!(denom > 0.5L && denom < 2.0L)) denom = 1.0L;
+        next = x - step / denom;
+      }
     }
-    if (!(next > lo && next < hi)) {
+    // Converged once the step falls below the rounding of x.
+    if (std::fabs(next - x) <= 4.0L * kEpsilon * x) return std::fmin(std::fmax(next, lo), hi);
+    if (next > hi && !hi_evaluated) {
+      // The root may sit on the end of the half (I_{1/2} = p exactly): try the end itself.
+      next = hi;
+    } else if (next == 0.0L && lo == 0.0L) {
+      // The step heads below the smallest number: try that before giving up on the range.
+      next = std::numeric_limits<Extended>::denorm_min();
+    } else if (!(next > lo && next <= hi)) {
       // Outside the bracket: halve it, geometrically when it spans decades.
       if (lo > 0.0L && hi > 16.0L * lo) {
         next = std::sqrt(lo) * std::sqrt(hi);
@@ -509,8 +528,7 @@ Extended InverseBetaLowerHalf(Extended p, Extended q, Extended a, Extended b, Be
         next = 0.5L * (lo + hi);
       }
     }
-    if (std::fabs(next - x) <= 2.0L * kEpsilon * x) return next;
-    if (next == lo || next == hi) return next;
+    if (next == x) return x;
     x = next;
   }
   return x;

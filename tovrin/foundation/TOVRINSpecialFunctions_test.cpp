@@ -176,12 +176,14 @@ TEST(SpecialBeta, SymmetricAndExactForSmallIntegers) {
 }
 
 TEST(SpecialBeta, DomainErrorsAndNaN) {
-  for (auto [a, b] : {std::pair{0.0L, 1.0L}, std::pair{1.0L, 0.0L}, std::pair{-1.0L, 2.0L},
-                      std::pair{2.0L, -kInf}}) {
-    const Extended a0 = a, b0 = b;
-    ExpectRaises([a, b] { Beta(a, b); }, rsArgOutsideDomain);
-    EXPECT_EQ(a, a0);
-    EXPECT_EQ(b, b0);
+  struct Args {
+    Extended a, b;
+  };
+  for (Args args : {Args{0.0L, 1.0L}, Args{1.0L, 0.0L}, Args{-1.0L, 2.0L}, Args{2.0L, -kInf}}) {
+    const Args before = args;
+    ExpectRaises([args] { Beta(args.a, args.b); }, rsArgOutsideDomain);
+    EXPECT_EQ(args.a, before.a);
+    EXPECT_EQ(args.b, before.b);
   }
   EXPECT_TRUE(std::isnan(Beta(kNaN, 1.0L)));
   EXPECT_TRUE(std::isnan(Beta(1.0L, kNaN)));

@@ -183,9 +183,13 @@ Extended DeterminantOf(MatrixOf<T>& M) {
   return d;
 }
 
+// Reads every row at its own length, so a ragged matrix needs no memory guard here (with the
+// switch off an empty row makes VectorZero raise rsVectorIsEmpty).
 template <typename T>
 LongWord ZeroRowsOf(const MatrixOf<T>& M) {
-  CheckReducible(M);
+  const detail::MatrixShape s = detail::ShapeOf(M);
+  if (s.Rows == 0 || s.Cols == 0) detail::RaiseMathError(rsMatrixIsEmpty);
+  if (!s.Rectangular) detail::RaiseMathError(rsMatrixRect);
   return CountZeroRows(M);
 }
 

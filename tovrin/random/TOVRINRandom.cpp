@@ -114,8 +114,8 @@ class ThreadSource {
 };
 
 // ---------------------------------------------------------------------------------------------
-// Conversions to integers. The methods truncate with the platform's Trunc, which faults on NaN
-// and on values past the Int64 range; here that is rsInvalidValue.
+// Conversions to integers. Truncating NaN or a value past the Int64 range has no integer
+// result (and would be undefined in C++): it raises rsInvalidValue.
 
 Int64 TruncChecked(Extended x) {
   const Extended t = std::trunc(x);
@@ -124,11 +124,12 @@ Int64 TruncChecked(Extended x) {
 }
 
 // For a candidate that a range test refuses next: values past either end of Int64 (from the
-// logarithm of a zero uniform) saturate, so the test sees them as out of range.
+// logarithm of a zero uniform) saturate, so the test sees them as out of range. NaN raises.
 Int64 TruncSaturated(Extended x) {
   const Extended t = std::trunc(x);
+  if (std::isnan(t)) RaiseMathError(rsInvalidValue);
   if (t >= 0x1p63L) return std::numeric_limits<Int64>::max();
-  if (!(t >= -0x1p63L)) return std::numeric_limits<Int64>::min();
+  if (t < -0x1p63L) return std::numeric_limits<Int64>::min();
   return static_cast<Int64>(t);
 }
 
@@ -142,8 +143,10 @@ double DrawDouble(Gen& gen) {
 }
 double DrawDouble(ThreadSource& gen) { return gen.NextDouble(); }
 
-// Leva's ratio of uniforms. The uniforms and the intermediates x, y, q are held as doubles on
-// purpose (the published method's precision); the rest is Extended.
+// Leva's ratio of uniforms. The uniforms, the transformed v and the intermediates x, y, q are
+// doubles computed in double arithmetic on purpose (the published method's precision, and the
+// fast path of every method built on the normal); the logarithmic test and the ratio are
+// Extended.
 template <typename Gen>
 Extended StandardNormal(Gen& gen) {
   double u;
@@ -151,13 +154,12 @@ Extended StandardNormal(Gen& gen) {
   for (;;) {
     u = DrawDouble(gen);
     v = DrawDouble(gen);
-    v = static_cast<double>((static_cast<Extended>(v) - 0.5L) * 1.7156L);
-    const double x = static_cast<double>(u - 0.449871L);
-    const double y = static_cast<double>(std::fabs(v) + 0.386595L);
-    const double q = static_cast<double>(static_cast<Extended>(x) * x +
-                                         static_cast<Extended>(y) * (0.196L * y - 0.25472L * x));
-    if (q < 0.27597L) break;
-    if (q > 0.27846L) continue;
+    v = (v - 0.5) * 1.7156;
+    const double x = u - 0.449871;
+    const double y = std::fabs(v) + 0.386595;
+    const double q = x * x + y * (0.196 * y - 0.25472 * x);
+    if (q < 0.27597) break;
+    if (q > 0.27846) continue;
     if (static_cast<Extended>(v) * v <
         -4.0L * static_cast<Extended>(u) * u * std::log(Extended{u})) {
       break;
@@ -220,20 +222,33 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
   if (shape < kTiny) RaiseMathError(rsShapeTooSmall);
   const Extended t = 1 - shape;
   const Extended p = t / (t + shape * std::exp(-t));
-  // Below this floor the body's candidate would underflow: such a draw gives 0 at once.
-  const Extended w0 = p * XtoY(kTiny / t, shape);
-  const Extended tLnT = t * std::log(t);
+  // Below the floor w0 = p (Tiny / t)^Shape the body's candidate would underflow: such a draw
+  // gives 0 at once. The power is costly, so w0 (and t ln t, needed by the tail only) are
+  // computed on first use. Since Tiny / t <= 1E-304 and p <= 1, w0 <= exp(-699 Shape): a
+  // uniform above twice that bound cannot lie under the floor, and w0 is needed only below it.
+  const double floorBound = 2 * std::exp(-699.0 * static_cast<double>(shape));
+  Extended w0 = 0;
+  bool haveW0 = false;
+  Extended tLnT = 0;
+  bool haveTLnT = false;
   for (;;) {
     const Extended u = gen();
     if (u >= 1) continue;
     Extended x;
     Extended w;
     if (u > p) {
+      if (!haveTLnT) {
+        tLnT = t * std::log(t);
+        haveTLnT = true;
+      }
       x = t - std::log((1 - u) / (1 - p));
       w = t * std::log(x) - tLnT;
-    } else if (u <= w0) {
-      return 0;
     } else {
+      if (u <= floorBound && !haveW0) {
+        w0 = p * XtoY(kTiny / t, shape);
+        haveW0 = true;
+      }
+      if (u <= floorBound && u <= w0) return 0;
       x = t * XtoY(u / p, 1 / shape);
       w = x;
     }

@@ -746,6 +746,27 @@ TEST(RandomPoisson, UnrepresentableMeanRaises) {
   }
 }
 
+TEST(RandomExtremes, LargeArgumentsStayWithinRangeWithoutOverflow) {
+  // Run under the undefined-behaviour sanitizer: no signed overflow, no bad conversion.
+  constexpr Int64 kMax = std::numeric_limits<Int64>::max();
+  EngineSource engine(31);
+  for (int i = 0; i < 200; ++i) {
+    const Int64 half = Random_Binomial2(kMax, 0.5L, engine);
+    EXPECT_GE(half, 0);
+    EXPECT_LE(half, kMax);
+    const Int64 most = Random_Binomial2(kMax, 0.9L, engine);
+    EXPECT_GT(most, kMax / 2);
+    const Int64 few = Random_Binomial2(kMax, 1e-18L, engine);  // N p = 9.2: inversion
+    EXPECT_GE(few, 1);
+    EXPECT_LT(few, 100);
+  }
+  const Int64 wide = Random_Binomial1(std::numeric_limits<LongInt>::max(), 0.5L, engine);
+  EXPECT_NEAR(static_cast<long double>(wide), 1073741823.5L, 30 * 23170.5L);
+  Extended mu = 1e18L;
+  EXPECT_NEAR(static_cast<long double>(Random_Poisson(mu, engine)), 1e18L, 1e10L);
+  EXPECT_GE(Random_Neg_Binomial(1e6L, 0.9L, engine), 0);  // a million geometric draws
+}
+
 // ---------------------------------------------------------------------------------------------
 // Distribution tests
 

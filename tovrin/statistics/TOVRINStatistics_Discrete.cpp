@@ -79,8 +79,12 @@ void CheckPoisson(Extended Mean) {
 Extended PoissonSumBelow(Extended Mean, Count Below) {
   // The last count's factorial decides, so an overflow raises before any term is summed.
   if (Below > Count{kLargestFactorial} + 1) RaiseMathError(rsFactOverflow);
+  // Each term is PoissonEq(Mean, k), evaluated the same way with exp(-Mean) formed once.
+  const Extended decay = std::exp(-Mean);
+  const auto& factorials = FactorialTable();
   Extended sum = 0;
-  for (Count k = 0; k < Below; ++k) sum += PoissonEq(Mean, static_cast<LongWord>(k));
+  for (Count k = 0; k < Below; ++k)
+    sum += decay * XtoY(Mean, static_cast<Extended>(k)) / factorials[k];
   return sum;
 }
 

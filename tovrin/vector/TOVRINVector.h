@@ -219,7 +219,8 @@ void LinearTransformVector(TQENDoubleVector& V, Double M, Double C);
 void LinearTransformVector(TQENSingleVector& V, Single M, Single C);
 void LinearTransformVector(TQENInt64Vector& V, Int64 M, Int64 C);
 
-// V[i] := Func(V[i]). Raises rsVectorIsEmpty. Whatever Func raises or returns passes through.
+// V[i] := Func(V[i]) in index order. Raises rsVectorIsEmpty. What Func returns is stored as
+// it is; an exception from Func passes through, the elements before it already transformed.
 void TransformVector(TQENFloatVector& V, const TQENFloatTransformFunc& Func);
 void TransformVector(TQENDoubleVector& V, const TQENDoubleTransformFunc& Func);
 void TransformVector(TQENSingleVector& V, const TQENSingleTransformFunc& Func);
@@ -354,6 +355,8 @@ Extended AngleBetweenVectors(const TQENLIntVector& V1, const TQENLIntVector& V2)
 // Conversions: a vector of the source's length, every element converted exactly
 // ============================================================================================
 
+// Array2...: from an open array (a span); Vector2...: from a vector. Signed sources are
+// sign-extended, unsigned ones zero-extended; only widening conversions are offered.
 TQENFloatVector Array2FloatVector(std::span<const Extended> A);
 TQENFloatVector Array2FloatVector(std::span<const Double> A);
 TQENFloatVector Array2FloatVector(std::span<const Single> A);

@@ -194,6 +194,9 @@ TEST(RankTest, FloatValuesWithinTheToleranceShareARank) {
   // Single compares at its own, coarser precision; Double and Extended do not see the tie.
   EXPECT_EQ(Vector2RankVector(TQENSingleVector{1.000001f, 1.0f}, true), (TQENLIntVector{0, 0}));
   EXPECT_EQ(Vector2RankVector(TQENDoubleVector{1.000001, 1.0}, true), (TQENLIntVector{1, 0}));
+  // Signed zeros and a value within the tolerance of zero are one group.
+  EXPECT_EQ(Vector2RankVector(TQENDoubleVector{1e-13, -0.0, 0.0, -1}, false),
+            (TQENLIntVector{0, 0, 0, 3}));
 }
 
 // The first-match scan of the sorted copy, written out plainly: the definition of a rank.
