@@ -132,16 +132,20 @@ void ReportErrors(const char* name, const char* who, F call) {
               worst);
 }
 
+// Seconds of CPU per call, printed with an SI prefix ("185n" is 185 ns).
+void SetPerCallCounter(benchmark::State& state, std::size_t calls_per_iteration) {
+  state.counters["per_call"] = benchmark::Counter(
+      static_cast<double>(state.iterations()) * static_cast<double>(calls_per_iteration),
+      benchmark::Counter::kIsRate | benchmark::Counter::kInvert);
+}
+
 template <typename Ops>
 void BM_Ours(benchmark::State& state) {
   const auto table = Ops::Table();
   for (auto _ : state) {
     for (const auto& row : table) benchmark::DoNotOptimize(Ops::Ours(row));
   }
-  state.counters["ns_per_call"] =
-      benchmark::Counter(static_cast<double>(state.iterations() * table.size()),
-                         benchmark::Counter::kIsRate | benchmark::Counter::kInvert);
-  state.counters["ns_per_call"] = state.counters["ns_per_call"] * 1e9;
+  SetPerCallCounter(state, table.size());
 }
 
 #ifdef TOVRIN_HAVE_BOOST
@@ -151,10 +155,7 @@ void BM_Boost(benchmark::State& state) {
   for (auto _ : state) {
     for (const auto& row : table) benchmark::DoNotOptimize(Ops::Boost(row));
   }
-  state.counters["ns_per_call"] =
-      benchmark::Counter(static_cast<double>(state.iterations() * table.size()),
-                         benchmark::Counter::kIsRate | benchmark::Counter::kInvert);
-  state.counters["ns_per_call"] = state.counters["ns_per_call"] * 1e9;
+  SetPerCallCounter(state, table.size());
 }
 #endif
 

@@ -19,6 +19,8 @@ constexpr std::string_view kHelp =
     "TQENDescStats component reports them.\n"
     "\n"
     "Numbers are separated by white space, commas or line ends; '#' starts a comment.\n"
+    "With no numbers at all the report is the single line 'Vector is empty' (with --json,\n"
+    "NoOfValues 0 and every statistic 0).\n"
     "\n"
     "Options:\n"
     "  --population   treat the numbers as a whole population (divisor n, not n - 1)\n"

@@ -137,6 +137,24 @@ run 0 describe --decimals 20 "$WORK/forms"
 expect_line "Minimum:${TAB}-25.00000000000000000000"
 expect_line "Maximum:${TAB}3.00000000000000000000"
 
+# A file of several 1 MiB read blocks: tokens and long comments cut by block ends.
+# Values i + 0.5 for i = 0 .. 199999 sum to 200000^2 / 2.
+python3 - "$WORK/big" <<'PY'
+import sys
+with open(sys.argv[1], "w") as f:
+    for i in range(200000):
+        f.write("%d.5%s" % (i, ",\n" if i % 3 else " "))
+        if i % 997 == 0:
+            f.write("# " + "comment 1 2 3 " * 700 + "\n")
+PY
+run 0 describe --decimals 1 "$WORK/big"
+expect_line "Number of Values:${TAB}200000"
+expect_line "Sum:${TAB}20000000000.0"
+expect_line "Minimum:${TAB}0.5"
+expect_line "Maximum:${TAB}199999.5"
+STDIN=$WORK/big run 0 describe --decimals 1
+expect_line "Sum:${TAB}20000000000.0"
+
 # JSON.
 run 0 describe --json "$DATA"
 checks=$((checks + 1))

@@ -48,16 +48,30 @@ Extended QENTan(Extended X);
 Extended QENDistance(Extended X1, Extended Y1, Extended X2, Extended Y2);
 
 // --- Special functions ----------------------------------------------------------------------
-// Gamma(X) for X not zero or a negative integer (raises rsGammaPole there); overflows to
-// +inf past about 1755.5. LnGamma(X) is ln|Gamma(X)|, raising rsGammaPole at the poles.
+// All five work in the 80-bit type: on their tested domains the relative error is within a few
+// units of 1e-19 for Gamma, LnGamma and Beta and within 1e-16 for the incomplete beta and its
+// inverse (see TOVRINSpecialFunctions_test.cpp and its reference table). A NaN argument gives
+// NaN; no loop runs without a bound.
+//
+// Gamma(X) for X not zero or a negative integer; rsGammaPole there and at -inf. Finite up to
+// X = 1755.5 (so 1754! = Gamma(1755) is finite), +inf beyond; for X below about -1760 the
+// result underflows to a signed zero.
 Extended Gamma(Extended X);
+// LnGamma(X) = ln|Gamma(X)|, finite for every finite X that is not a pole (rsGammaPole at the
+// poles and at -inf); +inf at +inf. Near its zeros on the negative axis (between -2 and -4 and
+// so on) the error is absolute, about 1e-19, rather than relative.
 Extended LnGamma(Extended X);
-// Beta(A, B) = Gamma(A) Gamma(B) / Gamma(A + B) for A, B > 0 (rsArgOutsideDomain otherwise).
+// Beta(A, B) = Gamma(A) Gamma(B) / Gamma(A + B) for A, B > 0 (rsArgOutsideDomain otherwise,
+// including -inf); 0 when a shape is +inf; over- and underflows to +inf and 0.
 Extended Beta(Extended A, Extended B);
-// The regularised incomplete beta function I_X(A, B) for 0 <= X <= 1 and A, B > 0;
-// I_0 = 0 and I_1 = 1 exactly. Raises rsArgOutsideDomain outside that domain.
+// The regularised incomplete beta function I_X(A, B) for 0 <= X <= 1 and A, B > 0
+// (rsArgOutsideDomain outside that domain); I_0 = 0 and I_1 = 1 exactly. An infinite shape
+// gives 0 (A) or 1 (B), two infinite shapes NaN. Shapes beyond 1e10 use the leading term of an
+// asymptotic expansion (relative error about 1/sqrt(min(A, B))).
 Extended IncompleteBeta(Extended X, Extended A, Extended B);
-// The X in [0, 1] with I_X(A, B) = P, for 0 <= P <= 1 and A, B > 0.
+// The X in [0, 1] with I_X(A, B) = P, for 0 <= P <= 1 and A, B > 0 (rsArgOutsideDomain
+// otherwise); P = 0 and P = 1 give 0 and 1. A root below the smallest subnormal gives 0.
+// Its relative error is that of I_X divided by about min(A, 1).
 Extended InverseIncompleteBeta(Extended P, Extended A, Extended B);
 
 }  // namespace tovrin

@@ -35,6 +35,8 @@ constexpr Extended kSqrt2Pi = 2.50662827463100050241576528481104525L;
 constexpr Extended kHalfLn2Pi = 0.918938533204672741780329736405617640L;
 constexpr Extended kLnPi = 1.14472988584940017414342735135305871L;
 
+// Shapes below this put all of the mass at the ends to the working precision.
+constexpr Extended kTinyShape = 1e-4000L;
 // Stirling's series is used from here on; below it the arguments are shifted.
 constexpr Extended kStirlingStart = 12.0L;
 // Gamma(x) overflows the 80-bit range a little above 1755.4; past this it is +inf.
@@ -246,6 +248,11 @@ Extended ScaledPower(Extended x_hi, Extended x_lo, Extended a, Extended b, Exten
 Extended BetaFinite(Extended a, Extended b) {
   if (a > b) std::swap(a, b);
   const Extended c = a + b;
+  if (c <= 0.5L) {
+    // Both tiny: with 1/Gamma(z) = z P(z), B = (c / (a b)) P(c) / (P(a) P(b)), free of the
+    // infinities that Gamma(a) and Gamma(b) may reach.
+    return (c / a) / b * (RecipGamma1p(c) / (RecipGamma1p(a) * RecipGamma1p(b)));
+  }
   if (b < kStirlingStart) {
     return GammaFinite(a) * (GammaFinite(b) / GammaFinite(c));
   }
@@ -401,6 +408,32 @@ Extended BetaContinuedFraction(const BetaPoint& p, Extended a, Extended b, Exten
   return r;
 }
 
+// With a small b and x close to 1 the continued fraction loses a few bits, while the
+// complement I_y(b, a) is then given quickly by its series of positive terms
+//   I_y(b, a) = x^a y^b / (b B(a, b)) sum_n (a + b)_n / (b + 1)_n y^n.
+// Used when the lower tail 1 - I_y(b, a) stays above 1/64, so that the subtraction costs at most
+// six bits; returns false when it does not apply.
+bool ComplementBySeries(const BetaPoint& p, Extended a, Extended b, Extended factor,
+                        Extended& lower, Extended& upper) {
+  constexpr int kMaxTerms = 1000;
+  const Extended y = p.y;
+  const Extended c = a + b;
+  if (!(b <= 1.0L && y <= 0.0078125L && c * y <= 32.0L)) return false;
+  Extended term = 1.0L;
+  Extended sum = 1.0L;
+  for (int n = 0; n < kMaxTerms; ++n) {
+    const Extended nn = static_cast<Extended>(n);
+    term *= (c + nn) * y / (b + 1.0L + nn);
+    sum += term;
+    if (term <= kEpsilon * 0.125L * sum && (c + nn) * y < b + 1.0L + nn) break;
+  }
+  const Extended complement = factor * sum / b;
+  if (!(complement <= 1.0L - 1.0L / 64.0L)) return false;
+  upper = complement;
+  lower = 1.0L - complement;
+  return true;
+}
+
 // I_x(a, b) and its complement 1 - I_x(a, b), each to full relative accuracy when it is the
 // smaller of the two (the larger is 1 - the smaller), and the factor x^a y^b / B(a, b).
 struct BetaValues {
@@ -408,6 +441,21 @@ struct BetaValues {
   Extended upper;
   Extended factor;
 };
+
+// Beyond this the continued fraction would need more than about 10^5 steps near the mean.
+constexpr Extended kHugeShape = 1e10L;
+
+// Both shapes beyond kHugeShape: the leading term of Temme's uniform asymptotic expansion,
+// I = erfc(sqrt(E)) / 2 below the mean with E = a phi(-lambda/a) + b phi(lambda/b); its
+// relative error is of the order of 1/sqrt(min(a, b)).
+BetaValues HugeShapeBeta(const BetaPoint& p, Extended a, Extended b, Extended lambda, bool swap) {
+  const Extended exponent =
+      ShapeTimesPhi(a, -lambda / a, -lambda) + ShapeTimesPhi(b, lambda / b, lambda);
+  const Extended tail = 0.5L * std::erfc(std::sqrt(exponent));
+  const Extended factor = BetaPowerFactor(p, a, b, lambda);
+  if (swap) return {1.0L - tail, tail, factor};
+  return {tail, 1.0L - tail, factor};
+}
 
 BetaValues IncompleteBetaBoth(const BetaPoint& p, Extended a, Extended b) {
   // Below the mean (lambda >= 0) I_x is the smaller tail and is computed directly; above it
@@ -417,10 +465,16 @@ BetaValues IncompleteBetaBoth(const BetaPoint& p, Extended a, Extended b) {
   const BetaPoint q = swap ? Swapped(p) : p;
   const Extended sa = swap ? b : a;
   const Extended sb = swap ? a : b;
+  if (std::fmin(a, b) > kHugeShape) return HugeShapeBeta(q, sa, sb, std::fabs(lambda), swap);
   const Extended factor = BetaPowerFactor(q, sa, sb, swap ? -lambda : lambda);
-  const Extended tail = factor * BetaContinuedFraction(q, sa, sb, std::fabs(lambda));
-  if (swap) return {1.0L - tail, tail, factor};
-  return {tail, 1.0L - tail, factor};
+  Extended tail;
+  Extended other;
+  if (!ComplementBySeries(q, sa, sb, factor, tail, other)) {
+    tail = factor * BetaContinuedFraction(q, sa, sb, std::fabs(lambda));
+    other = 1.0L - tail;
+  }
+  if (swap) return {other, tail, factor};
+  return {tail, other, factor};
 }
 
 bool AnyNaN(Extended a, Extended b, Extended c) {
@@ -565,6 +619,12 @@ Extended IncompleteBeta(Extended X, Extended A, Extended B) {
   if (std::isinf(A) || std::isinf(B)) {
     if (std::isinf(A) && std::isinf(B)) return kNaN;
     return std::isinf(A) ? 0.0L : 1.0L;
+  }
+  if (A < kTinyShape || B < kTinyShape) {
+    // The mass sits at the two ends, B / (A + B) of it at 0; anything else in I_x is below
+    // A |ln x| + B |ln y| < 2^-64.
+    if (A < kTinyShape && B < kTinyShape) return B / (A + B);
+    return A < kTinyShape ? 1.0L : 0.0L;
   }
   return IncompleteBetaBoth(PointFromX(X), A, B).lower;
 }

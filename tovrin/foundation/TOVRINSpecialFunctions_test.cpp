@@ -175,6 +175,16 @@ TEST(SpecialBeta, SymmetricAndExactForSmallIntegers) {
   EXPECT_EQ(Beta(0.1L, 3e4L), Beta(3e4L, 0.1L));
 }
 
+TEST(SpecialBeta, TinyAndHugeShapes) {
+  // B(a, b) = 1/a + 1/b + O(1) for tiny shapes; over- and underflow give +inf and 0.
+  EXPECT_LE(RelativeError(Beta(1e-3000L, 3e-3000L), 1e3000L + 1e3000L / 3.0L), 1e-18L);
+  EXPECT_EQ(Beta(1e-4940L, 1e-4940L), kInf);
+  EXPECT_EQ(Beta(1e300L, 1e300L), 0.0L);
+  // B(a, 1/2) = sqrt(pi / a) (1 + O(1/a)).
+  EXPECT_LE(RelativeError(Beta(1e4000L, 0.5L), std::sqrt(3.14159265358979323846L) * 1e-2000L),
+            1e-18L);
+}
+
 TEST(SpecialBeta, DomainErrorsAndNaN) {
   struct Args {
     Extended a, b;
@@ -224,6 +234,29 @@ TEST(SpecialIncompleteBeta, ReflectionSumsToOne) {
       EXPECT_NEAR(IncompleteBeta(x, a, b) + IncompleteBeta(1.0L - x, b, a), 1.0L, 4e-19L);
     }
   }
+}
+
+TEST(SpecialIncompleteBeta, SymmetricShapesGiveOneHalfAtTheMiddle) {
+  // I_{1/2}(a, a) = 1/2 exactly, from small shapes to the hard region of large ones.
+  for (Extended a : {1e-3L, 0.5L, 3.0L, 47.5L, 1e3L, 1e5L}) {
+    EXPECT_NEAR(IncompleteBeta(0.5L, a, a), 0.5L, 2e-19L) << static_cast<double>(a);
+  }
+}
+
+TEST(SpecialIncompleteBeta, ExtremeShapes) {
+  // Shapes so small that all of the mass sits at the ends, B / (A + B) of it at 0.
+  EXPECT_EQ(IncompleteBeta(0.3L, 1e-4500L, 2.0L), 1.0L);
+  EXPECT_EQ(IncompleteBeta(0.3L, 2.0L, 1e-4500L), 0.0L);
+  EXPECT_LE(RelativeError(IncompleteBeta(0.3L, 3e-4500L, 1e-4500L), 0.25L), 1e-15L);
+  // Shapes beyond 1e10: the normal limit, centred on the mean.
+  EXPECT_EQ(IncompleteBeta(0.5L, 1e300L, 1e300L), 0.5L);
+  // One standard deviation (1 / sqrt(8e12)) below the mean: Phi(-1) = 0.158655253931457.
+  EXPECT_NEAR(IncompleteBeta(0.5L - 1.0L / std::sqrt(8e12L), 1e12L, 1e12L), 0.158655253931457L,
+              1e-6L);
+  EXPECT_EQ(IncompleteBeta(0.4L, 1e300L, 1e300L), 0.0L);
+  // Infinite shapes.
+  EXPECT_EQ(IncompleteBeta(0.5L, kInf, 2.0L), 0.0L);
+  EXPECT_EQ(IncompleteBeta(0.5L, 2.0L, kInf), 1.0L);
 }
 
 TEST(SpecialIncompleteBeta, DomainErrorsLeaveArgumentsAlone) {
@@ -298,6 +331,15 @@ TEST(SpecialInverseIncompleteBeta, EndsAndMonotonicity) {
   }
   // I_x(1, 1) = x.
   EXPECT_LE(RelativeError(InverseIncompleteBeta(0.3L, 1.0L, 1.0L), 0.3L), 1e-18L);
+}
+
+TEST(SpecialInverseIncompleteBeta, ExtremeShapesAndTails) {
+  EXPECT_EQ(InverseIncompleteBeta(0.5L, 1e300L, 1e300L), 0.5L);
+  // A root far below the smallest subnormal comes back as 0, and quickly.
+  EXPECT_EQ(InverseIncompleteBeta(1e-300L, 1e-3L, 2.0L), 0.0L);
+  EXPECT_EQ(InverseIncompleteBeta(1.0L - 1e-18L, 2.0L, 1e-3L), 1.0L);
+  // I_x(1, 1) = x far down in the tail.
+  EXPECT_LE(RelativeError(InverseIncompleteBeta(1e-300L, 1.0L, 1.0L), 1e-300L), 1e-18L);
 }
 
 TEST(SpecialInverseIncompleteBeta, DomainErrorsAndNaN) {

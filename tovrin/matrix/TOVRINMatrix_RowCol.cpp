@@ -109,22 +109,66 @@ void MultiplyRoundingEachStep(const MatrixOf<T>& M1, const MatrixOf<T>& M2, Matr
   }
 }
 
-// The Extended member accumulates in a row of native Extended values (no rounding happens
-// when they are finally packed).
+// k-ascending sum of B[k] x A[k] in Extended, starting from 0.
+Extended DotInOrder(const Extended* A, const Extended* B, std::size_t Inner) {
+  Extended c = 0;
+  for (std::size_t k = 0; k < Inner; ++k) c = c + B[k] * A[k];
+  return c;
+}
+
+// The Extended member: no rounding between steps, so an element can be accumulated in a
+// register from start to end. M1's rows and M2's columns are first unpacked into native
+// Extended arrays (M2 transposed, so that a column is contiguous), then 2 x 2 blocks of the
+// result are formed together, which loads each operand value once for two products.
 void MultiplyExtended(const TQENFloatMatrix& M1, const TQENFloatMatrix& M2, TQENFloatMatrix& r,
                       std::size_t Inner, std::size_t Cols) {
-  std::vector<Extended> acc(Cols);
-  std::vector<Extended> b(Cols);
-  for (std::size_t i = 0; i < r.size(); ++i) {
-    std::fill(acc.begin(), acc.end(), Extended{0});
-    const PackedExtended* a = M1[i].data();
+  const std::size_t rows = r.size();
+  std::vector<Extended> columns(Cols * Inner);  // column j of M2 at [j * Inner]
+  for (std::size_t k = 0; k < Inner; ++k) {
+    const PackedExtended* b = M2[k].data();
+    for (std::size_t j = 0; j < Cols; ++j) columns[j * Inner + k] = b[j];
+  }
+  std::vector<Extended> pair(2 * Inner);  // two rows of M1
+  std::size_t i = 0;
+  for (; i + 2 <= rows; i += 2) {
+    const PackedExtended* s0 = M1[i].data();
+    const PackedExtended* s1 = M1[i + 1].data();
     for (std::size_t k = 0; k < Inner; ++k) {
-      const Extended aik = a[k];
-      const PackedExtended* bk = M2[k].data();
-      for (std::size_t j = 0; j < Cols; ++j) acc[j] = acc[j] + static_cast<Extended>(bk[j]) * aik;
+      pair[k] = s0[k];
+      pair[Inner + k] = s1[k];
     }
-    PackedExtended* out = r[i].data();
-    for (std::size_t j = 0; j < Cols; ++j) out[j] = acc[j];
+    const Extended* a0 = pair.data();
+    const Extended* a1 = a0 + Inner;
+    PackedExtended* out0 = r[i].data();
+    PackedExtended* out1 = r[i + 1].data();
+    std::size_t j = 0;
+    for (; j + 2 <= Cols; j += 2) {
+      const Extended* b0 = &columns[j * Inner];
+      const Extended* b1 = b0 + Inner;
+      Extended c00 = 0, c01 = 0, c10 = 0, c11 = 0;
+      for (std::size_t k = 0; k < Inner; ++k) {
+        const Extended x0 = a0[k], x1 = a1[k], y0 = b0[k], y1 = b1[k];
+        c00 = c00 + y0 * x0;
+        c01 = c01 + y1 * x0;
+        c10 = c10 + y0 * x1;
+        c11 = c11 + y1 * x1;
+      }
+      out0[j] = c00;
+      out0[j + 1] = c01;
+      out1[j] = c10;
+      out1[j + 1] = c11;
+    }
+    for (; j < Cols; ++j) {
+      out0[j] = DotInOrder(a0, &columns[j * Inner], Inner);
+      out1[j] = DotInOrder(a1, &columns[j * Inner], Inner);
+    }
+  }
+  for (; i < rows; ++i) {
+    const PackedExtended* s0 = M1[i].data();
+    for (std::size_t k = 0; k < Inner; ++k) pair[k] = s0[k];
+    for (std::size_t j = 0; j < Cols; ++j) {
+      r[i][j] = DotInOrder(pair.data(), &columns[j * Inner], Inner);
+    }
   }
 }
 

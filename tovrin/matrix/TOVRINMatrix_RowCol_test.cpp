@@ -380,7 +380,8 @@ Matrix<T> ProductByDefinition(const Matrix<T>& A, const Matrix<T>& B) {
 TYPED_TEST(RowColProduct, BitForBitTheDefinedOrder) {
   std::mt19937_64 gen(12345);
   std::uniform_real_distribution<double> u(-1.0, 1.0);
-  for (auto [n, m, p] : {std::tuple{7, 5, 9}, std::tuple{1, 13, 1}, std::tuple{16, 16, 16}}) {
+  for (auto [n, m, p] : {std::tuple{7, 5, 9}, std::tuple{6, 3, 5}, std::tuple{3, 4, 2},
+                         std::tuple{1, 13, 1}, std::tuple{16, 16, 16}}) {
     Matrix<TypeParam> a(n, std::vector<TypeParam>(m)), b(m, std::vector<TypeParam>(p));
     for (auto& row : a) {
       for (auto& x : row) x = TypeParam(static_cast<long double>(u(gen)) / 3);

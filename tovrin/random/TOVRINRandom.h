@@ -45,7 +45,7 @@ void Randomize();
 // callable object such as a capturing lambda. It does not own or copy the callable: it holds a
 // pointer to it, so the callable must outlive every call made through the reference (a lambda
 // written in the argument list of a generator call lives long enough). Copying the reference
-// and calling through it never allocates.
+// and calling through it never allocates. A function pointer passed in must not be null.
 class TRandomGenFunction {
  public:
   template <typename F>

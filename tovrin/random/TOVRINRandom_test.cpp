@@ -203,6 +203,17 @@ TEST(VerdanRandom, SeedingMakesTheCallingThreadReproducible) {
   EXPECT_NE(VerdanRandom(), first[0]);
 }
 
+TEST(VerdanRandom, RandomizeSeedsFromTheClock) {
+  SetRandSeed(0);
+  const Extended seeded = VerdanRandom();
+  Randomize();
+  const Extended first = VerdanRandom();
+  Randomize();
+  const Extended second = VerdanRandom();
+  EXPECT_NE(first, seeded);
+  EXPECT_NE(first, second);
+}
+
 TEST(VerdanRandom, ThreadsDrawDistinctStreamsConcurrently) {
   SetRandSeed(5);
   constexpr int kThreads = 4;

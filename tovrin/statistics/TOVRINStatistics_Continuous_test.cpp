@@ -530,6 +530,85 @@ TEST(BetaTest, Checks) {
   ExpectRaises(rsSameValue, [] { BetaPDF(0.5L, 2, 3, 2, 2); });
 }
 
+// === Non-finite arguments ======================================================================
+
+// Every function given NaN or an infinity in each argument either raises its family's
+// identifier or returns; none may loop for ever (the test would time out).
+TEST(NonFiniteTest, EveryFunctionReturnsOrRaises) {
+  const Extended odd[] = {kNaN, kInf, -kInf};
+  // Each call on its own, so that a raise in one does not skip the others.
+  const auto tryCall = [](auto call) {
+    try {
+      (void)call();
+    } catch (const EMathError&) {
+    }
+  };
+  TQENFloatVector xs, ys;
+  for (Extended v : odd) {
+    tryCall([&] { return NormalZ(v); });
+    tryCall([&] { return NormalLess(v); });
+    tryCall([&] { return NormalGreater(v); });
+    tryCall([&] { return InvNormalLess(v); });
+    tryCall([&] { return InvNormalGreater(v); });
+    tryCall([&] { return ZAlpha(v); });
+    for (int slot = 0; slot < 3; ++slot) {
+      Extended a[3] = {0, 1, 0.5L};
+      a[slot] = v;
+      tryCall([&] { return NormalPDF(a[0], a[1], a[2]); });
+      tryCall([&] { return NormalDistLess(a[0], a[1], a[2]); });
+      tryCall([&] { return NormalDistBetween(a[0], a[1], a[2], 1); });
+      tryCall([&] { return InvNormalDistLess(a[0], a[1], a[2]); });
+      tryCall([&] { return InvLogNormalGreater(a[0], a[1], a[2]); });
+      tryCall([&] { return LogNormalPDF(a[0], a[1], a[2]); });
+      tryCall([&] { return LogNormalLess(a[0], a[1], a[2]); });
+      tryCall([&] { return BetaDistLess(a[2], a[0] + 2, a[1]); });
+      tryCall([&] { return InvBetaDistLess(a[2], a[1], a[0] + 2); });
+      tryCall([&] { return BetaPDF(a[2], a[1], 2, a[0], 3); });
+      tryCall([&] { return BetaDistLess(a[1], 2, 3, a[0], a[2]); });
+      tryCall([&] { return ExponentialLess(a[1], a[2]); });
+      tryCall([&] { return ExponentialPDF(a[2], a[1]); });
+      tryCall([&] {
+        NormalPDFValues(a[0], a[1], a[2], 1, 3, xs, ys);
+        return 0;
+      });
+      tryCall([&] {
+        ChiSquarePDFValues(3, a[2], a[0], 3, xs, ys);
+        return 0;
+      });
+      tryCall([&] {
+        LogNormalPDFValues(a[0], a[1], a[2], 2, 3, xs, ys);
+        return 0;
+      });
+    }
+    tryCall([&] { return IncompleteGamma(v, 2); });
+    tryCall([&] { return IncompleteGamma(2, v); });
+    tryCall([&] { return IncompleteGamma2(v, 1); });
+    tryCall([&] { return IncompleteGamma2(1, v); });
+    for (LongWord df : {1U, 7U, 4294967295U}) {
+      tryCall([&] { return ChiSquareLess(v, df); });
+      tryCall([&] { return ChiSquarePDF(v, df); });
+      tryCall([&] { return InvChiSquareLess(v, df); });
+      tryCall([&] { return FDistLess(v, df, 3); });
+      tryCall([&] { return FDistPDF(v, 3, df); });
+      tryCall([&] { return InvFDistLess(v, df, 3); });
+      tryCall([&] { return StudentTLess(v, df); });
+      tryCall([&] { return StudentTPDF(v, df); });
+      tryCall([&] { return InvStudentTLess(v, df); });
+    }
+  }
+  // Extreme but finite degrees of freedom, probabilities and shapes.
+  tryCall([] { return InvChiSquareLess(0.5L, 4294967295U); });
+  tryCall([] { return InvChiSquareLess(0.999998L, 1); });
+  tryCall([] { return InvStudentTLess(1e-4000L, 3); });
+  tryCall([] { return InvStudentTLess(0.3L, 4294967295U); });
+  tryCall([] { return InvFDistLess(1e-4000L, 4294967295U, 4294967295U); });
+  tryCall([] { return InvFDistLess(0.5L, 1, 4294967295U); });
+  tryCall([] { return IncompleteGamma(1e300L, 1e7L); });
+  tryCall([] { return IncompleteGamma(9.9e7L, 9.9e7L); });
+  tryCall([] { return IncompleteGamma(1e-300L, 0.5L); });
+  SUCCEED();
+}
+
 // === Density tables ============================================================================
 
 // One table function with its density, for the shared tests below.

@@ -252,6 +252,40 @@ TEST(PoissonTest, Checks) {
   EXPECT_NO_THROW(PoissonLess(2, 1755));
 }
 
+// === Non-finite arguments ======================================================================
+
+// NaN and infinite probabilities and means give NaN or raise; the sums stay bounded by their
+// counts.
+TEST(DiscreteNonFiniteTest, ReturnsOrRaises) {
+  const auto tryCall = [](auto call) {
+    try {
+      (void)call();
+    } catch (const EMathError&) {
+    }
+  };
+  TQENFloatVector v;
+  TQENLIntVector counts;
+  for (Extended x : {kNaN, kInf, -kInf}) {
+    tryCall(
+        [&] { return BinomialEq(x, 10, 3) + BinomialLess(x, 10, 3) + BinomialGreater(x, 10, 3); });
+    tryCall([&] { return BinomialBetween(x, 10, 7, 2); });
+    tryCall([&] { return PoissonEq(x, 3); });
+    tryCall([&] { return PoissonLess(x, 1000); });
+    tryCall([&] { return PoissonGreater(x, 3); });
+    tryCall([&] { return PoissonBetween(x, 1, 5); });
+    tryCall([&] {
+      BinomialPDFValues(10, x, v);
+      return 0;
+    });
+    tryCall([&] {
+      PoissonPDFValues(10, x, counts, v);
+      return 0;
+    });
+  }
+  EXPECT_TRUE(std::isnan(PoissonEq(kNaN, 3)));
+  SUCCEED();
+}
+
 // === Tables ====================================================================================
 
 TEST(DiscreteTablesTest, Binomial) {
