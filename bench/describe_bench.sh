@@ -9,6 +9,7 @@ set -euo pipefail
 ROOT=$(cd "$(dirname "$0")/.." && pwd)
 BUILD=${1:-$ROOT/build/bench-cli}
 RUNS=${RUNS:-5}
+RUNS_ALL=$RUNS
 WORK=$(mktemp -d)
 trap 'rm -rf "$WORK"' EXIT
 
@@ -38,40 +39,41 @@ PY
 }
 make_numbers 1000000 "$WORK/1e6.txt"
 
-# Best and median wall time of RUNS runs, in seconds.
+# Over RUNS runs: best and median wall time, best CPU time (user + system), in seconds, and
+# the peak resident memory in KiB.
 time_runs() {
-  local times=()
+  : >"$WORK/times"
   for _ in $(seq "$RUNS"); do
-    local start end
-    start=$(date +%s.%N)
-    "$@" >/dev/null
-    end=$(date +%s.%N)
-    times+=("$(awk -v a="$start" -v b="$end" 'BEGIN { print b - a }')")
+    /usr/bin/time -f '%e %U %S %M' -o "$WORK/time" "$@" >/dev/null
+    cat "$WORK/time" >>"$WORK/times"
   done
-  printf '%s\n' "${times[@]}" | sort -g | awk '{ t[NR] = $1 } END { printf "%.3f %.3f", t[1], t[int((NR + 1) / 2)] }'
+  local wall_best wall_median cpu_best rss
+  wall_best=$(awk '{ print $1 }' "$WORK/times" | sort -g | head -n1)
+  wall_median=$(awk '{ print $1 }' "$WORK/times" | sort -g | sed -n "$(((RUNS + 1) / 2))p")
+  cpu_best=$(awk '{ printf "%.2f\n", $2 + $3 }' "$WORK/times" | sort -g | head -n1)
+  rss=$(awk '{ print $4 }' "$WORK/times" | sort -g | tail -n1)
+  echo "$wall_best $wall_median $cpu_best $rss"
 }
 
 DATAMASH=(datamash -W count 1 min 1 max 1 sum 1 mean 1 median 1 q1 1 q3 1 svar 1 sskew 1 skurt 1)
-read -r tovrin_best tovrin_median < <(time_runs "$TOVRIN" describe "$WORK/1e6.txt")
-read -r dm_best dm_median < <(time_runs sh -c '"$@" < "$0"' "$WORK/1e6.txt" "${DATAMASH[@]}")
+read -r t_best t_median t_cpu t_rss < <(time_runs "$TOVRIN" describe "$WORK/1e6.txt")
+read -r d_best d_median d_cpu d_rss < <(time_runs sh -c '"$@" < "$0"' "$WORK/1e6.txt" "${DATAMASH[@]}")
 
-peak_kib() { /usr/bin/time -f %M "$@" 2>&1 >/dev/null | tail -n1; }
-tovrin_rss6=$(peak_kib "$TOVRIN" describe "$WORK/1e6.txt")
-dm_rss6=$(peak_kib sh -c '"$@" < "$0"' "$WORK/1e6.txt" "${DATAMASH[@]}")
-
+"$TOVRIN" describe --decimals 6 "$WORK/1e6.txt" >"$WORK/tovrin6"
+"${DATAMASH[@]}" <"$WORK/1e6.txt" >"$WORK/datamash6"
 make_numbers 10000000 "$WORK/1e7.txt"
 rm -f "$WORK/1e6.txt"
-start=$(date +%s.%N)
-tovrin_rss7=$(peak_kib "$TOVRIN" describe "$WORK/1e7.txt")
-end=$(date +%s.%N)
-tovrin_time7=$(awk -v a="$start" -v b="$end" 'BEGIN { print b - a }')
+RUNS=1
+read -r t7_wall _ t7_cpu t7_rss < <(time_runs "$TOVRIN" describe "$WORK/1e7.txt")
 
 cat <<EOT
 machine: $(lscpu | sed -n 's/^Model name: *//p'), $(nproc) cores; $(date -u +%Y-%m-%d)
-runs: $RUNS each (best / median wall time)
-10^6 numbers: tovrin describe  ${tovrin_best} s / ${tovrin_median} s, peak ${tovrin_rss6} KiB
-10^6 numbers: datamash         ${dm_best} s / ${dm_median} s, peak ${dm_rss6} KiB
-10^7 numbers: tovrin describe  $(printf %.3f "$tovrin_time7") s, peak ${tovrin_rss7} KiB
+runs: $RUNS_ALL each; wall time best / median, CPU time (user + system) best, peak memory
+10^6 numbers: tovrin describe  ${t_best} s / ${t_median} s, cpu ${t_cpu} s, peak ${t_rss} KiB
+10^6 numbers: datamash         ${d_best} s / ${d_median} s, cpu ${d_cpu} s, peak ${d_rss} KiB
+10^7 numbers: tovrin describe  ${t7_wall} s, cpu ${t7_cpu} s, peak ${t7_rss} KiB
 EOT
-echo "--- tovrin describe (10^7):"
-"$TOVRIN" describe "$WORK/1e7.txt"
+echo "--- the same 10^6 numbers, tovrin describe --decimals 6:"
+cat "$WORK/tovrin6"
+echo "--- datamash (count min max sum mean median q1 q3 svar sskew skurt):"
+cat "$WORK/datamash6"

@@ -35,7 +35,8 @@ namespace {
 using tovrin::Extended;
 using tovrin::LongWord;
 
-constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
+[[maybe_unused]] constexpr Extended kInf =
+    std::numeric_limits<Extended>::infinity();  // for the table
 using Ref2 = std::array<Extended, 2>;
 using Ref3 = std::array<Extended, 3>;
 using Ref4 = std::array<Extended, 4>;

@@ -71,12 +71,159 @@ void BM_NaiveProduct(benchmark::State& state) {
   state.SetItemsProcessed(state.iterations() * n * n * n);
 }
 
-#define PRODUCT_BENCH(T)                                                              \
+#define PRODUCT_BENCH(T)                                                                         \
   BENCHMARK(BM_MultiplyMatrices<T>)->Arg(64)->Arg(256)->Arg(512)->Unit(benchmark::kMillisecond); \
   BENCHMARK(BM_NaiveProduct<T>)->Arg(64)->Arg(256)->Arg(512)->Unit(benchmark::kMillisecond);
 PRODUCT_BENCH(PackedExtended)
 PRODUCT_BENCH(Double)
 PRODUCT_BENCH(Single)
+
+// --- Inverse and determinant ---
+
+// Plain peers on one contiguous array of the element type's working type (Extended for
+// Extended, the element type itself otherwise): Gauss-Jordan with partial pivoting on the
+// augmented matrix, and Gaussian elimination for the determinant.
+template <typename T>
+using Work = std::conditional_t<std::is_same_v<T, PackedExtended>, long double, T>;
+
+template <typename T>
+bool PlainInverse(const Matrix<T>& A, std::vector<Work<T>>& Inv) {
+  using W = Work<T>;
+  const std::size_t n = A.size(), w = 2 * n;
+  std::vector<W> g(n * w);
+  for (std::size_t i = 0; i < n; ++i) {
+    for (std::size_t j = 0; j < n; ++j) g[i * w + j] = static_cast<W>(A[i][j]);
+    g[i * w + n + i] = 1;
+  }
+  for (std::size_t c = 0; c < n; ++c) {
+    std::size_t p = c;
+    for (std::size_t i = c + 1; i < n; ++i) {
+      if (std::fabs(g[i * w + c]) > std::fabs(g[p * w + c])) p = i;
+    }
+    if (g[p * w + c] == 0) return false;
+    if (p != c) std::swap_ranges(&g[p * w], &g[p * w] + w, &g[c * w]);
+    const W inv = 1 / g[c * w + c];
+    for (std::size_t j = 0; j < w; ++j) g[c * w + j] *= inv;
+    for (std::size_t i = 0; i < n; ++i) {
+      const W f = g[i * w + c];
+      if (i == c || f == 0) continue;
+      for (std::size_t j = 0; j < w; ++j) g[i * w + j] -= f * g[c * w + j];
+    }
+  }
+  Inv.resize(n * n);
+  for (std::size_t i = 0; i < n; ++i) {
+    for (std::size_t j = 0; j < n; ++j) Inv[i * n + j] = g[i * w + n + j];
+  }
+  return true;
+}
+
+template <typename T>
+long double PlainDeterminant(const Matrix<T>& A) {
+  using W = Work<T>;
+  const std::size_t n = A.size();
+  std::vector<W> g(n * n);
+  for (std::size_t i = 0; i < n; ++i) {
+    for (std::size_t j = 0; j < n; ++j) g[i * n + j] = static_cast<W>(A[i][j]);
+  }
+  long double d = 1;
+  for (std::size_t c = 0; c < n; ++c) {
+    std::size_t p = c;
+    for (std::size_t i = c + 1; i < n; ++i) {
+      if (std::fabs(g[i * n + c]) > std::fabs(g[p * n + c])) p = i;
+    }
+    if (g[p * n + c] == 0) return 0;
+    if (p != c) {
+      std::swap_ranges(&g[p * n], &g[p * n] + n, &g[c * n]);
+      d = -d;
+    }
+    d *= g[c * n + c];
+    for (std::size_t i = c + 1; i < n; ++i) {
+      const W f = g[i * n + c] / g[c * n + c];
+      for (std::size_t j = c; j < n; ++j) g[i * n + j] -= f * g[c * n + j];
+    }
+  }
+  return d;
+}
+
+template <typename T>
+void BM_MatrixInverse(benchmark::State& state) {
+  const auto n = static_cast<std::size_t>(state.range(0));
+  const auto a = RandomMatrix<T>(n, n, 3, true);
+  Matrix<T> inv;
+  for (auto _ : state) {
+    auto m = a;
+    benchmark::DoNotOptimize(MatrixInverse(m, inv));
+  }
+}
+
+template <typename T>
+void BM_PlainInverse(benchmark::State& state) {
+  const auto n = static_cast<std::size_t>(state.range(0));
+  const auto a = RandomMatrix<T>(n, n, 3, true);
+  std::vector<Work<T>> inv;
+  for (auto _ : state) benchmark::DoNotOptimize(PlainInverse(a, inv));
+}
+
+template <typename T>
+void BM_MatrixDeterminant(benchmark::State& state) {
+  const auto n = static_cast<std::size_t>(state.range(0));
+  const auto a = RandomMatrix<T>(n, n, 4, true);
+  for (auto _ : state) {
+    auto m = a;
+    benchmark::DoNotOptimize(MatrixDeterminant(m));
+  }
+}
+
+template <typename T>
+void BM_PlainDeterminant(benchmark::State& state) {
+  const auto n = static_cast<std::size_t>(state.range(0));
+  const auto a = RandomMatrix<T>(n, n, 4, true);
+  for (auto _ : state) benchmark::DoNotOptimize(PlainDeterminant(a));
+}
+
+#define REDUCE_BENCH(T)                                                                  \
+  BENCHMARK(BM_MatrixInverse<T>)->Arg(100)->Arg(300)->Unit(benchmark::kMillisecond);     \
+  BENCHMARK(BM_PlainInverse<T>)->Arg(100)->Arg(300)->Unit(benchmark::kMillisecond);      \
+  BENCHMARK(BM_MatrixDeterminant<T>)->Arg(100)->Arg(300)->Unit(benchmark::kMillisecond); \
+  BENCHMARK(BM_PlainDeterminant<T>)->Arg(100)->Arg(300)->Unit(benchmark::kMillisecond);
+REDUCE_BENCH(PackedExtended)
+REDUCE_BENCH(Double)
+
+// --- Sorting rows on a column ---
+
+Matrix<Double> SortInput() {
+  std::mt19937_64 gen(5);
+  std::uniform_int_distribution<int> key(0, 49999);  // repeated keys, as in real tables
+  Matrix<Double> m(100000, std::vector<Double>(4));
+  for (std::size_t i = 0; i < m.size(); ++i) {
+    m[i] = {static_cast<Double>(key(gen)), static_cast<Double>(i), 1.0, 2.0};
+  }
+  return m;
+}
+
+void BM_QSortMatrixRowsOnCol(benchmark::State& state) {
+  const auto input = SortInput();
+  for (auto _ : state) {
+    state.PauseTiming();
+    auto m = input;
+    state.ResumeTiming();
+    QSortMatrixRowsOnCol(m, 0, true);
+    benchmark::DoNotOptimize(m.data());
+  }
+}
+
+void BM_StdSortRows(benchmark::State& state) {
+  const auto input = SortInput();
+  for (auto _ : state) {
+    state.PauseTiming();
+    auto m = input;
+    state.ResumeTiming();
+    std::sort(m.begin(), m.end(), [](const auto& a, const auto& b) { return a[0] < b[0]; });
+    benchmark::DoNotOptimize(m.data());
+  }
+}
+BENCHMARK(BM_QSortMatrixRowsOnCol)->Unit(benchmark::kMillisecond);
+BENCHMARK(BM_StdSortRows)->Unit(benchmark::kMillisecond);
 
 }  // namespace
 

@@ -13,6 +13,7 @@
 #include <iterator>
 #include <limits>
 #include <span>
+#include <vector>
 
 #include "tovrin/foundation/TOVRINMath.h"
 
@@ -94,6 +95,30 @@ struct IncompleteBetaOps {
   }
 #endif
 };
+// The incomplete beta's table split by shape: both shapes up to 1000, and at least one above
+// (the large-shape region, mostly near the mean).
+std::span<const SpecialCase3> ShapeSubset(bool large) {
+  static const std::vector<SpecialCase3> small_rows = [] {
+    std::vector<SpecialCase3> rows;
+    for (const auto& r : kIncompleteBetaTable)
+      if (std::fmax(r.a, r.b) <= 1000.0L) rows.push_back(r);
+    return rows;
+  }();
+  static const std::vector<SpecialCase3> large_rows = [] {
+    std::vector<SpecialCase3> rows;
+    for (const auto& r : kIncompleteBetaTable)
+      if (std::fmax(r.a, r.b) > 1000.0L) rows.push_back(r);
+    return rows;
+  }();
+  return large ? std::span<const SpecialCase3>(large_rows)
+               : std::span<const SpecialCase3>(small_rows);
+}
+struct IncompleteBetaSmallShapesOps : IncompleteBetaOps {
+  static std::span<const SpecialCase3> Table() { return ShapeSubset(false); }
+};
+struct IncompleteBetaLargeShapesOps : IncompleteBetaOps {
+  static std::span<const SpecialCase3> Table() { return ShapeSubset(true); }
+};
 struct InverseIncompleteBetaOps {
   static constexpr std::span<const SpecialCase3> Table() { return kInverseIncompleteBetaTable; }
   static Extended Ours(const SpecialCase3& r) {
@@ -171,6 +196,8 @@ TOVRIN_SPECIAL_BENCH(GammaOps)
 TOVRIN_SPECIAL_BENCH(LnGammaOps)
 TOVRIN_SPECIAL_BENCH(BetaOps)
 TOVRIN_SPECIAL_BENCH(IncompleteBetaOps)
+TOVRIN_SPECIAL_BENCH(IncompleteBetaSmallShapesOps)
+TOVRIN_SPECIAL_BENCH(IncompleteBetaLargeShapesOps)
 TOVRIN_SPECIAL_BENCH(InverseIncompleteBetaOps)
 
 template <typename Ops>
@@ -191,6 +218,8 @@ int main(int argc, char** argv) {
   ReportPair<LnGammaOps>("LnGamma");
   ReportPair<BetaOps>("Beta");
   ReportPair<IncompleteBetaOps>("IncompleteBeta");
+  ReportPair<IncompleteBetaSmallShapesOps>("IncompleteBeta, shapes <= 1000");
+  ReportPair<IncompleteBetaLargeShapesOps>("IncompleteBeta, a shape > 1000");
   ReportPair<InverseIncompleteBetaOps>("InverseIncompleteBeta");
   std::printf("\n");
   benchmark::Initialize(&argc, argv);

@@ -112,7 +112,7 @@ LongWord Count(Input& in) {
 }
 
 // Table sizes stay small enough to be built quickly.
-LongWord TableSize(Input& in) { return in.Raw<std::uint16_t>() % 2048; }
+LongWord TableSize(Input& in) { return in.Raw<std::uint16_t>() % 257; }
 
 template <class F>
 bool MayRaise(F&& f) {

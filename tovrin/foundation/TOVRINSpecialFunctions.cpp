@@ -7,17 +7,22 @@
 //   for 0 < k < x), Stirling's series with Bernoulli corrections from x = 12 on, and the
 //   reflection formula below -12. LnGamma near its zeros at 1 and 2 goes through log1p of a
 //   quantity formed without cancellation, so it keeps its relative accuracy there.
-// - Beta and the factor x^a (1-x)^b / B(a, b) of the incomplete beta: Stirling's form with the
-//   large terms a ln(a) and b ln(b) cancelled analytically (the exponent is written with
-//   t - log1p(t), as DiDonato and Morris do in TOMS 708), so that large shapes near the mean lose
-//   nothing to cancellation.
-// - IncompleteBeta: the continued fraction of I_x(a, b) (modified Lentz), on the side of the
-//   mean where it converges, the other side through the complement.
-// - InverseIncompleteBeta: a normal or power-law first estimate, then Halley steps kept inside
-//   a shrinking bracket, iterating on whichever of x and 1 - x is the smaller.
+// - Beta and the factor x^a (1-x)^b / B(a, b) of the incomplete beta: for small shapes the
+//   gamma functions and pow directly; for large ones Stirling's form, where the huge powers
+//   a^a, b^b, (a+b)^(a+b) are combined into (x (a + b) / a)^a and (y (a + b) / b)^b, whose bases
+//   are carried to twice the working precision (error-free transformations) before pow.
+// - IncompleteBeta: on the side of the mean where it converges, the continued fraction of
+//   DiDonato and Morris (TOMS 708, BFRAC) built on lambda = a - (a + b) x, which is formed
+//   exactly; for a small second shape near x = 1, their asymptotic expansion in incomplete
+//   gamma functions (BGRAT, with the upward recurrence BUP); the other side through the
+//   complement. Shapes beyond 1e10 use the leading term of Temme's uniform expansion.
+// - InverseIncompleteBeta: a normal or power-law first estimate, then Halley steps (Newton on
+//   the logarithm far in a tail) kept inside a shrinking bracket, iterating on whichever of x
+//   and 1 - x is the smaller.
 #include <cmath>
 #include <cstdint>
 #include <limits>
+#include <utility>
 
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINMath.h"
@@ -277,8 +282,8 @@ Extended ShapeTimesPhi(Extended s, Extended t, Extended st) {
   return s * XMinusLog1p(t);
 }
 
-// A point of the incomplete beta: x and y = 1 - x, where the smaller of the two is exact and
-// the larger may carry the rounding of 1 - (smaller).
+// A point of the incomplete beta: x and y = 1 - x, each with the part that its rounding lost,
+// so that whichever is small is known to full relative accuracy.
 struct BetaPoint {
   Extended x;
   Extended y;
@@ -301,17 +306,16 @@ Extended BetaLambda(const BetaPoint& p, Extended a, Extended b) {
   return -ShiftedDifference(b, a, p.y);
 }
 
-// x^a y^b / B(a, b), the factor shared by the incomplete beta and its derivative
-// (the density is this divided by x y). Written as
-//   (x c / a)^a (y c / b)^b sqrt(a b / (2 pi c)) exp(Delta(c) - Delta(a) - Delta(b)),  c = a + b,
-// where the powers are exp(a log1p(-lambda/a) + b log1p(lambda/b)) with lambda = a y - b x:
-// near the mean both logarithms are small and their linear parts cancel exactly.
 // pow(x_hi + x_lo, a) for a small correction x_lo.
 Extended PowerOfPair(Extended x_hi, Extended x_lo, Extended a) {
   const Extended power = std::pow(x_hi, a);
   if (x_lo == 0.0L) return power;
   return power * (1.0L + a * (x_lo / x_hi));
 }
+
+// x^a y^b / B(a, b), the factor shared by the incomplete beta and its derivative (the density
+// is this divided by x y), for lambda = a y - b x. For large shapes it is written as
+//   (x c / a)^a (y c / b)^b sqrt(a b / (2 pi c)) exp(Delta(c) - Delta(a) - Delta(b)),  c = a + b.
 
 Extended BetaPowerFactor(const BetaPoint& p, Extended a, Extended b, Extended lambda) {
   if (a < kStirlingStart && b < kStirlingStart) {
@@ -408,30 +412,149 @@ Extended BetaContinuedFraction(const BetaPoint& p, Extended a, Extended b, Exten
   return r;
 }
 
-// With a small b and x close to 1 the continued fraction loses a few bits, while the
-// complement I_y(b, a) is then given quickly by its series of positive terms
-//   I_y(b, a) = x^a y^b / (b B(a, b)) sum_n (a + b)_n / (b + 1)_n y^n.
-// Used when the lower tail 1 - I_y(b, a) stays above 1/64, so that the subtraction costs at most
-// six bits; returns false when it does not apply.
-bool ComplementBySeries(const BetaPoint& p, Extended a, Extended b, Extended factor,
-                        Extended& lower, Extended& upper) {
-  constexpr int kMaxTerms = 1000;
-  const Extended y = p.y;
+// 1/Gamma(1 + b) - 1 for -1/2 <= b <= 3/2, without cancellation.
+Extended RecipGamma1pMinusOne(Extended b) {
+  if (b <= 0.5L) return b * RecipGammaRatio(b);
+  // 1/Gamma(1 + b) = P(b - 1) / b, so the difference is (b - 1)(R(b - 1) - 1) / b.
+  const Extended t = b - 1.0L;
+  return t * (RecipGammaRatio(t) - 1.0L) / b;
+}
+
+// ln(Gamma(a) / Gamma(a + b)) for a >= kStirlingStart, from Stirling's formula with the large
+// terms cancelled analytically.
+Extended LnGammaRatio(Extended a, Extended b) {
   const Extended c = a + b;
-  if (!(b <= 1.0L && y <= 0.0078125L && c * y <= 32.0L)) return false;
-  Extended term = 1.0L;
-  Extended sum = 1.0L;
-  for (int n = 0; n < kMaxTerms; ++n) {
-    const Extended nn = static_cast<Extended>(n);
-    term *= (c + nn) * y / (b + 1.0L + nn);
-    sum += term;
-    if (term <= kEpsilon * 0.125L * sum && (c + nn) * y < b + 1.0L + nn) break;
+  return -(a - 0.5L) * std::log1p(b / a) - b * std::log(c) + b + StirlingSeries(a) -
+         StirlingSeries(c);
+}
+
+// Q(a, x) / r with r = e^-x x^a / Gamma(a) and Q the upper regularised incomplete gamma
+// function, for 0 < a <= 1 (DiDonato and Morris, TOMS 708, GRAT1): a Taylor series below
+// x = 1.1 and Legendre's continued fraction above.
+Extended ScaledUpperGamma(Extended a, Extended x, Extended log_r) {
+  constexpr int kMaxTerms = 5000;
+  constexpr Extended kSqrtPi = 1.77245385090551602729816748334114518L;
+  if (a == 0.5L) {
+    const Extended sx = std::sqrt(x);
+    return std::erfc(sx) * std::exp(x) / sx * kSqrtPi;
   }
-  const Extended complement = factor * sum / b;
-  if (!(complement <= 1.0L - 1.0L / 64.0L)) return false;
-  upper = complement;
-  lower = 1.0L - complement;
+  if (x < 1.1L) {
+    Extended an = 3.0L;
+    Extended c = x;
+    Extended sum = x / (a + 3.0L);
+    const Extended tolerance = kEpsilon * 0.1L / (a + 1.0L);
+    for (int i = 0; i < kMaxTerms; ++i) {
+      an += 1.0L;
+      c *= -(x / an);
+      const Extended t = c / (a + an);
+      sum += t;
+      if (!(std::fabs(t) > tolerance)) break;
+    }
+    const Extended j = a * x * ((sum / 6.0L - 0.5L / (a + 2.0L)) * x + 1.0L / (a + 1.0L));
+    const Extended z = a * std::log(x);
+    const Extended h = RecipGamma1pMinusOne(a);
+    const Extended g = h + 1.0L;
+    if ((x >= 0.25L && a < x / 2.59L) || z > -0.13394L) {
+      const Extended l = std::expm1(z);
+      const Extended q = ((l + 1.0L) * j - l) * g - h;
+      if (q <= 0.0L) return 0.0L;
+      return q * std::exp(-log_r);
+    }
+    const Extended pv = std::exp(z) * g * (1.0L - j);
+    return (1.0L - pv) * std::exp(-log_r);
+  }
+  Extended a2n_1 = 1.0L;
+  Extended a2n = 1.0L;
+  Extended b2n_1 = x;
+  Extended b2n = x + (1.0L - a);
+  Extended c = 1.0L;
+  Extended an0 = a2n / b2n;
+  for (int i = 0; i < kMaxTerms; ++i) {
+    a2n_1 = x * a2n + c * a2n_1;
+    b2n_1 = x * b2n + c * b2n_1;
+    const Extended am0 = a2n_1 / b2n_1;
+    c += 1.0L;
+    const Extended c_a = c - a;
+    a2n = a2n_1 + c_a * a2n;
+    b2n = b2n_1 + c_a * b2n;
+    an0 = a2n / b2n;
+    if (!(std::fabs(an0 - am0) >= kEpsilon * an0)) break;
+    if (std::fabs(b2n) > 1e1000L) {
+      // Keep the convergents in range; only their ratios matter.
+      a2n_1 *= 1e-1000L;
+      a2n *= 1e-1000L;
+      b2n_1 *= 1e-1000L;
+      b2n *= 1e-1000L;
+    }
+  }
+  return an0;
+}
+
+// w0 + I_x(a, b) for a >= 15 and b <= 1 by the asymptotic expansion of DiDonato and Morris
+// (TOMS 708, BGRAT) in terms of the incomplete gamma function. False when it cannot be used.
+bool BetaLargeASmallB(const BetaPoint& p, Extended a, Extended b, Extended w0, Extended& result) {
+  constexpr int kTerms = 30;
+  const Extended bm1 = b - 1.0L;
+  const Extended nu = a + 0.5L * bm1;
+  const Extended lnx =
+      p.y > 0.375L ? std::log(p.x) + p.x_lo / p.x : std::log1p(-p.y) - p.y_lo / p.x;
+  const Extended z = -nu * lnx;
+  if (!(b * z > 0.0L)) return false;
+  const Extended log_r =
+      std::log(b) + std::log1p(RecipGamma1pMinusOne(b)) + b * std::log(z) + nu * lnx;
+  const Extended log_u = log_r - (LnGammaRatio(a, b) + b * std::log(nu));
+  const Extended u = std::exp(log_u);
+  if (!std::isnormal(u)) return false;
+  const Extended l = w0 / u;
+  const Extended v = 0.25L / (nu * nu);
+  const Extended t2 = 0.25L * lnx * lnx;
+  Extended j = ScaledUpperGamma(b, z, log_r);
+  Extended sum = j;
+  Extended t = 1.0L;
+  Extended cn = 1.0L;
+  Extended n2 = 0.0L;
+  Extended c[kTerms];
+  Extended d[kTerms];
+  for (int n = 1; n <= kTerms; ++n) {
+    const Extended bp2n = b + n2;
+    j = (bp2n * (bp2n + 1.0L) * j + (z + bp2n + 1.0L) * t) * v;
+    n2 += 2.0L;
+    t *= t2;
+    cn /= n2 * (n2 + 1.0L);
+    c[n - 1] = cn;
+    Extended sc = 0.0L;
+    Extended coef = b - n;
+    for (int i = 1; i <= n - 1; ++i) {
+      sc += coef * c[i - 1] * d[n - 1 - i];
+      coef += b;
+    }
+    d[n - 1] = bm1 * cn + sc / n;
+    const Extended dj = d[n - 1] * j;
+    sum += dj;
+    if (!(sum > 0.0L)) return false;
+    if (std::fabs(dj) <= kEpsilon * (sum + l)) break;
+  }
+  result = w0 + u * sum;
   return true;
+}
+
+// I_x(a, b) for b <= 1 close to the mean from below (x near 1), where the continued fraction
+// loses bits: for a < 15 the first terms of I_x(a, b) = I_x(a + n, b) + sum_k x^(a+k) y^b /
+// ((a + k) B(a + k, b)) (all positive), then the expansion above. False when it does not apply.
+bool LowerTailSmallB(const BetaPoint& p, Extended a, Extended b, Extended factor, Extended& lower) {
+  constexpr Extended kShiftTo = 15.0L;
+  if (!(b <= 1.0L)) return false;
+  const Extended lnx = p.y > 0.375L ? std::log(p.x) : std::log1p(-p.y);
+  const Extended shift = a < kShiftTo ? std::ceil(kShiftTo - a) : 0.0L;
+  if (!(-(a + shift) * lnx <= 30.0L)) return false;
+  Extended w0 = 0.0L;
+  Extended term = factor / a;
+  const Extended x = p.x + p.x_lo;
+  for (int k = 0; k < static_cast<int>(shift); ++k) {
+    w0 += term;
+    term *= x * (a + b + k) / (a + k + 1.0L);
+  }
+  return BetaLargeASmallB(p, a + shift, b, w0, lower);
 }
 
 // I_x(a, b) and its complement 1 - I_x(a, b), each to full relative accuracy when it is the
@@ -469,10 +592,10 @@ BetaValues IncompleteBetaBoth(const BetaPoint& p, Extended a, Extended b) {
   const Extended factor = BetaPowerFactor(q, sa, sb, swap ? -lambda : lambda);
   Extended tail;
   Extended other;
-  if (!ComplementBySeries(q, sa, sb, factor, tail, other)) {
+  if (!LowerTailSmallB(q, sa, sb, factor, tail)) {
     tail = factor * BetaContinuedFraction(q, sa, sb, std::fabs(lambda));
-    other = 1.0L - tail;
   }
+  other = 1.0L - tail;
   if (swap) return {other, tail, factor};
   return {tail, other, factor};
 }
@@ -519,8 +642,12 @@ BetaPoint InverseBetaEstimate(Extended p, Extended q, Extended a, Extended b) {
   return {1.0L - y, y};
 }
 
-// The x in (0, 1/2] with I_x(a, b) = p (q = 1 - p), known to lie there.
-Extended InverseBetaLowerHalf(Extended p, Extended q, Extended a, Extended b, BetaPoint start) {
+// The x in (0, 1/2] with I_x(a, b) = p (q = 1 - p). When I_{1/2}(a, b) < p the root lies
+// above 1/2: that is found out (every step then heads up, so the end 1/2 is tried), and
+// beyond_half is set.
+Extended InverseBetaLowerHalf(Extended p, Extended q, Extended a, Extended b, BetaPoint start,
+                              bool& beyond_half) {
+  beyond_half = false;
   constexpr int kMaxIterations = 200;
   Extended lo = 0.0L;
   Extended hi = 0.5L;
@@ -537,6 +664,10 @@ Extended InverseBetaLowerHalf(Extended p, Extended q, Extended a, Extended b, Be
     if (f == 0.0L) return x;
     if (f < 0.0L) {
       lo = x;
+      if (x >= 0.5L) {
+        beyond_half = true;
+        return x;
+      }
     } else {
       hi = x;
       hi_evaluated = true;
@@ -567,8 +698,10 @@ Extended InverseBetaLowerHalf(Extended p, Extended q, Extended a, Extended b, Be
       // The root may sit on the end of the half (I_{1/2} = p exactly): try the end itself.
       next = hi;
     } else if (next == 0.0L && lo == 0.0L) {
-      // The step heads below the smallest number: try that before giving up on the range.
+      // The step heads below the smallest number: try that before giving up on the range;
+      // when even that lies above the root, the root rounds to 0.
       next = std::numeric_limits<Extended>::denorm_min();
+      if (hi == next) return 0.0L;
     } else if (!(next > lo && next <= hi)) {
       // Outside the bracket: halve it, geometrically when it spans decades.
       if (lo > 0.0L && hi > 16.0L * lo) {
@@ -638,13 +771,25 @@ Extended InverseIncompleteBeta(Extended P, Extended A, Extended B) {
     if (std::isinf(A) && std::isinf(B)) return kNaN;
     return std::isinf(A) ? 1.0L : 0.0L;
   }
+  if (A < kTinyShape || B < kTinyShape) {
+    // I_x is constant on (0, 1) (see IncompleteBeta): the root is an end.
+    const Extended level = A < kTinyShape ? (B < kTinyShape ? B / (A + B) : 1.0L) : 0.0L;
+    return P <= level ? 0.0L : 1.0L;
+  }
   const Extended Q = 1.0L - P;
-  const BetaValues half = IncompleteBetaBoth(PointFromX(0.5L), A, B);
+  // Work on the half that holds the root, as the first estimate suggests: there x (or, above
+  // 1/2, y = 1 - x, solving I_y(b, a) = 1 - P) is the small, exact member. A wrong guess is
+  // found out at the end 1/2 and the other half is solved.
   const BetaPoint start = InverseBetaEstimate(P, Q, A, B);
-  if (P <= half.lower) return InverseBetaLowerHalf(P, Q, A, B, start);
-  // The root lies above 1/2: solve I_y(b, a) = 1 - P for y = 1 - x.
-  const Extended y = InverseBetaLowerHalf(Q, P, B, A, Swapped(start));
-  return 1.0L - y;
+  bool beyond_half = false;
+  if (start.x <= 0.5L) {
+    const Extended x = InverseBetaLowerHalf(P, Q, A, B, start, beyond_half);
+    if (!beyond_half) return x;
+    return 1.0L - InverseBetaLowerHalf(Q, P, B, A, BetaPoint{0.5L, 0.5L}, beyond_half);
+  }
+  const Extended y = InverseBetaLowerHalf(Q, P, B, A, Swapped(start), beyond_half);
+  if (!beyond_half) return 1.0L - y;
+  return InverseBetaLowerHalf(P, Q, A, B, BetaPoint{0.5L, 0.5L}, beyond_half);
 }
 
 }  // namespace tovrin

@@ -5,8 +5,10 @@
 
 #include <cmath>
 #include <cstdio>
+#include <iterator>
 #include <limits>
 #include <string>
+#include <utility>
 
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINMath.h"
@@ -338,6 +340,9 @@ TEST(SpecialInverseIncompleteBeta, ExtremeShapesAndTails) {
   // A root far below the smallest subnormal comes back as 0, and quickly.
   EXPECT_EQ(InverseIncompleteBeta(1e-300L, 1e-3L, 2.0L), 0.0L);
   EXPECT_EQ(InverseIncompleteBeta(1.0L - 1e-18L, 2.0L, 1e-3L), 1.0L);
+  // Shapes so small that I_x is constant on (0, 1): the root is an end.
+  EXPECT_EQ(InverseIncompleteBeta(0.3L, 1e-4500L, 2.0L), 0.0L);
+  EXPECT_EQ(InverseIncompleteBeta(0.3L, 2.0L, 1e-4500L), 1.0L);
   // I_x(1, 1) = x far down in the tail.
   EXPECT_LE(RelativeError(InverseIncompleteBeta(1e-300L, 1.0L, 1.0L), 1e-300L), 1e-18L);
 }

@@ -236,13 +236,15 @@ Extended GrandMean(const TQENLIntMatrix& M, LongWord& N);
 
 // === Row and column operations ==============================================================
 
-// The in-place row and column operations check, in order: no rows or no columns
-// (rsMatrixIsEmpty); not rectangular under QENMatrixRectangularCheck (rsMatrixRect); an index past
-// the last row (rsInvalidRow) or column (rsInvalidCol). With the switch off, a row too short for
-// the columns the operation touches raises rsMatrixRect. A failed check changes nothing.
+// The in-place row and column operations and the sums check, in order: no rows or no columns
+// (rsMatrixIsEmpty); not rectangular (rsMatrixRect); an index past the last row (rsInvalidRow)
+// or column (rsInvalidCol). Rows, columns and shape are those MatrixDimensions reports, so under
+// QENMatrixRectangularCheck a ragged matrix has no columns and fails the first check; with the
+// switch off, a row too short for the columns the operation touches raises rsMatrixRect. A
+// failed check changes nothing.
 //
 // Swaps: equal indices return at once, without any check. Rows are exchanged element by element
-// over the column count.
+// over the column count (the row storage stays where it is).
 void SwapMatrixRows(TQENFloatMatrix& M, LongWord Row1, LongWord Row2);
 void SwapMatrixRows(TQENDoubleMatrix& M, LongWord Row1, LongWord Row2);
 void SwapMatrixRows(TQENSingleMatrix& M, LongWord Row1, LongWord Row2);
@@ -298,8 +300,10 @@ void AddMatrixCols(TQENLIntMatrix& M, LongWord Col1, LongWord Col2, LongInt K);
 
 // Whole rows ordered by their element in column Col (QSortMatrixColsOnRow: whole columns by
 // their element in row Row), by the explicit-stack quick sort, exact comparisons, not stable.
-// Unless there are at least two rows and two columns nothing is checked or changed. Then
-// rsMatrixRect, then rsInvalidCol (rsInvalidRow).
+// Unless there are at least two rows and two columns (as MatrixDimensions reports them: under
+// the switch a ragged matrix has none) nothing is checked or changed. Then rsMatrixRect, then
+// rsInvalidCol (rsInvalidRow); with the switch off a row shorter than the column count raises
+// rsMatrixRect.
 void QSortMatrixRowsOnCol(TQENFloatMatrix& M, LongWord Col, bool Ascending);
 void QSortMatrixRowsOnCol(TQENDoubleMatrix& M, LongWord Col, bool Ascending);
 void QSortMatrixRowsOnCol(TQENSingleMatrix& M, LongWord Col, bool Ascending);
@@ -440,9 +444,10 @@ Int64 SumMatrixCol(const TQENByteMatrix& M, LongWord Col);
 // column that has a non-zero entry (FloatIsNotZero; of equal magnitudes the upper row wins).
 // Pivot rows are scaled to a leading 1 unless the pivot is within tolerance of 1; entries within
 // tolerance of zero below a pivot are left alone; entries above pivots are not cleared.
-// Checks: rsMatrixIsEmpty (no rows or no columns), then rsMatrixRect (not rectangular under
-// QENMatrixRectangularCheck). With the switch off, a row shorter than the column count raises
-// rsMatrixRect. The switch itself is never written.
+// Checks: rsMatrixIsEmpty (no rows or no columns as MatrixDimensions reports them, so also a
+// ragged matrix under QENMatrixRectangularCheck), then rsMatrixRect (not rectangular). With the
+// switch off, a row shorter than the column count raises rsMatrixRect. The switch itself is
+// never written, so other threads never see it change.
 void RowEchelonForm(TQENFloatMatrix& M);
 void RowEchelonForm(TQENDoubleMatrix& M);
 void RowEchelonForm(TQENSingleMatrix& M);
@@ -467,8 +472,9 @@ Extended MatrixDeterminant(TQENFloatMatrix& M);
 Extended MatrixDeterminant(TQENDoubleMatrix& M);
 Extended MatrixDeterminant(TQENSingleMatrix& M);
 
-// The number of rows whose elements are all zero (VectorZero). Checks: rsMatrixIsEmpty, then
-// rsMatrixRect.
+// The number of rows whose elements are all zero (VectorZero, each row at its own length).
+// Checks: rsMatrixIsEmpty, then rsMatrixRect; with the switch off an empty row makes VectorZero
+// raise rsVectorIsEmpty.
 LongWord MatrixZeroRows(const TQENFloatMatrix& M);
 LongWord MatrixZeroRows(const TQENDoubleMatrix& M);
 LongWord MatrixZeroRows(const TQENSingleMatrix& M);

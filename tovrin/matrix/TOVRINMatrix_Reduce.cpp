@@ -4,6 +4,7 @@
 // The elimination works through unchecked row operations once the operand has passed its
 // checks, which gives the same results as the public operations with the shape switch off
 // while never writing QENMatrixRectangularCheck (other threads keep seeing their own value).
+#include <algorithm>
 #include <cmath>
 #include <cstddef>
 #include <vector>
@@ -140,45 +141,102 @@ void Eliminate(MatrixOf<T>& M, std::size_t Rows, std::size_t Cols, Followers<T> 
   }
 }
 
+// --- Working rows ---
+
+// The elimination runs on rows of a working type: Double and Single matrices in place,
+// Extended matrices unpacked into native Extended rows (ten-byte elements are slow to load and
+// store one by one) and packed back afterwards. Unpacking and packing are exact, so the
+// results are the same bits either way. Only the first Cols elements of a row take part; any
+// further elements of a longer row (shape switch off) stay as they are.
+template <typename T>
+class WorkingRows {
+ public:
+  using Element = T;
+  WorkingRows(MatrixOf<T>& M, std::size_t) : rows_(M) {}
+  MatrixOf<T>& Rows() { return rows_; }
+  void WriteBack() {}
+
+ private:
+  MatrixOf<T>& rows_;
+};
+
+template <>
+class WorkingRows<PackedExtended> {
+ public:
+  using Element = Extended;
+  WorkingRows(TQENFloatMatrix& M, std::size_t Cols) : target_(M), cols_(Cols), rows_(M.size()) {
+    for (std::size_t i = 0; i < M.size(); ++i) {
+      rows_[i].assign(M[i].begin(), M[i].begin() + static_cast<std::ptrdiff_t>(Cols));
+    }
+  }
+  MatrixOf<Extended>& Rows() { return rows_; }
+  void WriteBack() {
+    for (std::size_t i = 0; i < rows_.size(); ++i) {
+      std::copy(rows_[i].begin(), rows_[i].begin() + static_cast<std::ptrdiff_t>(cols_),
+                target_[i].begin());
+    }
+  }
+
+ private:
+  TQENFloatMatrix& target_;
+  std::size_t cols_;
+  MatrixOf<Extended> rows_;
+};
+
 // --- The public families ---
 
 template <typename T>
 void RowEchelonFormOf(MatrixOf<T>& M) {
   const detail::MatrixShape s = CheckReducible(M);
-  Eliminate(M, s.Rows, s.Cols, Followers<T>{});
+  WorkingRows<T> w(M, s.Cols);
+  Eliminate(w.Rows(), s.Rows, s.Cols, Followers<typename WorkingRows<T>::Element>{});
+  w.WriteBack();
 }
 
 template <typename T>
 void RowEchelonFormRankOf(MatrixOf<T>& M, LongWord& Rank) {
-  const detail::MatrixShape s = CheckReducible(M);
-  Eliminate(M, s.Rows, s.Cols, Followers<T>{});
-  Rank = s.Rows - CountZeroRows(M);
+  RowEchelonFormOf(M);
+  Rank = static_cast<LongWord>(M.size()) - CountZeroRows(M);
 }
 
 template <typename T>
 bool InverseOf(MatrixOf<T>& M, MatrixOf<T>& Inverse) {
+  using W = typename WorkingRows<T>::Element;
   const detail::MatrixShape s = CheckSquare(M);
   const std::size_t n = s.Rows;
   Inverse = detail::CreateIdentityOf<T>(s.Rows, T(1));
-  Eliminate(M, n, n, Followers<T>{&Inverse, nullptr});
-  if (CountZeroRows(M) != 0) return false;
+  WorkingRows<T> wm(M, n);
+  WorkingRows<T> wi(Inverse, n);
+  MatrixOf<W>& m = wm.Rows();
+  MatrixOf<W>& inv = wi.Rows();
+  Eliminate(m, n, n, Followers<W>{&inv, nullptr});
+  wm.WriteBack();
+  if (CountZeroRows(M) != 0) {
+    wi.WriteBack();
+    return false;
+  }
   for (std::size_t j = n - 1; j >= 1; --j) {
     for (std::size_t i = j; i-- > 0;) {
-      const Extended above = static_cast<Extended>(M[i][j]);
+      const Extended above = static_cast<Extended>(m[i][j]);
       if (FloatIsNotZero(above)) {
-        AddRowMultiple(M[i], M[j], n, -above);
-        AddRowMultiple(Inverse[i], Inverse[j], n, -above);
+        AddRowMultiple(m[i], m[j], n, -above);
+        AddRowMultiple(inv[i], inv[j], n, -above);
       }
     }
   }
+  wm.WriteBack();
+  wi.WriteBack();
   return true;
 }
 
 template <typename T>
 Extended DeterminantOf(MatrixOf<T>& M) {
+  using W = typename WorkingRows<T>::Element;
   const detail::MatrixShape s = CheckSquare(M);
   Extended d = 1;
-  Eliminate(M, s.Rows, s.Cols, Followers<T>{nullptr, &d});
+  WorkingRows<T> w(M, s.Cols);
+  Eliminate(w.Rows(), s.Rows, s.Cols, Followers<W>{nullptr, &d});
+  w.WriteBack();
   for (std::size_t i = 0; i < s.Rows; ++i) d *= static_cast<Extended>(M[i][i]);
   return d;
 }

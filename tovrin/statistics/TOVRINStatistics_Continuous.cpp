@@ -499,7 +499,14 @@ Extended ChiSquarePDF(Extended X, LongWord DF) {
   if (X < 0) RaiseMathError(rsValueGEZero);
   CheckDF(DF);
   const Extended half = static_cast<Extended>(DF) / 2;
-  return XtoY(X, half - 1) * std::exp(-X / 2) / (TwoToY(half) * Gamma(half));
+  const Extended density = XtoY(X, half - 1) * std::exp(-X / 2) / (TwoToY(half) * Gamma(half));
+  // Past about 3500 degrees of freedom the factors overflow (inf / inf); the logarithms then
+  // give the value the product cannot hold.
+  if (!std::isfinite(density) && X > 0 && std::isfinite(X)) {
+    return std::exp((half - 1) * std::log(X) - X / 2 - half * 0.693147180559945309417232121458L -
+                    LnGamma(half));
+  }
+  return density;
 }
 
 void ChiSquarePDFValues(LongWord DF, Extended XLow, Extended XHigh, LongWord N,

@@ -365,7 +365,7 @@ TEST(FDistTest, Checks) {
 // The error of StudentTLess: the incomplete beta's relative 1e-17 (of the smaller tail), a few
 // ulps of 1, and the rounding of x = df / (df + t^2), which near 1 (t^2 much below df)
 // stands for a relative change in t of eps (df + t^2) / t^2 and so moves P by the density
-// times eps (df + t^2) / |t|: the stated formula's own conditioning.
+// times eps (df + t^2) / |t|: the documented formula's own conditioning.
 Extended StudentTLessError(Extended t, Extended df, Extended p, Extended density) {
   const Extended conditioning = t == 0 ? 0 : 2 * kEps * density * (df + t * t) / std::fabs(t);
   return 4e-17L * std::fmin(p, 1 - p) + 4 * kEps + conditioning;

@@ -176,8 +176,8 @@ Extended HyperGeometricGreater(LongWord N, LongWord S, LongWord M, LongWord X) {
 
 Extended HyperGeometricBetween(LongWord N, LongWord S, LongWord M, LongWord X1, LongWord X2) {
   CheckHyperGeometric(N, S, M);
-  if (X1 > S || X2 > S) RaiseMathError(rsHyperGeometricInvalid);
   if (X1 == X2) return HyperGeometricTerm(N, S, M, X2);
+  if (X1 > S || X2 > S) RaiseMathError(rsHyperGeometricInvalid);
   const Extended difference =
       HyperGeometricSumBelow(N, S, M, X1) - HyperGeometricSumBelow(N, S, M, Count{X2} + 1);
   return X2 > X1 ? -difference : difference;

@@ -32,7 +32,8 @@ Extended BinomialBetween(Extended P, LongWord N, LongWord R1, LongWord R2);
 
 // --- Hypergeometric (sample of S drawn from N of which M are successes) ----------------------
 // N = 0, S = 0, S > N or M > N raises rsHyperGeometricInvalid; so does a count above S in Less,
-// Greater and Between. Counts that cannot occur have probability 0.
+// Greater and Between (unless Between's two counts are equal). Counts that cannot occur have
+// probability 0.
 Extended HyperGeometricEq(LongWord N, LongWord S, LongWord M, LongWord X);
 Extended HyperGeometricLess(LongWord N, LongWord S, LongWord M, LongWord X);
 Extended HyperGeometricGreater(LongWord N, LongWord S, LongWord M, LongWord X);

@@ -122,7 +122,8 @@ table("kIncompleteGamma2Ref", ["a", "x", "Gamma(a, x)"], rows, "upper incomplete
 
 rows = []
 for x, k in [("0.001", 1), ("0.5", 1), ("3.84", 1), ("2", 2), ("7.5", 5), ("20", 10),
-             ("150", 100), ("60", 100), ("1200", 1000), ("0.004", 3), ("25", 3)]:
+             ("150", 100), ("60", 100), ("1200", 1000), ("0.004", 3), ("25", 3),
+             ("5000", 5000)]:
     x = ext(x)
     rows.append((x, k, chi2_cdf(x, k), chi2_pdf(x, k)))
 table("kChiSquareRef", ["x", "df", "P", "density"], rows, "chi-square distribution and density")

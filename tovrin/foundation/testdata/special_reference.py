@@ -4,15 +4,13 @@
 Writes special_reference.inc beside this script. Every argument is an exact 80-bit value
 (written as a hexadecimal literal); every expected value is computed here with mpmath at
 256 bits and printed to 25 significant digits. The incomplete beta is evaluated from its
-hypergeometric series with positive terms on the side of the mean where it converges,
+hypergeometric series with positive terms, summed on whichever side of the point is shorter,
 so it shares no method with the library's continued fraction. Not run by CI:
 
-    python3 special_reference.py            # regenerate the table
-    python3 special_reference.py --check EVAL   # compare a program that reads "f a b c" lines
+    python3 special_reference.py            # regenerate the table (about two minutes)
 """
 import os
 import random
-import subprocess
 import sys
 
 from mpmath import mp, mpf
@@ -217,7 +215,7 @@ def ibeta_cases(rng):
         x = mean + sd * mpf(rng.uniform(-3, 3))
         if not (0 < x < 1):
             x = mpf(rng.random())
-        add(x, a, b, HARD if max(a, b) > 1000 else ORDINARY)
+        add(x, a, b, ORDINARY)
     # Ordinary shapes over the whole interval, including within 1e-12 of both ends.
     for a, b in [(0.5, 0.5), (1, 1), (2, 3), (0.5, 10), (10, 0.5), (5, 5), (0.1, 0.2), (30, 7),
                  (1e-3, 1e-3), (1e-3, 2), (2, 1e-3), (0.5, 200), (200, 0.5), (150, 400)]:
@@ -237,7 +235,7 @@ def ibeta_cases(rng):
         mean = a / (a + b)
         sd = mp.sqrt(a * b / ((a + b) ** 2 * (a + b + 1)))
         for k in [-10, -3, -1, -0.1, 0, 0.1, 1, 3, 10]:
-            add(mean + k * sd, a, b, HARD)
+            add(mean + k * sd, a, b, ORDINARY)
     return rows
 
 
@@ -259,8 +257,9 @@ def inverse_cases(rng):
                 continue
             if root < mpf("1e-4900"):
                 continue
-            small = min(a, b)
-            tol = ORDINARY if (small >= 0.5 and max(a, b) <= 1000) else HARD
+            # Below a shape of 1/2 the root is flat in its tail (I ~ x^a): a relative error d
+            # in I moves x by about d / a, whatever the method.
+            tol = ORDINARY if min(a, b) >= 0.5 else HARD
             rows.append((p, a, b, root, tol))
     return rows
 
