@@ -61,7 +61,7 @@ void LogNormalPDFValues(Extended Mean, Extended StdDev, Extended XLow, Extended 
 // zero within the tolerance, 1 when X > 1e8, and results below exp(-88) flush to 0 (or, for
 // the upper tail, to 1). X < 0 raises rsValueGEZero, A <= 0 rsValueGZero; NaN gives NaN.
 // IncompleteGamma2(A, X) is the unregularised upper Gamma(A, X) for whole and half-whole A:
-// ChiSquareGreater(2X, Round(2A)) * Gamma(A) (so A < 0.25 raises rsDF).
+// ChiSquareGreater(2X, Round(2A)) * Gamma(A) (so A <= 0.25, rounding to 0, raises rsDF).
 Extended IncompleteGamma(Extended A, Extended X);
 Extended IncompleteGamma2(Extended A, Extended X);
 
