@@ -1,5 +1,6 @@
 #include "tovrin/currency/TOVRINFinVector.h"
 
+#include <cmath>
 #include <utility>
 
 #include "tovrin/currency/detail/MoneyRules.h"
@@ -46,7 +47,15 @@ T Same(T x) {
 
 TQENCurrency CurrFromFloat(PackedExtended x) { return Float2QENCurrency(x); }
 TQENLongCurrency LongCurrFromFloat(PackedExtended x) { return Float2QENLongCurrency(x); }
-Currency CurrencyFromFloat(PackedExtended x) { return detail::Float2Money<Currency>(x); }
+// x x 10000 rounded to the nearest unit, an exact half to the even one. Within Currency's range
+// the exact product is rounded; beyond it (and for a NaN or an infinity) the overflow is not
+// reported: the product wraps as the other unreported money overflows do.
+Currency CurrencyFromFloat(PackedExtended x) {
+  const Extended v = x;
+  constexpr Extended kProductFits = 922337203685477.5L;  // v x 10000 stays below 2^63 - 1
+  if (std::fabs(v) < kProductFits) return detail::Float2Money<Currency>(v);
+  return Currency{detail::RoundWrapping(v * detail::kMoneyScale<Currency>)};
+}
 PackedExtended FloatOf(TQENCurrency x) { return Currency2Float(x); }
 PackedExtended FloatOf(TQENLongCurrency x) { return Currency2Float(x); }
 PackedExtended FloatOf(Currency x) { return Currency2Float(x); }

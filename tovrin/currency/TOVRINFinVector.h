@@ -134,8 +134,9 @@ LongInt Vector2RankValue(const TQENCurrencyVector& V, Currency Value, bool Ascen
 // A vector of the source's length (empty for an empty source, no error). The same type is
 // copied; other money types go through the conversion services (QENCurrency2QENLongCurrency
 // and the rest, rounding half to even and raising rsInvalidValue out of range); a float
-// vector through Float2QENCurrency, Float2QENLongCurrency, or for Currency x x 10000 rounded
-// to the nearest unit by the same rule and range check.
+// vector through Float2QENCurrency and Float2QENLongCurrency (the same rule and range check),
+// or for Currency x x 10000 rounded to the nearest unit, halves to even, with an overflow that
+// is not reported (the rounded product wraps modulo 2^64; a NaN or an infinity gives -2^63).
 TQENCurrVector Vector2QENCurrVector(const TQENCurrVector& V);
 TQENCurrVector Vector2QENCurrVector(const TQENLongCurrVector& V);
 TQENCurrVector Vector2QENCurrVector(const TQENCurrencyVector& V);

@@ -300,7 +300,19 @@ TEST(MoneyVectorConversions, FromFloatRoundsTheExactProduct) {
   EXPECT_EQ(StoredOf(Vector2QENCurrencyVector(TQENFloatVector{0.000025L, 0.00015L})), (Ints{0, 2}));
   EXPECT_TRUE(Vector2QENCurrVector(TQENFloatVector{}).empty());
   ExpectRaises(rsInvalidValue, [] { Vector2QENCurrVector(TQENFloatVector{1, 1e300L}); });
-  ExpectRaises(rsInvalidValue, [] { Vector2QENCurrencyVector(TQENFloatVector{1e16L}); });
+}
+
+TEST(MoneyVectorConversions, FloatToCurrencyOverflowIsNotReported) {
+  // The Currency conversion is a rounding of x x 10000 whose overflow is not reported: 1e20
+  // stored units wrap modulo 2^64 to 1e20 - 5 x 2^64 (exact integer arithmetic).
+  EXPECT_EQ(StoredOf(Vector2QENCurrencyVector(TQENFloatVector{1e16L, -1e16L})),
+            (Ints{7766279631452241920, -7766279631452241920}));
+  EXPECT_EQ(StoredOf(Vector2QENCurrencyVector(
+                TQENFloatVector{std::numeric_limits<Extended>::quiet_NaN()})),
+            (Ints{INT64_MIN}));
+  // The largest amounts that fit are still rounded exactly (halves to even).
+  EXPECT_EQ(StoredOf(Vector2QENCurrencyVector(TQENFloatVector{922337203685477.25L, -0.00005L})),
+            (Ints{9223372036854772500, 0}));
 }
 
 TEST(MoneyVectorConversions, BetweenMoneyTypes) {

@@ -3,6 +3,7 @@
 
 #include <atomic>
 #include <cmath>
+#include <random>
 #include <thread>
 
 #include "tovrin/matrix/TOVRINMatrix.h"
@@ -159,6 +160,31 @@ TYPED_TEST(Reduce, RandomMatricesAgainstExactArithmetic) {
     RowEchelonFormRank(r, rank);
     EXPECT_EQ(rank, static_cast<LongWord>(c.N));
   }
+}
+
+// A larger random, diagonally dominant (so well-conditioned) matrix: A x A^-1 is the identity
+// within a few units of roundoff, and the rank is full.
+TYPED_TEST(Reduce, RandomInverseRoundTrip) {
+  constexpr int n = 40;
+  std::mt19937_64 gen(77);
+  std::uniform_real_distribution<double> u(-1.0, 1.0);
+  Matrix<TypeParam> a(n, std::vector<TypeParam>(n));
+  for (int i = 0; i < n; ++i) {
+    for (int j = 0; j < n; ++j) a[i][j] = TypeParam(static_cast<long double>(u(gen)));
+    a[i][i] = TypeParam(static_cast<long double>(a[i][i]) + 2.0L * n);
+  }
+  auto m = a;
+  Matrix<TypeParam> inv;
+  ASSERT_TRUE(MatrixInverse(m, inv));
+  EXPECT_TRUE(MatrixIsIdentity(m) || !std::is_same_v<TypeParam, PackedExtended>);
+  const auto product = MultiplyMatrices(a, inv);
+  long double worst = 0;
+  for (int i = 0; i < n; ++i) {
+    for (int j = 0; j < n; ++j) {
+      worst = std::max(worst, std::fabs(At(product, i, j) - (i == j ? 1.0L : 0.0L)));
+    }
+  }
+  EXPECT_LE(worst, 64 * n * Epsilon<TypeParam>());
 }
 
 TYPED_TEST(Reduce, ChecksInOrder) {

@@ -3,6 +3,7 @@
 determinants and inverses, computed in rational arithmetic (fractions.Fraction), for the row
 reduction tests. Run from this directory: python3 TOVRINMatrix_reduce_test_table.py"""
 import random
+import subprocess
 from fractions import Fraction
 
 
@@ -81,3 +82,4 @@ for n, a, det, inv, cond in cases:
     out.append(f"       {cond:.6g}}},")
 out += ["  };", "  return cases;", "}", "", "}  // namespace tovrin::testing", ""]
 open("TOVRINMatrix_reduce_test_table.h", "w").write("\n".join(out))
+subprocess.run(["clang-format", "-i", "TOVRINMatrix_reduce_test_table.h"], check=True)

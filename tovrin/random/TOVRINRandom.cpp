@@ -144,9 +144,9 @@ double DrawDouble(Gen& gen) {
 double DrawDouble(ThreadSource& gen) { return gen.NextDouble(); }
 
 // Leva's ratio of uniforms. The uniforms, the transformed v and the intermediates x, y, q are
-// doubles computed in double arithmetic on purpose (the published method's precision, and the
-// fast path of every method built on the normal); the logarithmic test and the ratio are
-// Extended.
+// held as doubles (the published method's precision); each of them is computed in Extended
+// arithmetic with Extended constants and rounded once when it is stored, like every other
+// value of the library. The comparisons, the logarithmic test and the ratio are Extended.
 template <typename Gen>
 Extended StandardNormal(Gen& gen) {
   double u;
@@ -154,12 +154,14 @@ Extended StandardNormal(Gen& gen) {
   for (;;) {
     u = DrawDouble(gen);
     v = DrawDouble(gen);
-    v = (v - 0.5) * 1.7156;
-    const double x = u - 0.449871;
-    const double y = std::fabs(v) + 0.386595;
-    const double q = x * x + y * (0.196 * y - 0.25472 * x);
-    if (q < 0.27597) break;
-    if (q > 0.27846) continue;
+    v = static_cast<double>((v - 0.5L) * 1.7156L);
+    const double x = static_cast<double>(u - 0.449871L);
+    const double y = static_cast<double>(std::fabs(v) + 0.386595L);
+    const Extended xe = x;
+    const Extended ye = y;
+    const double q = static_cast<double>(xe * xe + ye * (0.196L * ye - 0.25472L * xe));
+    if (q < 0.27597L) break;
+    if (q > 0.27846L) continue;
     if (static_cast<Extended>(v) * v <
         -4.0L * static_cast<Extended>(u) * u * std::log(Extended{u})) {
       break;

@@ -296,6 +296,23 @@ TEST(RandomNormal, LevaDrawsUFirstThenV) {
   EXPECT_EQ(Random_Normal(swapped), 0.0L);
 }
 
+TEST(RandomNormal, TransformedVIsRoundedOnceToDouble) {
+  // v = (v - 0.5) * 1.7156 is worked out in Extended with the Extended constant and rounded
+  // once to double; plain double arithmetic lands one double ulp higher on these uniforms.
+  // Expected values from TOVRINRandom_test_normal_reference.py (mpmath, exact roundings).
+  struct Case {
+    Extended v;
+    Extended expected;
+  };
+  for (const Case& c : {Case{0.5021L, 0x1.d83890c02c283p-8L}, Case{0.5065L, 0x1.6d68b926fd97bp-6L},
+                        Case{0.5089L, 0x1.f4545039535efp-6L}}) {
+    ScriptedSource script{0.5L, c.v};
+    EXPECT_EQ(Random_Normal(script), c.expected) << static_cast<double>(c.v);
+    ScriptedSource scaled{0.5L, c.v};
+    EXPECT_EQ(Random_Normal(1, 1, scaled), 1 + c.expected) << static_cast<double>(c.v);
+  }
+}
+
 TEST(RandomNormal, RejectedPairsAreRedrawn) {
   // (0.01, 0.99): q is about 0.63, past the outer bound; (0, 0.5): u = 0 makes the log test NaN.
   ScriptedSource script{0.01L, 0.99L, 0.0L, 0.5L, 0.5L, 0.6L};

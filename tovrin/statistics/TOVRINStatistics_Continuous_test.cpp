@@ -227,7 +227,11 @@ TEST(IncompleteGammaTest, UpperUnregularised) {
   }
   ExpectRaises(rsValueGEZero, [] { IncompleteGamma2(1, -1); });
   ExpectRaises(rsValueGZero, [] { IncompleteGamma2(0, 1); });
-  ExpectRaises(rsDF, [] { IncompleteGamma2(0.2L, 1); });  // Round(0.4) = 0 degrees of freedom
+  ExpectRaises(rsDF, [] { IncompleteGamma2(0.2L, 1); });   // Round(0.4) = 0 degrees of freedom
+  ExpectRaises(rsDF, [] { IncompleteGamma2(0.25L, 1); });  // Round(0.5) = 0: half to even
+  // Round(1.5) = 2: A = 0.75 is treated as 1, Gamma(0.75) times e^-X.
+  EXPECT_TRUE(
+      RelNear(IncompleteGamma2(0.75L, 2), 1.2254167024651776451L * std::exp(-2.0L), 1e-10L));
 }
 
 // === Chi-square ================================================================================
