@@ -310,9 +310,10 @@ TEST(MoneyVectorConversions, FloatToCurrencyOverflowIsNotReported) {
   EXPECT_EQ(StoredOf(Vector2QENCurrencyVector(
                 TQENFloatVector{std::numeric_limits<Extended>::quiet_NaN()})),
             (Ints{INT64_MIN}));
-  // The largest amounts that fit are still rounded exactly (halves to even).
-  EXPECT_EQ(StoredOf(Vector2QENCurrencyVector(TQENFloatVector{922337203685477.25L, -0.00005L})),
-            (Ints{9223372036854772500, 0}));
+  // Amounts that fit are still rounded exactly: 1/32 and 3/32 are 312.5 and 937.5 units.
+  EXPECT_EQ(
+      StoredOf(Vector2QENCurrencyVector(TQENFloatVector{922337203685477.25L, -0.03125L, 0.09375L})),
+      (Ints{9223372036854772500, -312, 938}));
 }
 
 TEST(MoneyVectorConversions, BetweenMoneyTypes) {

@@ -176,7 +176,6 @@ TYPED_TEST(Reduce, RandomInverseRoundTrip) {
   auto m = a;
   Matrix<TypeParam> inv;
   ASSERT_TRUE(MatrixInverse(m, inv));
-  EXPECT_TRUE(MatrixIsIdentity(m) || !std::is_same_v<TypeParam, PackedExtended>);
   const auto product = MultiplyMatrices(a, inv);
   long double worst = 0;
   for (int i = 0; i < n; ++i) {

@@ -2,6 +2,7 @@
 // transposition, the matrix product and the row and column sums.
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <cmath>
 #include <limits>
 #include <random>
@@ -125,6 +126,35 @@ TYPED_TEST(RowColAllTypes, SortsOrderEqualKeysAsTheQuickSortLeavesThem) {
   t = Make<TypeParam>({{2, 1, 2, 1}, {0, 1, 2, 3}});
   QSortMatrixColsOnRow(t, 0, false);
   EXPECT_EQ(Values(t), (Rows{{2, 2, 1, 1}, {2, 0, 3, 1}}));
+}
+
+// Many repeated keys: the sorted key column is ordered, and every row is still whole (its tag
+// and its check value travel with it).
+TYPED_TEST(RowColAllTypes, SortsKeepRowsWholeOnLargeInputs) {
+  std::mt19937_64 gen(99);
+  std::uniform_int_distribution<int> key(0, 9);
+  constexpr int n = 300;
+  Matrix<TypeParam> m(n);
+  for (int i = 0; i < n; ++i) {
+    const int k = key(gen);
+    m[i] = {TypeParam(k), TypeParam(i % 100), TypeParam((k * 7 + i % 100) % 50)};
+  }
+  for (bool ascending : {true, false}) {
+    auto sorted = m;
+    QSortMatrixRowsOnCol(sorted, 0, ascending);
+    auto before = Values(m);
+    auto after = Values(sorted);
+    for (int i = 1; i < n; ++i) {
+      EXPECT_TRUE(ascending ? after[i - 1][0] <= after[i][0] : after[i - 1][0] >= after[i][0]);
+    }
+    std::sort(before.begin(), before.end());
+    std::sort(after.begin(), after.end());
+    EXPECT_EQ(before, after);
+    // The column sort of the transpose moves the same columns.
+    auto t = TransposeMatrix(m);
+    QSortMatrixColsOnRow(t, 0, ascending);
+    EXPECT_TRUE(SameBits(TransposeMatrix(t), sorted));
+  }
 }
 
 TYPED_TEST(RowColAllTypes, SortsWithTheSwitchOff) {

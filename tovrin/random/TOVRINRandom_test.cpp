@@ -313,6 +313,21 @@ TEST(RandomNormal, TransformedVIsRoundedOnceToDouble) {
   }
 }
 
+TEST(RandomNormal, PairsAtTheBoundsFollowTheExtendedQuotient) {
+  // u = 0.5 with v placing q within 1e-15 of a bound (outcomes from
+  // TOVRINRandom_test_normal_reference.py): next to 0.27597 both pairs are accepted, one by the
+  // bound and one by the log test; next to 0.27846 both are rejected, and (0.5, 0.6) follows.
+  ScriptedSource inner{0.5L, 0x1.f6fd66ad92a84p-1L};
+  EXPECT_EQ(Random_Normal(inner), 0x1.a7bc5c49ef6b6p+0L);
+  ScriptedSource logAccept{0.5L, 0x1.f6fd66ad92a85p-1L};
+  EXPECT_EQ(Random_Normal(logAccept), 0x1.a7bc5c49ef6b8p+0L);
+  for (Extended v : {0x1.f8972c00f75c0p-1L, 0x1.f8972c00f75c1p-1L}) {
+    ScriptedSource rejected{0.5L, v, 0.5L, 0.6L};
+    EXPECT_NEAR(Random_Normal(rejected), 0.34312L, 1e-15L);
+    EXPECT_EQ(rejected.Draws(), 4u);
+  }
+}
+
 TEST(RandomNormal, RejectedPairsAreRedrawn) {
   // (0.01, 0.99): q is about 0.63, past the outer bound; (0, 0.5): u = 0 makes the log test NaN.
   ScriptedSource script{0.01L, 0.99L, 0.0L, 0.5L, 0.5L, 0.6L};

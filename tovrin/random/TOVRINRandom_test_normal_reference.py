@@ -1,5 +1,6 @@
 #!/usr/bin/env python3
-"""Exact reference values for RandomNormal.TransformedVIsRoundedOnceToDouble.
+"""Exact reference values for RandomNormal.TransformedVIsRoundedOnceToDouble and
+RandomNormal.PairsAtTheBoundsFollowTheExtendedQuotient.
 
 The standard normal holds its uniforms and the transformed v = (v - 0.5) * 1.7156 as doubles,
 but computes v in 80-bit arithmetic with the 80-bit constant 1.7156 and rounds once to double
@@ -28,3 +29,31 @@ for text in ('0.5021', '0.5065', '0.5089'):
     once = rnd(rnd(rnd(v - mpf('0.5'), 64) * C64, 64), 53)
     plain = rnd(rnd(v - mpf('0.5'), 53) * C53, 53)
     print(text, 'expected', float(2 * once).hex(), 'double arithmetic', float(2 * plain).hex())
+
+# Pairs (u = 0.5, v) whose q lies within 1e-15 of one of the bounds 0.27597 and 0.27846 (for
+# RandomNormal.PairsAtTheBoundsFollowTheExtendedQuotient): the outcome of each test as the
+# method states it, with x, y, q worked out in Extended and stored as doubles, and 2 v.
+E = lambda s: rnd(mpf(s), 64)
+
+
+def leva(u, v):
+    v2 = rnd(rnd(rnd(v - E('0.5'), 64) * E('1.7156'), 64), 53)
+    x = rnd(rnd(u - E('0.449871'), 64), 53)
+    y = rnd(rnd(abs(v2) + E('0.386595'), 64), 53)
+    with mp.workprec(64):
+        t = +(E('0.196') * y)
+        t = +(t - +(E('0.25472') * x))
+        t = +(y * t)
+        q = +(+(x * x) + t)
+    q = rnd(q, 53)
+    if q < E('0.27597'):
+        return 'accepted by the inner bound', v2
+    if q > E('0.27846'):
+        return 'rejected by the outer bound', v2
+    return ('accepted' if v2 * v2 < -4 * u * u * mp.log(u) else 'rejected') + ' by the log test', v2
+
+
+for text in ('0x1.f6fd66ad92a84p-1', '0x1.f6fd66ad92a85p-1', '0x1.f8972c00f75c0p-1',
+             '0x1.f8972c00f75c1p-1'):
+    kind, v2 = leva(mpf(0.5), mpf(float.fromhex(text)))
+    print(text, kind, 'result if accepted', float(2 * v2).hex())

@@ -285,6 +285,15 @@ TEST(SampleTrimmedMean, AgreesWithHighPrecision) {
   EXPECT_TRUE(RelNear(ExcelTrimmedMean(x, 0.3L), kCentredExcelTrimmed3_10));
 }
 
+TEST(SampleTrimmedMean, IntegerElementsAddInExtendedWhileTheZeroShortcutWraps) {
+  // Three times 2^62 is 2^63 + 2^62: exact in Extended, -2^62 as a wrapping Int64 sum.
+  const Int64 quarter = Int64{1} << 62;
+  const TQENInt64Vector x = {quarter, quarter, quarter};
+  EXPECT_EQ(TrimmedMean(x, 0.1L), 0x1p62L);  // Trunc(0.3) = 0 dropped, summed in Extended
+  EXPECT_EQ(ExcelTrimmedMean(x, 0.5L), 0x1p62L);
+  EXPECT_EQ(TrimmedMean(x, 0), -0x1p62L / 3);  // QENMean, with its wrapping sum
+}
+
 // ---------------------------------------------------------------------------------------------
 // Quartiles and deciles: the Hazen quantile with its position held in single precision.
 
