@@ -185,6 +185,23 @@ TEST(DescStatsTest, PopulationSwitchRecomputes) {
   EXPECT_NEAR(static_cast<double>(stats.Variance()), 5.0 / 3.0, 1e-15);
 }
 
+TEST(DescStatsTest, CountLimitsHoldForAPopulationToo) {
+  // Population of 1, 2, 6: mean 3, SS 14, variance 14/3, S3 18, skew 18 / (3 (14/3)^1.5)
+  // = 0.59517... (exact fractions, then one square root). Three values are too few for
+  // kurtosis whatever the divisor.
+  TQENDescStats stats = WithValues({1, 2, 6}, true);
+  const Lines report = stats.DescStats();
+  ASSERT_EQ(report.size(), 18u);
+  EXPECT_EQ(report[9], "Variance:\t4.6667");
+  EXPECT_EQ(report[10], "Standard Deviation:\t2.1602");
+  EXPECT_EQ(report[11], "Not enough Values for Kurtosis");
+  EXPECT_EQ(report[12], "Skew:\t0.5952");
+  EXPECT_EQ(stats.Kurtosis(), 0.0L);
+  TQENDescStats two = WithValues({1, 3}, true);
+  EXPECT_EQ(two.DescStats()[12], "Not enough Values for Skew");
+  EXPECT_EQ(two.Skew(), 0.0L);
+}
+
 TEST(DescStatsTest, MichelsonLightSpeed1879) {
   // Offsets from 299000 km/s, 100 values. Reference (python3, exact fractions): sum 85240,
   // sum of squares 73276600, variance 6242.6666..., sd 79.01054781905177, sample skew

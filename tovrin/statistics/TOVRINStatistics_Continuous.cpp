@@ -45,6 +45,11 @@ void EmptyTable(TQENFloatVector& XValues, TQENFloatVector& YValues) {
 void CheckStdDev(Extended StdDev) {
   if (!FloatIsPositive(StdDev)) RaiseMathError(rsStdDev);
 }
+// The inverses reject a standard deviation that is zero within the tolerance or negative, so
+// QENTolerance itself passes here while CheckStdDev rejects it (and a NaN gives NaN).
+void CheckInverseStdDev(Extended StdDev) {
+  if (FloatIsZero(StdDev) || FloatIsNegative(StdDev)) RaiseMathError(rsStdDev);
+}
 void CheckOpenProbability(Extended P) {
   if (!(P > 0 && P < 1)) RaiseMathError(rsValue01);
 }
@@ -343,13 +348,13 @@ Extended NormalDistBetween(Extended Mean, Extended StdDev, Extended X1, Extended
 
 Extended InvNormalDistLess(Extended Mean, Extended StdDev, Extended P) {
   CheckOpenProbability(P);
-  CheckStdDev(StdDev);
+  CheckInverseStdDev(StdDev);
   return Mean + StdDev * InvNormalLess(P);
 }
 
 Extended InvNormalDistGreater(Extended Mean, Extended StdDev, Extended P) {
   CheckOpenProbability(P);
-  CheckStdDev(StdDev);
+  CheckInverseStdDev(StdDev);
   return Mean + StdDev * InvNormalGreater(P);
 }
 
@@ -380,13 +385,13 @@ Extended LogNormalBetween(Extended Mean, Extended StdDev, Extended X1, Extended 
 
 Extended InvLogNormalLess(Extended Mean, Extended StdDev, Extended P) {
   CheckOpenProbability(P);
-  CheckStdDev(StdDev);
+  CheckInverseStdDev(StdDev);
   return std::exp(Mean + StdDev * InvNormalLess(P));
 }
 
 Extended InvLogNormalGreater(Extended Mean, Extended StdDev, Extended P) {
   CheckOpenProbability(P);
-  CheckStdDev(StdDev);
+  CheckInverseStdDev(StdDev);
   return std::exp(Mean + StdDev * InvNormalGreater(P));
 }
 

@@ -31,7 +31,8 @@ Extended ZAlpha(Extended Alpha);
 
 // --- Normal with mean and standard deviation ------------------------------------------------
 // A standard deviation that is not positive (within the tolerance) raises rsStdDev; the
-// inverses raise rsValue01 first, unless 0 < P < 1.
+// inverses raise rsValue01 first, unless 0 < P < 1, and then rsStdDev for a standard deviation
+// that is zero within the tolerance or negative (so QENTolerance itself passes there).
 Extended NormalPDF(Extended Mean, Extended StdDev, Extended X);
 void NormalPDFValues(Extended Mean, Extended StdDev, Extended XLow, Extended XHigh, LongWord N,
                      TQENFloatVector& XValues, TQENFloatVector& YValues);

@@ -150,9 +150,29 @@ TEST(NormalDistTest, StdDevMustBePositive) {
     ExpectRaises(rsStdDev, [&] { LogNormalLess(0, sd, 1); });
     ExpectRaises(rsStdDev, [&] { LogNormalGreater(0, sd, 1); });
     ExpectRaises(rsStdDev, [&] { LogNormalBetween(0, sd, 1, 2); });
+  }
+}
+
+// The inverses test the standard deviation as zero within the tolerance (|s| < QENTolerance)
+// or negative, not as "not positive": QENTolerance itself passes, and a NaN gives NaN.
+TEST(NormalDistTest, InverseStdDevIsZeroOrNegative) {
+  for (Extended sd : {Extended(0), Extended(-1), Extended(1e-13L), Extended(4.9e-12L),
+                      Extended(-4.9e-12L), Extended(-1e-11L)}) {
+    SCOPED_TRACE(static_cast<double>(sd));
+    ExpectRaises(rsStdDev, [&] { InvNormalDistLess(0, sd, 0.5L); });
+    ExpectRaises(rsStdDev, [&] { InvNormalDistGreater(0, sd, 0.5L); });
     ExpectRaises(rsStdDev, [&] { InvLogNormalLess(0, sd, 0.5L); });
     ExpectRaises(rsStdDev, [&] { InvLogNormalGreater(0, sd, 0.5L); });
   }
+  // InvNormalLess(0.5) is exactly 0, so the results are Mean and exp(Mean).
+  EXPECT_EQ(InvNormalDistLess(3, QENTolerance, 0.5L), 3);
+  EXPECT_EQ(InvNormalDistGreater(3, QENTolerance, 0.5L), 3);
+  EXPECT_EQ(InvLogNormalLess(0, QENTolerance, 0.5L), 1);
+  EXPECT_EQ(InvLogNormalGreater(0, QENTolerance, 0.5L), 1);
+  ExpectRaises(rsStdDev, [] { NormalPDF(0, QENTolerance, 1); });  // "not positive" rejects it
+  ExpectRaises(rsStdDev, [] { NormalDistLess(0, QENTolerance, 1); });
+  EXPECT_TRUE(std::isnan(InvNormalDistLess(0, kNaN, 0.5L)));
+  EXPECT_TRUE(std::isnan(InvLogNormalLess(0, kNaN, 0.5L)));
 }
 
 // === Log-normal ================================================================================

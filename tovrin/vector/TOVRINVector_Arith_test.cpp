@@ -234,6 +234,15 @@ TEST(MovingAverageTest, SumsInExtended) {
   EXPECT_EQ(MovingAverage(v, 2, 0)[0], 0x1p52 + 2);
 }
 
+TEST(MovingAverageTest, EachWindowIsSummedAfresh) {
+  // 2^70 + 1 rounds to 2^70 in Extended (the unit in the last place there is 2^7), so a total
+  // carried from window to window (add the new element, subtract the old one) would give the
+  // window [1, 1] the sum 1; summed afresh it is 2.
+  EXPECT_EQ(Values(MovingAverage(TQENFloatVector{0x1p70L, 1, 1, 1}, 2, 0)), L({0x1p69L, 1, 1, 0}));
+  EXPECT_EQ(MovingAverage(TQENDoubleVector{0x1p70, 1, 1, 1}, 2, 1),
+            (TQENDoubleVector{0, 0x1p69, 1, 1}));
+}
+
 // --- Two vectors ----------------------------------------------------------------------------
 
 template <typename V>
@@ -342,6 +351,12 @@ TEST(ProductTest, FloatsWorkInExtended) {
   EXPECT_EQ(SumSqDiffVectors(TQENSingleVector{0x1p100f}, TQENSingleVector{-0x1p100f}), 0x1p202L);
 }
 
+TEST(ProductTest, FloatSumsStartFromZero) {
+  // The only term is -1 * 0 = -0; a sum that starts at +0 ends at +0.
+  EXPECT_FALSE(std::signbit(DotProdVectors(TQENDoubleVector{-1}, TQENDoubleVector{0})));
+  EXPECT_FALSE(std::signbit(DotProdVectors(TQENFloatVector{0}, TQENFloatVector{-1})));
+}
+
 // --- Conversions ----------------------------------------------------------------------------
 
 TEST(ConversionTest, ToExtended) {
@@ -383,6 +398,15 @@ TEST(PolynomialTest, AscendingCoefficients) {
   EXPECT_EQ(QENPolynomial(TQENFloatVector{5}, 1e300L), 5);
   EXPECT_EQ(QENPolynomial(TQENFloatVector{0, 0, 0, 1}, -3), -27);
   EXPECT_EQ(QENPolynomial(TQENFloatVector{1, -1, 1, -1}, 0.5L), 0.625L);
+}
+
+TEST(PolynomialTest, PowersAreFormedBeforeTheyAreScaled) {
+  // X^2 = 1e6000 lies beyond the Extended range (about 1.19e4932), so the term 1e-3000 * X^2
+  // is infinite, although Horner's form 1e-3000 * X * X would stay at 1e3000.
+  EXPECT_EQ(QENPolynomial(TQENFloatVector{0, 0, 1e-3000L}, 1e3000L),
+            std::numeric_limits<Extended>::infinity());
+  // 1e-3000 * X is exact here, and the powers stay finite: 1 + 1 * 1e3000 is 1e3000.
+  EXPECT_EQ(QENPolynomial(TQENFloatVector{1, 1}, 1e3000L), 1e3000L);
 }
 
 }  // namespace

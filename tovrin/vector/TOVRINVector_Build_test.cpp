@@ -1,3 +1,4 @@
+#include <cmath>
 #include <cstdint>
 #include <limits>
 
@@ -152,6 +153,9 @@ TEST(SumVectorTest, FloatsAccumulateInExtended) {
   EXPECT_EQ(SumVector(TQENDoubleVector{9007199254740992.0, 1.0}), 9007199254740993.0L);
   EXPECT_EQ(SumVector(TQENDoubleVector{0x1p1023, 0x1p1023}), 0x1p1024L);
   EXPECT_EQ(SumVector(TQENFloatVector{1.0L, 0x1p-63L}), 1.0L + 0x1p-63L);
+  // The sum starts from the first element itself, so a lone -0 stays -0 (0 + -0 would be +0).
+  EXPECT_TRUE(std::signbit(SumVector(TQENDoubleVector{-0.0})));
+  EXPECT_TRUE(std::signbit(SumVector(TQENFloatVector{-0.0L, -0.0L})));
 }
 
 TEST(SumSqVectorTest, SquaresFollowTheirTypeRules) {
