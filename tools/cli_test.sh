@@ -237,6 +237,11 @@ done
 printf '7\n8 oops\n' >"$WORK/bad"
 STDIN=$WORK/bad run 1 describe
 expect_err "<stdin>:2: not a number: 'oops'"
+# A bad token in a later file: the good files before it print nothing either.
+printf '1\n2\n\n# c\n3 4 ,5;\n' >"$WORK/bad2"
+STDIN=$WORK/b run 1 describe "$WORK/a" - "$WORK/bad2"
+expect_no_out
+expect_err "$WORK/bad2:5: not a number: '5;'"
 run 1 describe "$WORK/does-not-exist"
 expect_err "does-not-exist"
 
@@ -317,6 +322,8 @@ run 0 eval SameFloat 1 1.0000000000001
 expect_out "True"
 run 0 eval FloatIsNegative -1e-3
 expect_out "True"
+run 0 eval FloatIsZero 1e-3
+expect_out "False"
 run 0 eval XtoY 2 -2
 expect_out "0.25"
 run 0 eval ZAlpha 0.025
@@ -389,6 +396,11 @@ cmp -s "$WORK/out" "$WORK/first" || fail "the same seed gave different output"
 run 0 random Random_Normal --count 5 --seed 43
 checks=$((checks + 1))
 cmp -s "$WORK/out" "$WORK/first" && fail "different seeds gave the same output"
+# Real variates carry 21 significant digits (fewer only where trailing zeros are dropped).
+checks=$((checks + 1))
+awk '{ t = $1; sub(/^-/, "", t); sub(/[eE].*/, "", t); sub(/\./, "", t); sub(/^0+/, "", t)
+       n = length(t); if (n > 21 || t !~ /^[0-9]+$/) bad = 1; if (n == 21) full++ }
+     END { exit bad || full < 3 }' "$WORK/first" || fail "random digits: $(cat "$WORK/first")"
 run 0 random Random_Normal 100 -2 --count 3 --seed 1
 run 0 random Random_Binomial2 100 0.3 --count 200 --seed 7
 checks=$((checks + 1))

@@ -1,4 +1,5 @@
 #include <algorithm>
+#include <cfenv>
 #include <cmath>
 #include <functional>
 #include <limits>
@@ -117,6 +118,21 @@ TEST(QuickSortPositionsTest, StackSizeIsRoundedLog2PlusTwo) {
   EXPECT_EQ(detail::QuickSortStackSize(1000), 12);  // log2 1000 = 9.97
   EXPECT_EQ(detail::QuickSortStackSize(1448), 12);  // log2 1448 = 10.4998
   EXPECT_EQ(detail::QuickSortStackSize(1449), 13);  // log2 1449 = 10.5008
+}
+
+// The size is rounded to the nearest integer even when the caller has set another rounding
+// mode for its own arithmetic.
+TEST(QuickSortPositionsTest, StackSizeIgnoresTheRoundingMode) {
+  struct RoundingModeGuard {
+    int saved = std::fegetround();
+    ~RoundingModeGuard() { std::fesetround(saved); }
+  } guard;
+  for (int mode : {FE_UPWARD, FE_DOWNWARD, FE_TOWARDZERO}) {
+    ASSERT_EQ(std::fesetround(mode), 0);
+    EXPECT_EQ(detail::QuickSortStackSize(3), 4) << mode;      // log2 3 = 1.58
+    EXPECT_EQ(detail::QuickSortStackSize(5), 4) << mode;      // log2 5 = 2.32
+    EXPECT_EQ(detail::QuickSortStackSize(1449), 13) << mode;  // log2 1449 = 10.5008
+  }
 }
 
 // Positions keyed by a number, carrying a tag: the exchanges are those of the Hoare scheme

@@ -25,9 +25,11 @@
 
 namespace tovrin::detail {
 
-// Entries of the explicit stack for N positions: Round(log2 N) + 2, halves rounded to even.
+// Entries of the explicit stack for N positions: Round(log2 N) + 2, rounded to the nearest
+// integer whatever the caller's floating-point rounding mode (std::nearbyint would follow it).
+// The logarithm of an integer is never exactly a half, so how halves go does not arise.
 inline LongInt QuickSortStackSize(LongInt N) {
-  return static_cast<LongInt>(std::nearbyint(QENLog2(static_cast<Extended>(N)))) + 2;
+  return static_cast<LongInt>(std::round(QENLog2(static_cast<Extended>(N)))) + 2;
 }
 
 // Sorts positions 1..N so that `less` holds along them wherever it can (see above).
