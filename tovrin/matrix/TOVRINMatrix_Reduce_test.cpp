@@ -89,6 +89,38 @@ TYPED_TEST(Reduce, EqualMagnitudesKeepTheUpperRowAsPivot) {
   m = Make<TypeParam>({{2, 1}, {-4, 3}});
   RowEchelonForm(m);
   EXPECT_EQ(Values(m), (Rows{{1, -0.75}, {0, 1}}));
+  // A tie below the current row: rows 1 and 2 hold 2 and -2; the upper one (row 1) is swapped
+  // up. Worked by hand: [[2,0],[0,1],[-2,4]] -> [[1,0],[0,1],[0,4]] -> 4 is the next pivot ->
+  // [[1,0],[0,1],[0,0]]. Taking row 2 instead would have left [[1,-2],[0,1],[0,0]].
+  m = Make<TypeParam>({{0, 1}, {2, 0}, {-2, 4}});
+  RowEchelonForm(m);
+  EXPECT_EQ(Values(m), (Rows{{1, 0}, {0, 1}, {0, 0}}));
+  // The leftmost column with a non-zero entry decides, however large later columns are.
+  m = Make<TypeParam>({{0, 4, 4}, {0, 4, 4}, {1, 0, 0}});
+  RowEchelonForm(m);
+  EXPECT_EQ(Values(m), (Rows{{1, 0, 0}, {0, 1, 1}, {0, 0, 0}}));
+}
+
+// Every swap turns the sign: an anti-diagonal matrix needs one swap, a cyclic permutation
+// two. Both determinants by cofactor expansion: -(2 x 3 x 4) and +(2 x 3 x 4).
+TYPED_TEST(Reduce, DeterminantSignFollowsTheSwaps) {
+  auto m = Make<TypeParam>({{0, 0, 2}, {0, 3, 0}, {4, 0, 0}});
+  EXPECT_EQ(MatrixDeterminant(m), -24.0L);
+  EXPECT_EQ(Values(m), (Rows{{1, 0, 0}, {0, 1, 0}, {0, 0, 1}}));
+  m = Make<TypeParam>({{0, 2, 0}, {0, 0, 3}, {4, 0, 0}});
+  EXPECT_EQ(MatrixDeterminant(m), 24.0L);
+  m = Make<TypeParam>({{0, 1, 0}, {0, 0, 1}, {1, 0, 0}});
+  EXPECT_EQ(MatrixDeterminant(m), 1.0L);  // two swaps, no scaling
+}
+
+// A singular matrix: False, and both matrices stay as the elimination left them (no clearing
+// above the pivots). By hand: swap (|2| > |1|), scale row 0 by 1/2, subtract row 0 from row 1.
+TYPED_TEST(Reduce, InverseOfASingularMatrixStopsAfterTheElimination) {
+  auto m = Make<TypeParam>({{1, 2}, {2, 4}});
+  Matrix<TypeParam> inv = Make<TypeParam>({{7, 7, 7}});
+  EXPECT_FALSE(MatrixInverse(m, inv));
+  EXPECT_EQ(Values(m), (Rows{{1, 2}, {0, 0}}));
+  EXPECT_EQ(Values(inv), (Rows{{0, 0.5}, {1, -0.5}}));
 }
 
 TYPED_TEST(Reduce, TolerancesOfTheElimination) {
