@@ -219,7 +219,8 @@ void LinearTransformVector(TQENDoubleVector& V, Double M, Double C);
 void LinearTransformVector(TQENSingleVector& V, Single M, Single C);
 void LinearTransformVector(TQENInt64Vector& V, Int64 M, Int64 C);
 
-// V[i] := Func(V[i]) in index order. Raises rsVectorIsEmpty. What Func returns is stored as
+// V[i] := Func(V[i]) in index order. Raises rsVectorIsEmpty, then rsInvalidValue for an empty
+// Func (V untouched). What Func returns is stored as
 // it is; an exception from Func passes through, the elements before it already transformed.
 void TransformVector(TQENFloatVector& V, const TQENFloatTransformFunc& Func);
 void TransformVector(TQENDoubleVector& V, const TQENDoubleTransformFunc& Func);

@@ -62,6 +62,7 @@ void LinearTransform(std::vector<T>& V, ValueOf<T> M, ValueOf<T> C) {
 template <typename T, typename Func>
 void TransformElements(std::vector<T>& V, const Func& F) {
   detail::RequireElements(V);
+  if (!F) detail::RaiseMathError(rsInvalidValue);  // an empty function, before any write
   detail::ApplyInPlace(V, [&F](ValueOf<T> x) { return F(x); });
 }
 

@@ -160,6 +160,9 @@ TEST(TransformVectorTest, PlainFunctionsAndCapturingLambdas) {
     });
   });
   EXPECT_EQ(calls, 0);
+  TQENDoubleVector kept{1, 2};
+  ExpectMathError(rsInvalidValue, [&] { TransformVector(kept, TQENDoubleTransformFunc{}); });
+  EXPECT_EQ(kept, (TQENDoubleVector{1, 2}));
 }
 
 // --- Filling, clearing, reversing, copying ---------------------------------------------------
