@@ -1,6 +1,7 @@
 #include <algorithm>
 #include <cfenv>
 #include <cmath>
+#include <cstring>
 #include <functional>
 #include <limits>
 #include <random>
@@ -72,6 +73,54 @@ TEST(SortTest, OrdersFloatsExactly) {
 // Inputs that drive simple quick sorts to quadratic time or deep stacks must finish within
 // the stack of Round(log2 N) + 2 entries (a deeper stack would raise). The organ pipe (rising
 // then falling) is a quadratic case of the middle-element pivot, so it is kept small here.
+// The insertion finish must give the plain partitioning's result to the bit, and the plain
+// algorithm must still run where equal elements differ in their bits (-0 and +0, NaNs).
+template <typename T>
+std::vector<T> PlainQuickSort(std::vector<T> v, bool ascending) {
+  T* data = v.data();
+  detail::QuickSortPositions(
+      static_cast<LongInt>(v.size()), ascending, [data](LongInt p) { return data[p - 1]; },
+      [](T a, T b) { return a < b; },
+      [data](LongInt p, LongInt q) { std::swap(data[p - 1], data[q - 1]); });
+  return v;
+}
+
+template <typename T>
+void ExpectSameBitsAsPlainSort(const std::vector<T>& input) {
+  for (bool ascending : {true, false}) {
+    std::vector<T> fast = input;
+    QSortVector(fast, ascending);
+    const std::vector<T> plain = PlainQuickSort(input, ascending);
+    ASSERT_EQ(fast.size(), plain.size());
+    EXPECT_EQ(0, std::memcmp(fast.data(), plain.data(), fast.size() * sizeof(T)))
+        << "ascending " << ascending << ", n " << input.size();
+  }
+}
+
+TEST(SortTest, InsertionFinishGivesThePlainResultBitForBit) {
+  std::mt19937_64 rng(11);
+  for (int size : {2, 3, 15, 16, 17, 18, 33, 100, 1000, 5000}) {
+    std::uniform_int_distribution<int> few(-5, 5);
+    TQENDoubleVector d(size), signed_zeros(size);
+    TQENSingleVector f(size);
+    TQENLIntVector i(size);
+    TQENByteVector b(size);
+    for (int k = 0; k < size; ++k) {
+      d[k] = few(rng) * 0.5;
+      signed_zeros[k] = few(rng) > 0 ? 0.0 : (few(rng) > 0 ? -0.0 : few(rng));
+      f[k] = static_cast<Single>(few(rng));
+      i[k] = few(rng) * 100000;
+      b[k] = static_cast<Byte>(rng());
+    }
+    if (size > 5) d[3] = std::numeric_limits<Double>::quiet_NaN();
+    ExpectSameBitsAsPlainSort(d);
+    ExpectSameBitsAsPlainSort(signed_zeros);
+    ExpectSameBitsAsPlainSort(f);
+    ExpectSameBitsAsPlainSort(i);
+    ExpectSameBitsAsPlainSort(b);
+  }
+}
+
 TEST(SortTest, AdversarialShapesStayWithinTheStack) {
   const LongInt n = 200000;
   const LongInt organN = 3000;

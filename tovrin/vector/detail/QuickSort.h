@@ -14,6 +14,7 @@
 #pragma once
 
 #include <cmath>
+#include <type_traits>
 #include <utility>
 #include <vector>
 
@@ -33,8 +34,10 @@ inline LongInt QuickSortStackSize(LongInt N) {
 }
 
 // Sorts positions 1..N so that `less` holds along them wherever it can (see above).
+// With a Cutoff above 0, stretches of at most Cutoff + 1 positions are left unpartitioned
+// (each already holds exactly the keys that belong there); the caller finishes them.
 template <typename KeyAt, typename Less, typename SwapAt>
-void QuickSortPositions(LongInt N, KeyAt&& key, Less&& less, SwapAt&& swap) {
+void QuickSortPositions(LongInt N, KeyAt&& key, Less&& less, SwapAt&& swap, LongInt Cutoff = 0) {
   if (N < 2) return;
   std::vector<TQStackRec> stack(static_cast<std::size_t>(QuickSortStackSize(N)));
   const LongInt capacity = static_cast<LongInt>(stack.size());
@@ -50,7 +53,7 @@ void QuickSortPositions(LongInt N, KeyAt&& key, Less&& less, SwapAt&& swap) {
     LongInt l = stack[static_cast<std::size_t>(sp)].Lower;
     LongInt r = stack[static_cast<std::size_t>(sp)].Upper;
     --sp;
-    while (l < r) {
+    while (r - l > Cutoff) {
       const auto pivot = key(l + (r - l) / 2);
       LongInt i = l;
       LongInt j = r;
@@ -64,10 +67,10 @@ void QuickSortPositions(LongInt N, KeyAt&& key, Less&& less, SwapAt&& swap) {
         }
       } while (i <= j);
       if ((j - l) < (r - i)) {
-        if (i < r) push(i, r);
+        if (r - i > Cutoff) push(i, r);
         r = j;
       } else {
-        if (l < j) push(l, j);
+        if (j - l > Cutoff) push(l, j);
         l = i;
       }
     }
@@ -86,9 +89,29 @@ void QuickSortPositions(LongInt N, bool Ascending, KeyAt&& key, Less&& less, Swa
   }
 }
 
+// Whether equal elements of V are indistinguishable, so that every ordering of V gives the
+// same bits and the sort may finish short stretches by straight insertion: always for
+// integers and money, for Double and Single when V holds no NaN and no negative zero (-0 and
+// +0 compare equal but differ). Extended elements always take the plain algorithm.
+template <typename T>
+bool EqualElementsAreIdentical(const std::vector<T>& V) {
+  if constexpr (std::is_integral_v<T> || std::is_enum_v<T>) {
+    return true;
+  } else if constexpr (std::is_floating_point_v<T>) {
+    for (const T x : V) {
+      if (x != x || (x == 0 && std::signbit(x))) return false;
+    }
+    return true;
+  } else {
+    return false;
+  }
+}
+
 // Sorts a vector in place by the elements' own `<` (exact, also for floats), with SwapXY
 // exchanging elements (found by argument-dependent lookup, so the money types' overloads
-// serve too). PackedExtended elements are compared as Extended values.
+// serve too). PackedExtended elements are compared as Extended values. Where equal elements
+// are indistinguishable the result is the same as the plain algorithm's to the bit, but the
+// partitioning stops at short stretches and one straight insertion pass finishes them.
 template <typename T>
 void QuickSortVector(std::vector<T>& V, bool Ascending) {
   const LongInt n = static_cast<LongInt>(V.size());
@@ -97,7 +120,24 @@ void QuickSortVector(std::vector<T>& V, bool Ascending) {
   auto key = [data](LongInt p) { return static_cast<ValueOf<T>>(data[p - 1]); };
   auto less = [](ValueOf<T> a, ValueOf<T> b) { return a < b; };
   auto swap = [data](LongInt p, LongInt q) { SwapXY(data[p - 1], data[q - 1]); };
-  QuickSortPositions(n, Ascending, key, less, swap);
+  if (!EqualElementsAreIdentical(V)) {
+    QuickSortPositions(n, Ascending, key, less, swap);
+    return;
+  }
+  constexpr LongInt kInsertionCutoff = 16;
+  auto in_order = [Ascending](T a, T b) { return Ascending ? a < b : b < a; };
+  if (Ascending) {
+    QuickSortPositions(n, key, less, swap, kInsertionCutoff);
+  } else {
+    QuickSortPositions(
+        n, key, [](ValueOf<T> a, ValueOf<T> b) { return b < a; }, swap, kInsertionCutoff);
+  }
+  for (std::size_t i = 1; i < V.size(); ++i) {
+    const T x = data[i];
+    std::size_t j = i;
+    for (; j > 0 && in_order(x, data[j - 1]); --j) data[j] = data[j - 1];
+    data[j] = x;
+  }
 }
 
 }  // namespace tovrin::detail
