@@ -62,8 +62,11 @@ Extended HyperGeometricTerm(LongWord N, LongWord S, LongWord M, LongWord X) {
 // Sum over the counts below Below, the upper count limited to MinXY(M, S).
 Extended HyperGeometricSumBelow(LongWord N, LongWord S, LongWord M, Count Below) {
   const Count top = MinXY(M, S);
+  // Counts that need more failures than the population holds add exact zeros: skip them, so
+  // that a large sample does not walk billions of empty terms.
+  const Count first = S > N - M ? static_cast<Count>(S - (N - M)) : Count{0};
   Extended sum = 0;
-  for (Count k = 0; k < Below && k <= top; ++k) {
+  for (Count k = first; k < Below && k <= top; ++k) {
     sum += HyperGeometricTerm(N, S, M, static_cast<LongWord>(k));
   }
   return sum;
