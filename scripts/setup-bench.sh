@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
 # Installs the benchmark-only yardstick: Debian's Boost.Math headers. The tovrin library itself
-# never depends on Boost; bench/special_bench.cpp compares against it when the headers exist.
+# never depends on Boost; bench/gammabeta_bench.cpp compares against it when the headers exist.
 set -euo pipefail
 
 if [ -f /usr/include/boost/math/special_functions/gamma.hpp ]; then

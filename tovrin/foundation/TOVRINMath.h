@@ -50,7 +50,7 @@ Extended QENDistance(Extended X1, Extended Y1, Extended X2, Extended Y2);
 // --- Special functions ----------------------------------------------------------------------
 // All five work in the 80-bit type: on their tested domains the relative error is within a few
 // units of 1e-19 for Gamma, LnGamma and Beta and within 1e-16 for the incomplete beta and its
-// inverse (see TOVRINSpecialFunctions_test.cpp and its reference table). A NaN argument gives
+// inverse (see TOVRINMath_GammaBeta_test.cpp and its reference table). A NaN argument gives
 // NaN; no loop runs without a bound.
 //
 // Gamma(X) for X not zero or a negative integer; rsGammaPole there and at -inf. Finite up to

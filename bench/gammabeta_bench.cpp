@@ -1,7 +1,7 @@
 // Gamma, LnGamma, Beta, IncompleteBeta and InverseIncompleteBeta beside Boost.Math at long
 // double, on the argument sets of the reference table that the unit tests use. Before the timed
 // runs the program prints, for each function, the largest relative error of tovrin and of Boost
-// against that table (computed at 256 bits by tovrin/foundation/testdata/special_reference.py).
+// against that table (computed at 256 bits by tovrin/foundation/testdata/gammabeta_reference.py).
 //
 // Boost is only a yardstick here (scripts/setup-bench.sh installs its headers); without it the
 // program times tovrin alone.
@@ -45,7 +45,7 @@ struct SpecialCase3 {
   Extended tolerance;
 };
 
-#include "tovrin/foundation/testdata/special_reference.inc"
+#include "tovrin/foundation/testdata/gammabeta_reference.inc"
 
 #ifdef TOVRIN_HAVE_BOOST
 // Errors come back as IEEE values (as tovrin's do) rather than as exceptions.

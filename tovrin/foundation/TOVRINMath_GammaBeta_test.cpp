@@ -1,5 +1,5 @@
 // Tests of Gamma, LnGamma, Beta, IncompleteBeta and InverseIncompleteBeta against reference
-// values computed at 256 bits by testdata/special_reference.py, plus exact values, identities,
+// values computed at 256 bits by testdata/gammabeta_reference.py, plus exact values, identities,
 // round trips and the domain errors.
 #include <gtest/gtest.h>
 
@@ -35,7 +35,7 @@ struct SpecialCase3 {
   Extended tolerance;
 };
 
-#include "tovrin/foundation/testdata/special_reference.inc"
+#include "tovrin/foundation/testdata/gammabeta_reference.inc"
 
 constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
 constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
