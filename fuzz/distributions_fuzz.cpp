@@ -7,6 +7,7 @@
 #include <cstdlib>
 #include <limits>
 
+#include "fuzz/FuzzInput.h"
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINMath.h"
 #include "tovrin/statistics/TOVRINStatistics_Continuous.h"
@@ -15,32 +16,9 @@
 namespace {
 
 using namespace tovrin;
-
-class Input {
- public:
-  Input(const std::uint8_t* data, std::size_t size) : p_(data), end_(data + size) {}
-  bool Empty() const { return p_ == end_; }
-  std::uint8_t Next() { return p_ != end_ ? *p_++ : 0; }
-  void Bytes(void* out, std::size_t n) {
-    auto* b = static_cast<unsigned char*>(out);
-    for (std::size_t i = 0; i < n; ++i) b[i] = Next();
-  }
-  template <class T>
-  T Raw() {
-    T v{};
-    Bytes(&v, sizeof v);
-    return v;
-  }
-
- private:
-  const std::uint8_t* p_;
-  const std::uint8_t* end_;
-};
-
-[[noreturn]] void Fail() { std::abort(); }
-void Expect(bool ok) {
-  if (!ok) Fail();
-}
+using fuzzing::Expect;
+using fuzzing::Fail;
+using fuzzing::Input;
 
 // An argument: special values, probabilities, moderate values, and any 80-bit encoding.
 Extended Arg(Input& in) {

@@ -15,39 +15,16 @@
 #include <type_traits>
 #include <vector>
 
+#include "fuzz/FuzzInput.h"
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/vector/TOVRINVector.h"
 
 namespace {
 
 using namespace tovrin;
-
-// Reads the input front to back; once exhausted every read gives zeros.
-class Input {
- public:
-  Input(const std::uint8_t* data, std::size_t size) : p_(data), end_(data + size) {}
-  bool Empty() const { return p_ == end_; }
-  std::uint8_t Next() { return p_ != end_ ? *p_++ : 0; }
-  void Bytes(void* out, std::size_t n) {
-    auto* b = static_cast<unsigned char*>(out);
-    for (std::size_t i = 0; i < n; ++i) b[i] = Next();
-  }
-  template <class T>
-  T Raw() {
-    T v{};
-    Bytes(&v, sizeof v);
-    return v;
-  }
-
- private:
-  const std::uint8_t* p_;
-  const std::uint8_t* end_;
-};
-
-[[noreturn]] void Fail() { std::abort(); }
-void Expect(bool ok) {
-  if (!ok) Fail();
-}
+using fuzzing::Expect;
+using fuzzing::Fail;
+using fuzzing::Input;
 
 template <class F>
 F FloatValue(Input& in) {
