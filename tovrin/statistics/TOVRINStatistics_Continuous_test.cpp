@@ -9,47 +9,12 @@
 
 #include "gtest/gtest.h"
 #include "tovrin/statistics/TOVRINStatistics.h"
+#include "tovrin/statistics/TOVRINStatistics_Distributions_testing.h"
 
 namespace tovrin {
 namespace {
 
-constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
-constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
-constexpr Extended kEps = std::numeric_limits<Extended>::epsilon();  // 2^-63
-
-using Ref2 = std::array<Extended, 2>;
-using Ref3 = std::array<Extended, 3>;
-using Ref4 = std::array<Extended, 4>;
-using Ref5 = std::array<Extended, 5>;
-using Ref6 = std::array<Extended, 6>;
-using Ref7 = std::array<Extended, 7>;
-#include "tovrin/statistics/TOVRINStatistics_Distributions_reference.inc"
-
-LongWord DF(Extended v) { return static_cast<LongWord>(v); }
-
-// Runs Call and expects EMathError with Ident.
-template <typename Call>
-void ExpectRaises(TResStringId Ident, Call call) {
-  try {
-    call();
-    ADD_FAILURE() << "no EMathError, expected " << ResStringName(Ident);
-  } catch (const EMathError& e) {
-    EXPECT_EQ(e.Ident(), Ident) << "raised " << ResStringName(e.Ident()) << ", expected "
-                                << ResStringName(Ident);
-  }
-}
-
-::testing::AssertionResult Near(Extended actual, Extended expected, Extended bound) {
-  const Extended error = std::fabs(actual - expected);
-  if (error <= bound) return ::testing::AssertionSuccess();
-  return ::testing::AssertionFailure()
-         << "actual " << static_cast<double>(actual) << " expected "
-         << static_cast<double>(expected) << " error " << static_cast<double>(error) << " bound "
-         << static_cast<double>(bound);
-}
-::testing::AssertionResult RelNear(Extended actual, Extended expected, Extended relative) {
-  return Near(actual, expected, relative * std::fabs(expected));
-}
+using namespace testing_distributions;  // NOLINT
 
 // === Standard normal ===========================================================================
 
