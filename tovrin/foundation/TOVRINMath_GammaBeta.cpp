@@ -183,6 +183,19 @@ ExactPair TwoSum(Extended a, Extended b) {
 
 ExactPair TwoProduct(Extended a, Extended b) {
   constexpr Extended kSplitter = 4294967297.0L;  // 2^32 + 1
+  // The split multiplies by 2^32 + 1, which overflows for factors near the top of the range:
+  // such a factor is scaled down by a power of two first and the pair scaled back, both exact.
+  constexpr Extended kSplitLimit = 0x1p16000L;
+  constexpr Extended kDown = 0x1p-1024L;
+  constexpr Extended kUp = 0x1p1024L;
+  if (std::fabs(a) > kSplitLimit && std::isfinite(a)) {
+    const ExactPair r = TwoProduct(a * kDown, b);
+    return {r.hi * kUp, r.lo * kUp};
+  }
+  if (std::fabs(b) > kSplitLimit && std::isfinite(b)) {
+    const ExactPair r = TwoProduct(a, b * kDown);
+    return {r.hi * kUp, r.lo * kUp};
+  }
   const Extended p = a * b;
   const Extended ta = kSplitter * a;
   const Extended a_hi = ta - (ta - a);
@@ -249,10 +262,20 @@ Extended ScaledPower(Extended x_hi, Extended x_lo, Extended a, Extended b, Exten
   return power;
 }
 
+// ln(Gamma(a) / Gamma(a + b)) for a >= kStirlingStart, from Stirling's formula with the large
+// terms cancelled analytically.
+Extended LnGammaRatio(Extended a, Extended b) {
+  const Extended c = a + b;
+  return -(a - 0.5L) * std::log1p(b / a) - b * std::log(c) + b + StirlingSeries(a) -
+         StirlingSeries(c);
+}
+
 // Beta(a, b) for finite a, b > 0.
 Extended BetaFinite(Extended a, Extended b) {
   if (a > b) std::swap(a, b);
   const Extended c = a + b;
+  // Both shapes above half the largest number: B < 2^-(a + b) is far below the smallest one.
+  if (std::isinf(c)) return 0.0L;
   if (c <= 0.5L) {
     // Both tiny: with 1/Gamma(z) = z P(z), B = (c / (a b)) P(c) / (P(a) P(b)), free of the
     // infinities that Gamma(a) and Gamma(b) may reach.
@@ -260,6 +283,12 @@ Extended BetaFinite(Extended a, Extended b) {
   }
   if (b < kStirlingStart) {
     return GammaFinite(a) * (GammaFinite(b) / GammaFinite(c));
+  }
+  if (a < 0.1L) {
+    // A small shape beside a large one: B = Gamma(a) Gamma(b) / Gamma(b + a), the ratio from
+    // Stirling's formula with its large terms cancelled. The form below would carry
+    // exp(Delta(a)) ~ a^(-1/2), whose exponent grows without bound as a shrinks.
+    return GammaFinite(a) * std::exp(LnGammaRatio(b, a));
   }
   // B = sqrt(2 pi c / (a b)) (a/c)^a (b/c)^b exp(Delta(a) + Delta(b) - Delta(c)), with the
   // powers taken by pow from bases carried to twice the working precision.
@@ -270,15 +299,23 @@ Extended BetaFinite(Extended a, Extended b) {
   const Extended pa = ScaledPower(1.0L, 0.0L, a, b, log_a);  // (c/a)^a
   const Extended pb = ScaledPower(1.0L, 0.0L, b, a, log_b);  // (c/b)^b
   if (std::isnormal(pa) && std::isnormal(pb) && std::isnormal(pa * pb)) return scale / (pa * pb);
-  // Far outside the range of the powers: logarithms throughout.
-  const Extended exponent = a * std::log1p(b / a) + b * std::log1p(a / b);
+  // Far outside the range of the powers: logarithms throughout. When b / a itself overflows,
+  // ln(1 + b/a) = ln b - ln a + ln(1 + a/b).
+  const Extended ratio = b / a;
+  const Extended log_c_over_a =
+      std::isfinite(ratio) ? std::log1p(ratio) : (std::log(b) - std::log(a)) + std::log1p(a / b);
+  const Extended exponent = a * log_c_over_a + b * std::log1p(a / b);
   return scale * std::exp(-exponent);
 }
 
 // s phi(t) = s (t - log1p(t)) for t >= -1/2, given st = s t exactly: for a large t the product
 // is taken as st itself rather than s (st / s) rounded twice.
 Extended ShapeTimesPhi(Extended s, Extended t, Extended st) {
-  if (t > 1.0L) return st - s * std::log1p(t);
+  if (t > 1.0L) {
+    if (std::isfinite(t)) return st - s * std::log1p(t);
+    // t = st / s overflowed: ln(1 + t) = ln st - ln s + ln(1 + 1/t), the last below 2^-16000.
+    return st - s * (std::log(st) - std::log(s));
+  }
   return s * XMinusLog1p(t);
 }
 
@@ -418,14 +455,6 @@ Extended RecipGamma1pMinusOne(Extended b) {
   // 1/Gamma(1 + b) = P(b - 1) / b, so the difference is (b - 1)(R(b - 1) - 1) / b.
   const Extended t = b - 1.0L;
   return t * (RecipGammaRatio(t) - 1.0L) / b;
-}
-
-// ln(Gamma(a) / Gamma(a + b)) for a >= kStirlingStart, from Stirling's formula with the large
-// terms cancelled analytically.
-Extended LnGammaRatio(Extended a, Extended b) {
-  const Extended c = a + b;
-  return -(a - 0.5L) * std::log1p(b / a) - b * std::log(c) + b + StirlingSeries(a) -
-         StirlingSeries(c);
 }
 
 // Q(a, x) / r with r = e^-x x^a / Gamma(a) and Q the upper regularised incomplete gamma

@@ -185,6 +185,17 @@ TEST(SpecialBeta, TinyAndHugeShapes) {
   // B(a, 1/2) = sqrt(pi / a) (1 + O(1/a)).
   EXPECT_LE(RelativeError(Beta(1e4000L, 0.5L), std::sqrt(3.14159265358979323846L) * 1e-2000L),
             1e-18L);
+  // A small shape beside one near the top of the range: B(a, b) = Gamma(a) b^-a (1 + O(a^2/b)),
+  // the leading term from mpmath at 256 bits. Neither b / a nor a + b may overflow on the way.
+  const Extended max = std::numeric_limits<Extended>::max();
+  EXPECT_LE(RelativeError(Beta(0.01L, max), 4.750881970520198514189297e-48L), 2e-17L);
+  EXPECT_LE(RelativeError(Beta(max, 0.01L), 4.750881970520198514189297e-48L), 2e-17L);
+  // Gamma(a) = 1/a - 0.577... and b^-a = 1 - 2e-1996: B = 1/a to far below the last digit.
+  EXPECT_LE(RelativeError(Beta(1e-2000L, 1e4000L), 1.0L / 1e-2000L), 2e-19L);
+  EXPECT_LE(RelativeError(Beta(1e-4000L, max), 1.0L / 1e-4000L), 2e-19L);
+  // a + b itself overflows: B < 2^-(a + b) underflows to 0.
+  EXPECT_EQ(Beta(max, max), 0.0L);
+  EXPECT_EQ(Beta(2.0L, max), 0.0L);
 }
 
 TEST(SpecialBeta, DomainErrorsAndNaN) {
@@ -259,6 +270,31 @@ TEST(SpecialIncompleteBeta, ExtremeShapes) {
   // Infinite shapes.
   EXPECT_EQ(IncompleteBeta(0.5L, kInf, 2.0L), 0.0L);
   EXPECT_EQ(IncompleteBeta(0.5L, 2.0L, kInf), 1.0L);
+}
+
+TEST(SpecialIncompleteBeta, GammaLimitNearTheTopOfTheRange) {
+  // With b near the largest Extended, I_x(a, b) = P(a, b x) (1 + O(1/b)): the regularised
+  // lower incomplete gamma function, here in closed form. x b = 1 exactly (powers of two).
+  const Extended b = 0x1p16000L;
+  const Extended x = 0x1p-16000L;
+  // P(1, 1) = 1 - 1/e, P(2, 1) = 1 - 2/e, P(1/2, 2) = erf(sqrt 2).
+  EXPECT_LE(RelativeError(IncompleteBeta(x, 1.0L, b), 0.632120558828557678404476L), 4e-19L);
+  EXPECT_LE(RelativeError(IncompleteBeta(x, 2.0L, b), 0.264241117657115356808952L), 4e-19L);
+  EXPECT_LE(RelativeError(IncompleteBeta(2.0L * x, 0.5L, b), 0.954499736103641585599435L), 4e-19L);
+  // P(3, 4) = 1 - 13 e^-4, with b the largest Extended and x b = 4 (1 - 2^-64).
+  const Extended max = std::numeric_limits<Extended>::max();
+  EXPECT_LE(RelativeError(IncompleteBeta(0x1p-16382L, 3.0L, max), 0.761896694446455656181666L),
+            4e-19L);
+  // The inverse finds x b = 1 again.
+  EXPECT_LE(RelativeError(InverseIncompleteBeta(0.264241117657115356808952L, 2.0L, b) * b, 1.0L),
+            1e-18L);
+  // At x = 1/2 all of the mass of such shapes lies on one side; the small shape may be tiny.
+  for (Extended a : {1e-3000L, 0.01L, 2.0L, 1e3000L}) {
+    EXPECT_EQ(IncompleteBeta(0.5L, a, max), 1.0L) << static_cast<double>(a);
+    EXPECT_EQ(IncompleteBeta(0.5L, max, a), 0.0L) << static_cast<double>(a);
+  }
+  EXPECT_EQ(IncompleteBeta(0.5L, 1e-3000L, 1e3000L), 1.0L);
+  EXPECT_EQ(IncompleteBeta(0.75L, 1e4900L, 1e-20L), 0.0L);
 }
 
 TEST(SpecialIncompleteBeta, DomainErrorsLeaveArgumentsAlone) {

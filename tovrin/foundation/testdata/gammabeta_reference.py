@@ -185,7 +185,10 @@ def beta_cases(rng):
         if v < mpf("1e-4900"):
             continue
         rows.append((a, b, v, ORDINARY))
-    for a, b in [(1, 1), (0.5, 0.5), (2, 3), (1e-3, 1e-3), (1e5, 1e5), (0.5, 1e5), (12, 12)]:
+    for a, b in [(1, 1), (0.5, 0.5), (2, 3), (1e-3, 1e-3), (1e5, 1e5), (0.5, 1e5), (12, 12),
+                 # a small shape beside a large one
+                 (1e-30, 12), (1e-10, 1e30), (1e-5, 1e10), (1e-20, 1e5), (0.05, 1e20),
+                 (0.0999, 50)]:
         a, b = ld(a), ld(b)
         v = mp.beta(a, b)
         if v < mpf("1e-4900"):
