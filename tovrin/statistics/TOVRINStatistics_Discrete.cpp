@@ -5,6 +5,7 @@
 #include <cmath>
 #include <cstdint>
 #include <utility>
+#include <vector>
 
 namespace tovrin {
 namespace {
@@ -35,15 +36,47 @@ void CheckBinomial(Extended P, LongWord N) {
   if (N == 0 || P < 0 || P > 1) RaiseMathError(rsBinomDistInvalid);
 }
 
-Extended BinomialTerm(Extended P, LongWord N, LongWord k) {
-  return XtoY(P, k) * BinomialCoeff(N, k) * XtoY(1 - P, N - k);
+Extended BinomialTerm(Extended P, LongWord N, LongWord k, Extended coefficient) {
+  return XtoY(P, k) * coefficient * XtoY(1 - P, N - k);
 }
 
+Extended BinomialTerm(Extended P, LongWord N, LongWord k) {
+  return BinomialTerm(P, N, k, BinomialCoeff(N, k));
+}
+
+// The coefficients C(N, k) of one N for k = 0, 1, 2, ..., each product loop run once.
+// BinomialCoeff runs the same loop for k and N - k, so past N/2 a sum that started at 0 reads
+// the value it already has: the same bits, and an overflow raises at the same k as before.
+class BinomialCoefficients {
+ public:
+  explicit BinomialCoefficients(LongWord n) : n_(n) {}
+
+  Extended operator()(LongWord k) {
+    const LongWord loop_k = k > n_ / 2 ? n_ - k : k;
+    if (loop_k < known_.size()) return known_[loop_k];
+    const Extended c = BinomialCoeff(n_, k);
+    if (loop_k == known_.size()) known_.push_back(c);
+    return c;
+  }
+
+ private:
+  LongWord n_;
+  std::vector<Extended> known_;
+};
+
 // Sum of the point probabilities of the counts 0..Below-1 (Below may be N + 1).
-Extended BinomialSumBelow(Extended P, LongWord N, Count Below) {
+Extended BinomialSumBelow(Extended P, LongWord N, Count Below, BinomialCoefficients& coefficients) {
   Extended sum = 0;
-  for (Count k = 0; k < Below; ++k) sum += BinomialTerm(P, N, static_cast<LongWord>(k));
+  for (Count k = 0; k < Below; ++k) {
+    const auto count = static_cast<LongWord>(k);
+    sum += BinomialTerm(P, N, count, coefficients(count));
+  }
   return sum;
+}
+
+Extended BinomialSumBelow(Extended P, LongWord N, Count Below) {
+  BinomialCoefficients coefficients(N);
+  return BinomialSumBelow(P, N, Below, coefficients);
 }
 
 // --- Hypergeometric ---------------------------------------------------------------------------
@@ -154,7 +187,9 @@ Extended BinomialBetween(Extended P, LongWord N, LongWord R1, LongWord R2) {
   CheckBinomial(P, N);
   if (N < R1 || N < R2) RaiseMathError(rsBinomDistInvalid);
   if (R1 == R2) return BinomialTerm(P, N, R1);
-  const Extended difference = BinomialSumBelow(P, N, R2) - BinomialSumBelow(P, N, Count{R1} + 1);
+  BinomialCoefficients coefficients(N);
+  const Extended below_r2 = BinomialSumBelow(P, N, R2, coefficients);
+  const Extended difference = below_r2 - BinomialSumBelow(P, N, Count{R1} + 1, coefficients);
   return R1 > R2 ? -difference : difference;
 }
 
@@ -220,8 +255,10 @@ void BinomialPDFValues(LongInt N, Extended P, TQENFloatVector& V) {
   // Filled locally so that an overflow part-way leaves V empty; an N whose coefficients
   // overflow raises after a few hundred entries, long before the table grows large.
   TQENFloatVector values;
+  BinomialCoefficients coefficients(static_cast<LongWord>(N));
   for (LongInt k = 0; k <= N; ++k) {
-    values.push_back(BinomialTerm(P, static_cast<LongWord>(N), static_cast<LongWord>(k)));
+    const auto count = static_cast<LongWord>(k);
+    values.push_back(BinomialTerm(P, static_cast<LongWord>(N), count, coefficients(count)));
   }
   V = std::move(values);
 }

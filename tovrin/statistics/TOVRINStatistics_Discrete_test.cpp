@@ -110,6 +110,39 @@ TEST(BinomialTest, StatedValues) {
   EXPECT_EQ(BinomialEq(1, 5, 5), 1);
 }
 
+TEST(BinomialTest, SumsAreTheTermsAddedInCountOrder) {
+  // Each sum adds BinomialEq(P, N, k) for k = 0, 1, ... to the bit, on both sides of N / 2
+  // (where C(N, k) = C(N, N - k) comes from the same product loop), and the table holds the
+  // same terms.
+  for (LongWord n : {1U, 2U, 7U, 40U, 41U, 1000U, 1001U}) {
+    for (Extended p : {0.3L, 0.5L, 0.99L}) {
+      SCOPED_TRACE(::testing::Message() << "n=" << n << " p=" << static_cast<double>(p));
+      TQENFloatVector table;
+      BinomialPDFValues(static_cast<LongInt>(n), p, table);
+      ASSERT_EQ(table.size(), n + 1);
+      Extended sum = 0;
+      for (LongWord k = 0; k <= n; ++k) {
+        const Extended term = BinomialEq(p, n, k);
+        EXPECT_EQ(Extended(table[k]), term);
+        if (k % 61 == 0 || k + 2 >= n) {
+          EXPECT_EQ(BinomialLess(p, n, k), sum) << "k=" << k;
+        }
+        sum += term;
+      }
+      // Between: below N minus below 1 for (0, N); everything for (N, 0).
+      Extended inner = 0;
+      for (LongWord k = 0; k < n; ++k) inner += BinomialEq(p, n, k);
+      EXPECT_EQ(BinomialBetween(p, n, 0, n), inner - BinomialEq(p, n, 0));
+      EXPECT_EQ(BinomialBetween(p, n, n, 0), sum);
+    }
+  }
+  // The first coefficient beyond Extended still raises, and a sum that stops short of it
+  // does not.
+  ExpectRaises(rsBinomOverflowed, [] { BinomialLess(0.5L, 20000, 19000); });
+  ExpectRaises(rsBinomOverflowed, [] { BinomialBetween(0.5L, 20000, 19000, 3); });
+  EXPECT_NO_THROW(BinomialLess(0.5L, 20000, 10));
+}
+
 TEST(BinomialTest, Checks) {
   for (Extended p : {-0.1L, 1.1L}) {
     ExpectRaises(rsBinomDistInvalid, [&] { BinomialEq(p, 4, 1); });
