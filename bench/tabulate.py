@@ -74,10 +74,11 @@ def matrix_rows():
             rows.append(("`MultiplyMatrices` %s %dx%d, per multiply-add" % (e, n, n), "BM_MultiplyMatrices<%s>/%d" % (t, n),
                          "naive triple loop", "BM_NaiveProduct<%s>/%d" % (t, n)))
     for t, e in (("PackedExtended", "Extended"), ("Double", "Double")):
-        for fam, plain in (("MatrixInverse", "PlainInverse"), ("MatrixDeterminant", "PlainDeterminant")):
+        for fam, plain, method in (("MatrixInverse", "PlainInverse", "Gauss-Jordan"),
+                                   ("MatrixDeterminant", "PlainDeterminant", "Gaussian elimination")):
             for n in (100, 300):
                 rows.append(("`%s` %s %dx%d, per call" % (fam, e, n, n), "BM_%s<%s>/%d" % (fam, t, n),
-                             "plain Gauss-Jordan in the element type", "BM_%s<%s>/%d" % (plain, t, n)))
+                             "plain %s in the element type" % method, "BM_%s<%s>/%d" % (plain, t, n)))
     rows.append(("`QSortMatrixRowsOnCol` 10^5 rows x 4, repeated keys, per sort", "BM_QSortMatrixRowsOnCol",
                  "std::sort of the rows", "BM_StdSortRows"))
     return rows
