@@ -16,6 +16,7 @@
 #include <vector>
 
 #include "tovrin/foundation/TOVRINMath.h"
+#include "tovrin/foundation/testdata/gammabeta_reference.h"
 
 #ifdef TOVRIN_HAVE_BOOST
 #include <boost/math/special_functions/beta.hpp>
@@ -25,27 +26,7 @@
 namespace {
 
 using tovrin::Extended;
-
-struct SpecialCase1 {
-  Extended x;
-  Extended expected;
-  Extended tolerance;
-};
-struct SpecialCase2 {
-  Extended a;
-  Extended b;
-  Extended expected;
-  Extended tolerance;
-};
-struct SpecialCase3 {
-  Extended x;
-  Extended a;
-  Extended b;
-  Extended expected;
-  Extended tolerance;
-};
-
-#include "tovrin/foundation/testdata/gammabeta_reference.inc"
+using namespace tovrin::testdata;
 
 #ifdef TOVRIN_HAVE_BOOST
 // Errors come back as IEEE values (as tovrin's do) rather than as exceptions.

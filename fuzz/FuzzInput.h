@@ -1,8 +1,10 @@
-// The byte reader and the failure signal shared by the fuzz targets.
+// The byte reader, the failure signal and the call wrappers shared by the fuzz targets.
 #pragma once
 
 #include <cstdint>
 #include <cstdlib>
+
+#include "tovrin/foundation/TOVRINErrors.h"
 
 namespace tovrin::fuzzing {
 
@@ -31,6 +33,28 @@ class Input {
 [[noreturn]] void Fail() { std::abort(); }
 void Expect(bool ok) {
   if (!ok) Fail();
+}
+
+// Runs a call that may raise EMathError; returns whether it returned. Anything else escapes
+// and ends the run as a finding.
+template <class F>
+bool MayRaise(F&& f) {
+  try {
+    f();
+  } catch (const EMathError&) {
+    return false;
+  }
+  return true;
+}
+
+// Runs a call documented never to raise.
+template <class F>
+void NoRaise(F&& f) {
+  try {
+    f();
+  } catch (...) {
+    Fail();
+  }
 }
 
 }  // namespace tovrin::fuzzing

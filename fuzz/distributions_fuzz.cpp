@@ -19,6 +19,8 @@ using namespace tovrin;
 using fuzzing::Expect;
 using fuzzing::Fail;
 using fuzzing::Input;
+using fuzzing::MayRaise;
+using fuzzing::NoRaise;
 
 // An argument: special values, probabilities, moderate values, and any 80-bit encoding.
 Extended Arg(Input& in) {
@@ -91,25 +93,6 @@ LongWord Count(Input& in) {
 
 // Table sizes stay small enough to be built quickly.
 LongWord TableSize(Input& in) { return in.Raw<std::uint16_t>() % 257; }
-
-template <class F>
-bool MayRaise(F&& f) {
-  try {
-    f();
-  } catch (const EMathError&) {
-    return false;
-  }
-  return true;
-}
-
-template <class F>
-void NoRaise(F&& f) {
-  try {
-    f();
-  } catch (...) {
-    Fail();
-  }
-}
 
 // A table call: outputs start non-empty, are empty after a failure and hold N + 1 points
 // after a success.

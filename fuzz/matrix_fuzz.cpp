@@ -22,6 +22,8 @@ using namespace tovrin;
 using fuzzing::Expect;
 using fuzzing::Fail;
 using fuzzing::Input;
+using fuzzing::MayRaise;
+using fuzzing::NoRaise;
 
 template <class F>
 F FloatValue(Input& in) {
@@ -157,25 +159,6 @@ bool Guarded(M& m, F&& f) {
     f();
   } catch (const EMathError&) {
     Expect(SameMatrix(before, m));
-    return false;
-  }
-  return true;
-}
-
-template <class F>
-void NoRaise(F&& f) {
-  try {
-    f();
-  } catch (...) {
-    Fail();
-  }
-}
-
-template <class F>
-bool MayRaise(F&& f) {
-  try {
-    f();
-  } catch (const EMathError&) {
     return false;
   }
   return true;

@@ -25,6 +25,8 @@ using namespace tovrin;
 using fuzzing::Expect;
 using fuzzing::Fail;
 using fuzzing::Input;
+using fuzzing::MayRaise;
+using fuzzing::NoRaise;
 
 template <class F>
 F FloatValue(Input& in) {
@@ -130,27 +132,6 @@ bool Guarded(V& v, F&& f) {
     f();
   } catch (const EMathError&) {
     Expect(SameBits(before, v));
-    return false;
-  }
-  return true;
-}
-
-// Runs a call documented never to raise.
-template <class F>
-void NoRaise(F&& f) {
-  try {
-    f();
-  } catch (...) {
-    Fail();
-  }
-}
-
-// Runs a call that may raise EMathError; returns whether it returned.
-template <class F>
-bool MayRaise(F&& f) {
-  try {
-    f();
-  } catch (const EMathError&) {
     return false;
   }
   return true;

@@ -12,30 +12,12 @@
 
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINMath.h"
+#include "tovrin/foundation/testdata/gammabeta_reference.h"
 
 namespace tovrin {
 namespace {
 
-struct SpecialCase1 {
-  Extended x;
-  Extended expected;
-  Extended tolerance;
-};
-struct SpecialCase2 {
-  Extended a;
-  Extended b;
-  Extended expected;
-  Extended tolerance;
-};
-struct SpecialCase3 {
-  Extended x;
-  Extended a;
-  Extended b;
-  Extended expected;
-  Extended tolerance;
-};
-
-#include "tovrin/foundation/testdata/gammabeta_reference.inc"
+using namespace testdata;
 
 constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
 constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
