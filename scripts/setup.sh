@@ -7,6 +7,7 @@ command -v g++ >/dev/null || missing+=(g++)
 command -v pkg-config >/dev/null || missing+=(pkg-config)
 [ -d /usr/include/gtest ] || missing+=(libgtest-dev libgmock-dev)
 [ -d /usr/include/benchmark ] || missing+=(libbenchmark-dev)
+python3 -c 'import mpmath' 2>/dev/null || missing+=(python3 python3-mpmath)
 if [ ${#missing[@]} -gt 0 ]; then
   echo "installing: ${missing[*]}"
   if [ "$(id -u)" -eq 0 ]; then SUDO=""; else SUDO="sudo"; fi
