@@ -212,6 +212,14 @@ Extended TruncExtended(Extended x) {
   return TruncSaturatedFromBits(x);
 }
 
+// XtoY, with the squares and cubes of the methods (Gamma's (1 + c x)^3, the body's power for
+// Shape 1/2) formed in place: XtoY gives the same products.
+[[gnu::always_inline]] inline Extended Power(Extended x, Extended y) {
+  if (y == 2) return x * x;
+  if (y == 3) return x * x * x;
+  return XtoY(x, y);
+}
+
 // ---------------------------------------------------------------------------------------------
 // Normal, log-normal, exponential
 
@@ -299,7 +307,7 @@ Extended GammaLargeShape(Extended shape, Gen& gen) {
     Extended t;
     do {
       x = StandardNormal(gen);
-      t = XtoY(1 + c * x, 3);
+      t = Power(1 + c * x, 3);
     } while (!(t > 0));
     const Extended u = gen();
     const Extended x2 = x * x;
@@ -341,7 +349,7 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
         haveW0 = true;
       }
       if (u <= floorBound && u <= w0) return 0;
-      x = t * XtoY(u / p, 1 / shape);
+      x = t * Power(u / p, 1 / shape);
       w = x;
     }
     const Extended u2 = gen();
