@@ -450,7 +450,9 @@ Extended StudentTVariate(LongInt df, Gen& gen) {
     const Extended x = (2 * v - 1) * m / u;
     const Extended x2 = x * x;
     if (x2 <= 5 - s * u) return x;
-    if (c < (x2 + 3) * u) continue;
+    // The quick rejection c < (x^2 + 3) u only holds the acceptance region inside it from three
+    // degrees of freedom on; below that the exact test alone decides.
+    if (df >= 3 && c < (x2 + 3) * u) continue;
     if (u <= XtoY(1 + x2 / n, e)) return x;
   }
 }
@@ -559,6 +561,9 @@ Extended InverseGaussianVariate(Extended lambda, Extended omega, Gen& gen) {
 // held as doubles.
 template <typename Gen>
 Int64 BinomialFromMode(LongInt n, Extended prob, Gen& gen) {
+  // The mode's probability would need ln 0 here; the outcome is certain anyway.
+  if (prob == 0) return 0;
+  if (prob == 1) return n;
   const Extended trials = n;
   const Int64 mode = TruncChecked((trials + 1) * prob);
   const Extended modeX = static_cast<Extended>(mode);
@@ -1165,8 +1170,8 @@ Extended Random_Cauchy() {
   return CauchyVariate(gen);
 }
 
-Int64 Random_Poisson(Extended& Mu, TRandomGenFunction Gen) { return PoissonVariate(Mu, Gen); }
-Int64 Random_Poisson(Extended& Mu) {
+Int64 Random_Poisson(const Extended& Mu, TRandomGenFunction Gen) { return PoissonVariate(Mu, Gen); }
+Int64 Random_Poisson(const Extended& Mu) {
   ThreadSource gen;
   return PoissonVariate(Mu, gen);
 }
