@@ -13,12 +13,14 @@
 #include <array>
 #include <cmath>
 #include <cstdint>
+#include <cstring>
 #include <functional>
 #include <initializer_list>
 #include <limits>
 #include <random>
 #include <string>
 #include <thread>
+#include <utility>
 #include <vector>
 
 #include "tovrin/testing/TOVRIN_testing.h"
@@ -373,6 +375,28 @@ TEST(RandomWeibullBetaAndT, DrawsAndChecks) {
   }
 }
 
+TEST(RandomT, QuickRejectionKeepsDrawsFromThreeDegreesOn) {
+  // FNV-1a hashes of the 10 bytes of 20000 draws each, on a fixed 53-bit uniform stream, as the
+  // method gave them with the quick rejection applied at every DF: it only saves time from DF = 3.
+  const std::pair<LongInt, std::uint64_t> expected[] = {{3, 0x775e0ce7cfb05d3au},
+                                                        {4, 0x3a60c1c772180b58u},
+                                                        {7, 0x3c9c1a7fd362b25fu},
+                                                        {30, 0x8308f0c06ad70ec6u},
+                                                        {1000, 0x7951a77dfbee472du}};
+  for (const auto& [df, hash] : expected) {
+    std::mt19937_64 engine(20261124u + static_cast<std::uint64_t>(df));
+    const auto source = [&] { return static_cast<Extended>(engine() >> 11) * 0x1p-53L; };
+    std::uint64_t h = 1469598103934665603u;
+    for (int i = 0; i < 20000; ++i) {
+      const Extended x = Random_T(df, source);
+      unsigned char bytes[10];
+      std::memcpy(bytes, &x, sizeof bytes);
+      for (unsigned char b : bytes) h = (h ^ b) * 1099511628211u;
+    }
+    EXPECT_EQ(h, hash) << "DF " << df;
+  }
+}
+
 TEST(RandomMVNorm, PacksTheUpperFactorByRows) {
   // U = [2 1 -1; 0 3 2; 0 0 1], Covariance = U'U = [4 2 -2; 2 10 5; -2 5 6], packed by columns;
   // a longer Covariance is fine, and Factor shrinks to 6. Variate = means + U'z.
@@ -470,10 +494,19 @@ TEST(RandomBinomial, ModeShortcutOutwardWalkAndInversion) {
       ASSERT_EQ(Random_Binomial1(10, 0.35L, script), expected) << u;
     }
   }
-  // P = 0 makes the mode's probability NaN: both ends are reached and the walk raises.
-  ScriptedSource unfinished{0.5L}, zero{0.999L};
-  ExpectRaises(rsInvalidValue, [&] { Random_Binomial1(3, 0, unfinished); });
+  // P = 0 and P = 1 leave one possible value and draw nothing; N = 0 has the mode 0.
+  for (LongInt n : {0, 1, 7, 1000000}) {
+    ScriptedSource none{};
+    EXPECT_EQ(Random_Binomial1(n, 0, none), 0);
+    EXPECT_EQ(Random_Binomial1(n, 1, none), n);
+    EXPECT_EQ(none.Draws(), 0u);
+  }
+  ScriptedSource zero{0.999L};
   EXPECT_EQ(Random_Binomial1(0, 0.4L, zero), 0);
+  // N = 1, P = 0.01: the probabilities 0.99 and 0.01, held as doubles, add up to less than the
+  // largest uniform, so the walk ends with u still not negative.
+  ScriptedSource last{1 - 0x1p-64L};
+  ExpectRaises(rsInvalidValue, [&] { Random_Binomial1(1, 0.01L, last); });
   // N = 5, P = 0.3: q^N = 0.16807. u = 0.1 and 0.05 would give 0 and are redrawn; u = 0.2
   // gives 1, or N - 1 reflected for P > 0.5. Past y = 110 the search would not end.
   ScriptedSource script{0.1L, 0.05L, 0.2L}, reflected{0.1L, 0.05L, 0.2L}, beyond{1.5L};
@@ -522,6 +555,8 @@ TEST(RandomDiscrete, NegativeBinomialPoissonAndCauchy) {
     EXPECT_EQ(s.Draws(), c.draws);
     EXPECT_EQ(mu, c.mu);
   }
+  ScriptedSource literal{0.5L, 0.6L};  // the mean may be a literal
+  EXPECT_EQ(Random_Poisson(10.0001L, literal), 11);
   for (Extended mu : {kInf, kNaN, 1e30L}) {
     ScriptedSource s{0.5L, 0.6L, 0.5L, 0.6L};
     ExpectRaises(rsInvalidValue, [&] { Random_Poisson(mu, s); });
@@ -557,6 +592,102 @@ TEST(RandomInvGaussAndVonMises, DrawsAndChecks) {
   ScriptedSource run{0.25L, 0.4L, 0.5L, 0.5L, 0.9L};
   EXPECT_NEAR(Random_von_Mises(0.3L, run), QENPi / 2, 1e-18L);
   EXPECT_EQ(run.Draws(), 5u);
+}
+
+class StreamHash {
+ public:
+  void Add(Extended x) {
+    unsigned char bytes[sizeof(Extended)] = {};
+    std::memcpy(bytes, &x, sizeof(Extended));
+    AddBytes(bytes, 10);
+  }
+  void Add(Int64 k) {
+    unsigned char bytes[sizeof(Int64)];
+    std::memcpy(bytes, &k, sizeof(Int64));
+    AddBytes(bytes, sizeof(Int64));
+  }
+  std::uint64_t Value() const { return hash_; }
+
+ private:
+  void AddBytes(const unsigned char* bytes, std::size_t n) {
+    for (std::size_t i = 0; i < n; ++i) hash_ = (hash_ ^ bytes[i]) * 0x100000001B3ULL;
+  }
+  std::uint64_t hash_ = 0xCBF29CE484222325ULL;
+};
+
+TEST(RandomStreams, FixedSeedsGiveTheRecordedDraws) {
+  // The generators are evaluated with shortcuts that must not change a single decision: each
+  // row hashes 20000 draws, through a caller's source and through the thread's own stream,
+  // against the hash recorded from the plain evaluation of the methods.
+  struct Row {
+    const char* name;
+    std::function<void(StreamHash&, TRandomGenFunction)> draw;
+    std::function<void(StreamHash&)> drawOwn;
+    std::uint64_t withSource;
+    std::uint64_t withoutSource;
+  };
+  const std::vector<Row> rows = {
+      {"Normal", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Normal(g)); },
+       [](StreamHash& h) { h.Add(Random_Normal()); }, 0xC2613C5A7626F554ULL, 0xE58B31373893FCCULL},
+      {"Exponential", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Exponential(g)); },
+       [](StreamHash& h) { h.Add(Random_Exponential()); }, 0x812F68D58DCEB87ULL,
+       0x80FC6416F81A1A12ULL},
+      {"Gamma_5", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Gamma(5, g)); },
+       [](StreamHash& h) { h.Add(Random_Gamma(5)); }, 0xBC98F655F235FFBBULL, 0x25F504E6AB77C72ULL},
+      {"Gamma_2_5", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Gamma(2.5L, g)); },
+       [](StreamHash& h) { h.Add(Random_Gamma(2.5L)); }, 0xAB47C815F4EB25D5ULL,
+       0xD3F667094552BFEULL},
+      {"Gamma_0_5", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Gamma(0.5L, g)); },
+       [](StreamHash& h) { h.Add(Random_Gamma(0.5L)); }, 0x6F1ECAEE6CF6C11DULL,
+       0x9C891ED8A23097CCULL},
+      {"Gamma_0_3", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Gamma(0.3L, g)); },
+       [](StreamHash& h) { h.Add(Random_Gamma(0.3L)); }, 0x95E9C5A2A2BE70D7ULL,
+       0xB59F9418A6E9AC0BULL},
+      {"Binomial2_1000_0_3",
+       [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Binomial2(1000, 0.3L, g)); },
+       [](StreamHash& h) { h.Add(Random_Binomial2(1000, 0.3L)); }, 0xCE1CC84225D3A83CULL,
+       0xE0BE97114E21444AULL},
+      {"Binomial2_20_0_3",
+       [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Binomial2(20, 0.3L, g)); },
+       [](StreamHash& h) { h.Add(Random_Binomial2(20, 0.3L)); }, 0xBDB9D402795CCC21ULL,
+       0x329F919F09C92B03ULL},
+      {"Binomial2_100000_0_6",
+       [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Binomial2(100000, 0.6L, g)); },
+       [](StreamHash& h) { h.Add(Random_Binomial2(100000, 0.6L)); }, 0xCDC59516ACE941F4ULL,
+       0x645B5781DBC79630ULL},
+      {"Poisson_100",
+       [](StreamHash& h, TRandomGenFunction g) {
+         Extended mu = 100;
+         h.Add(Random_Poisson(mu, g));
+       },
+       [](StreamHash& h) {
+         Extended mu = 100;
+         h.Add(Random_Poisson(mu));
+       },
+       0x1A789606E9D90A19ULL, 0x94CEF0893552773FULL},
+      {"Poisson_12_5",
+       [](StreamHash& h, TRandomGenFunction g) {
+         Extended mu = 12.5L;
+         h.Add(Random_Poisson(mu, g));
+       },
+       [](StreamHash& h) {
+         Extended mu = 12.5L;
+         h.Add(Random_Poisson(mu));
+       },
+       0x7321250B33791A32ULL, 0x78D834214F0DCB22ULL},
+  };
+  for (const Row& row : rows) {
+    EngineSource engine(2026);
+    StreamHash withSource;
+    for (int i = 0; i < 20000; ++i) row.draw(withSource, engine);
+    SetRandSeed(2026);
+    StreamHash withoutSource;
+    for (int i = 0; i < 20000; ++i) row.drawOwn(withoutSource);
+    EXPECT_EQ(withSource.Value(), row.withSource)
+        << row.name << std::hex << " 0x" << withSource.Value();
+    EXPECT_EQ(withoutSource.Value(), row.withoutSource)
+        << row.name << std::hex << " 0x" << withoutSource.Value();
+  }
 }
 
 TEST(RandomExtremes, LargeArgumentsStayWithinRangeWithoutOverflow) {
@@ -651,11 +782,11 @@ TEST(RandomDistribution, Continuous) {
   CheckContinuous("Beta_0_5_0_7", [&] { return Random_Beta(0.5L, 0.7L, e); });
   CheckContinuous("Beta_3_0_4", [] { return Random_Beta(3, 0.4L); });
   CheckContinuous("Beta_0_2_5", [&] { return Random_Beta(0.2L, 5, e); });
-  // For DF = 1 and 2 the quick rejection bound c / (x^2 + 3) lies under the ratio-of-uniforms
-  // boundary, touching it at x^2 = 1, so it alone shapes the accepted region: those variates
-  // follow Student's t with 3 degrees of freedom (the method is kept as it stands).
-  CheckContinuous("T_3", [] { return Random_T(1); });
-  CheckContinuous("T_3", [&] { return Random_T(2, e); });
+  // DF 1 and 2 are decided by the exact test alone (the quick rejection would cut their tails):
+  // DF = 1 is the standard Cauchy.
+  CheckContinuous("T_1", [] { return Random_T(1); });
+  CheckContinuous("Cauchy", [&] { return Random_T(1, e); });
+  CheckContinuous("T_2", [&] { return Random_T(2, e); });
   CheckContinuous("T_3", [] { return Random_T(3); });
   CheckContinuous("T_10", [&] { return Random_T(10, e); });
   CheckContinuous("Cauchy", [] { return Random_Cauchy(); });

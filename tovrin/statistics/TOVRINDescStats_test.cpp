@@ -2,6 +2,7 @@
 // hand (small samples) or exact rational arithmetic (python3 fractions) for Michelson's 1879
 // light-speed measurements, noted beside the table.
 #include <algorithm>
+#include <cmath>
 #include <limits>
 #include <sstream>
 #include <string>
@@ -16,6 +17,7 @@ namespace {
 using Lines = std::vector<std::string>;
 using testing::Values;
 using L = std::vector<Extended>;
+constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
 
 TQENDescStats WithValues(std::initializer_list<long double> values, bool population = false) {
   TQENDescStats stats;
@@ -297,14 +299,40 @@ TEST(DescStatsStream, SavedFormAndRoundTrips) {
     copy.LoadFromStream(stream);
     EXPECT_EQ(Take(copy), Take(original));
   }
-  // Carriage returns are accepted; absent properties take their defaults.
+  // Carriage returns are accepted; absent properties keep their current values.
   std::istringstream in("TQENDescStats\r\nItems 2\r\n3\r\n5\r\nEnd\r\n");
   TQENDescStats loaded = WithValues({1}, true);
   loaded.SetDecimalPlaces(9);
   loaded.LoadFromStream(in);
   EXPECT_EQ(loaded.Mean(), 4.0L);
-  EXPECT_FALSE(loaded.Population());
-  EXPECT_EQ(loaded.DecimalPlaces(), 4);
+  EXPECT_TRUE(loaded.Population());
+  EXPECT_EQ(loaded.DecimalPlaces(), 9);
+}
+
+TEST(DescStatsStream, InfinitiesAndNaNSurviveEveryRoundTrip) {
+  TQENDescStats stats;
+  for (Extended v : {kInf, -kInf, std::numeric_limits<Extended>::quiet_NaN(), 2.5L}) {
+    stats.AddValue(v);
+  }
+  EXPECT_EQ(stats.Items(), (Lines{"INF", "-INF", "NAN", "2.5"}));
+  const auto expectSame = [](const TQENDescStats& copy) {
+    const L v = Values(copy.Values());
+    ASSERT_EQ(v.size(), 4u);
+    EXPECT_EQ(v[0], kInf);
+    EXPECT_EQ(v[1], -kInf);
+    EXPECT_TRUE(std::isnan(v[2]));
+    EXPECT_EQ(v[3], 2.5L);
+  };
+  std::stringstream stream;
+  stats.SaveToStream(stream);
+  TQENDescStats loaded;
+  loaded.LoadFromStream(stream);
+  expectSame(loaded);
+  TQENDescStats set;
+  set.SetItems(stats.Items());
+  expectSame(set);
+  stats.Loaded();
+  expectSame(stats);
 }
 
 TEST(DescStatsStream, FailedLoadLeavesTheComponentAsItWas) {
