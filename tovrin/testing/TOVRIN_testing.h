@@ -51,6 +51,21 @@ void ExpectRaisesUntouched(TResStringId Ident, const Operand& operand, Call&& ca
   EXPECT_TRUE(SameBits(work, operand)) << "operand changed by a failed call";
 }
 
+// Sets a switch (QENMatrixRectangularCheck, say) for its lifetime and restores the value it had,
+// however the test ends.
+template <typename Switch, typename Value>
+class SwitchGuard {
+ public:
+  SwitchGuard(Switch& s, Value value) : switch_(s), saved_(s) { s = value; }
+  ~SwitchGuard() { switch_ = saved_; }
+  SwitchGuard(const SwitchGuard&) = delete;
+  SwitchGuard& operator=(const SwitchGuard&) = delete;
+
+ private:
+  Switch& switch_;
+  Value saved_;
+};
+
 // |actual - expected| <= bound.
 inline ::testing::AssertionResult Near(Extended actual, Extended expected, Extended bound) {
   const Extended error = std::fabs(actual - expected);
