@@ -31,6 +31,11 @@ Arguments::Arguments(std::span<const std::string> Words,
     if (const auto eq = word.find('='); eq != std::string::npos && word.starts_with("--")) {
       name = word.substr(0, eq);
       inline_value = word.substr(eq + 1);
+    } else if (word[1] != '-' && word.size() > 2 &&
+               std::find(ValueOptions.begin(), ValueOptions.end(), word.substr(0, 2)) !=
+                   ValueOptions.end()) {
+      name = word.substr(0, 2);  // "-t," is "-t ,"
+      inline_value = word.substr(2);
     }
     if (std::find(FlagOptions.begin(), FlagOptions.end(), name) != FlagOptions.end()) {
       if (inline_value) throw UsageError("option " + name + " takes no value");

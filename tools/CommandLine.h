@@ -33,7 +33,8 @@ class InputError : public std::runtime_error {
 
 // The arguments of one subcommand, split into options and operands. Every word that starts
 // with '-' and is not a number (and not "-" alone, which names standard input) is an option.
-// Options that take a value take the next word, whatever it is.
+// Options that take a value take the next word, whatever it is, or the text after '=' of a
+// long option ("--decimals=2") or after the letter of a short one ("-t,").
 class Arguments {
  public:
   // ValueOptions are the options that take a value, FlagOptions those that do not. "--help"
