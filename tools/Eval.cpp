@@ -16,6 +16,8 @@ using U = LongWord;
 constexpr std::string_view kHelp =
     "Usage: tovrin eval FUNCTION [ARG...]\n"
     "       tovrin eval --list\n"
+    "       tovrin eval --precise FUNCTION [ARG...]\n"
+    "       tovrin eval --precise --list\n"
     "\n"
     "Calls the library's scalar function FUNCTION (its exact name) with the ARGs and prints\n"
     "the result with 21 significant digits, a Boolean as True or False. Functions with\n"
@@ -35,8 +37,9 @@ constexpr std::string_view kHelp =
     "An error raised by the function is printed on standard error (exit status 1).\n"
     "\n"
     "Options:\n"
-    "  --list   list the functions with their argument names\n"
-    "  --help   show this help\n";
+    "  --list     list the functions with their argument names\n"
+    "  --precise  use the precise distribution family (tovrin::precise) instead\n"
+    "  --help     show this help\n";
 
 std::string Labelled(const char* Name, Extended Value) {
   return std::string(Name) + "\t" + FormatSignificant(Value);
@@ -314,13 +317,20 @@ int RunEval(std::span<const std::string> Words) {
       return kExitOk;
     }
   }
+  const bool precise = Words[0] == "--precise";
+  const CallableTable& table = precise ? PreciseEvalTable() : EvalTable();
+  if (precise) {
+    Words = Words.subspan(1);
+    if (Words.empty()) throw UsageError("eval --precise needs a FUNCTION name (or --list)");
+  }
   if (Words[0] == "--list") {
     if (Words.size() > 1) throw UsageError("--list takes no arguments");
-    WriteOut(ListCallables(EvalTable()));
+    WriteOut(ListCallables(table));
     return kExitOk;
   }
   if (Words[0].starts_with("-")) throw UsageError("unknown option " + Words[0]);
-  const auto call = BindByName(EvalTable(), "function", Words[0], Words.subspan(1));
+  const auto call = BindByName(table, precise ? "precise function" : "function", Words[0],
+                               Words.subspan(1));
   WriteOut(call() + "\n");
   return kExitOk;
 }
