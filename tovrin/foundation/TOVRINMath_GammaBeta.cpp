@@ -791,8 +791,33 @@ Extended GammaFactor(Extended a, Extended x) {
     if (std::isnormal(power) && std::isnormal(decay) && std::isnormal(r)) return r;
     return std::exp(a * std::log(x) - x - LnGammaFinite(a));
   }
-  const Extended exponent = ShapeTimesOffsetPhi(a, RelativeOffset(a, x));
-  return std::exp(-exponent - StirlingSeries(a)) * (std::sqrt(a) * kInvSqrt2Pi);
+  // r = (x / a)^a e^(a - x) sqrt(a / (2 pi)) e^-Delta(a). While the two powers stay in range
+  // they come from bases carried to twice the working precision, so r carries only the
+  // rounding of pow and exp; beyond, the exponent -a phi(t) is formed in one piece.
+  const Extended scale = std::sqrt(a) * kInvSqrt2Pi * std::exp(-StirlingSeries(a));
+  const Extended q = x / a;
+  const ExactPair qa = TwoProduct(q, a);
+  const Extended q_lo = ((x - qa.hi) - qa.lo) / a;
+  const ExactPair d = TwoSum(a, -x);
+  // The power is taken as the square of its half, which reaches twice as far.
+  const Extended half = std::pow(q, 0.5L * a);
+  const Extended decay = std::exp(d.hi);
+  const Extended product = half * decay * scale;
+  const Extended r = product * half;
+  if (q > 0.0L && std::isnormal(half) && std::isnormal(decay) && std::isnormal(product) &&
+      std::isnormal(r)) {
+    return r * (1.0L + a * (q_lo / q)) * (1.0L + d.lo);
+  }
+  const ExactPair t = RelativeOffset(a, x);
+  Extended exponent;
+  if (t.hi < -0.5L) {
+    // a ln(x / a) + (a - x), the logarithm from its exact pieces when x / a leaves the range.
+    const Extended log_ratio = q > 0.0L ? std::log(q) + q_lo / q : std::log(x) - std::log(a);
+    exponent = -(a * log_ratio + d.hi + d.lo);
+  } else {
+    exponent = ShapeTimesOffsetPhi(a, t);
+  }
+  return std::exp(-exponent) * scale;
 }
 
 // 1 + x/(a+1) + x^2/((a+1)(a+2)) + ..., so that P(a, x) = r / a times it.
@@ -827,6 +852,17 @@ Extended UpperGammaFraction(Extended a, Extended x) {
     if (std::fabs(delta - 1.0L) <= kEpsilon * 0.5L) break;
   }
   return h;
+}
+
+// Q(1/2, x) = erfc(sqrt x), the root carried to twice the working precision (far out the
+// relative error of erfc is 2 x times that of its argument).
+Extended ErfcOfSqrt(Extended x) {
+  const Extended s = std::sqrt(x);
+  const ExactPair ss = TwoProduct(s, s);
+  const Extended s_lo = ((x - ss.hi) - ss.lo) / (2.0L * s);
+  Extended e = std::erfc(s);
+  if (s_lo != 0.0L && x < 12000.0L) e -= s_lo * 1.12837916709551257389615890312154517L * std::exp(-x);
+  return e;
 }
 
 detail::Tails TemmeGammaTails(Extended a, const ExactPair& t) {
@@ -868,8 +904,12 @@ Tails IncompleteGammaTails(Extended A, Extended X) {
   }
   if (A <= 1.0L && X < 1.1L) {
     const Extended p = GammaFactor(A, X) / A * LowerGammaSeries(A, X);
-    if (A == 0.5L) return {p, std::erfc(std::sqrt(X))};
+    if (A == 0.5L) return {p, ErfcOfSqrt(X)};
     return {p, ScaledUpperGamma(A, X, 0.0L)};
+  }
+  if (A == 0.5L) {
+    const Extended q = ErfcOfSqrt(X);
+    return {1.0L - q, q};
   }
   const Extended r = GammaFactor(A, X);
   if (A <= 1.0L) {

@@ -230,9 +230,44 @@ Tails FTails(Extended X, Extended DF1, Extended DF2) {
   return BetaTails(FPoint(X, DF1, DF2), 0.5L * DF1, 0.5L * DF2);
 }
 
-// The x with I_x(a, b) = p, 1 - I_x = q, returned as the ratio x / y.
+// The root (x, y = 1 - x) of I_x(a, b) = p, 1 - I_x = q: the foundation's inverse, then Newton
+// steps on the smaller member against the tail that is known to full accuracy (on its
+// logarithm when the target is small), until the step falls below the rounding.
+detail::BetaRoot BetaRoot(Extended p, Extended q, Extended a, Extended b) {
+  detail::BetaRoot r = detail::InverseIncompleteBetaTails(p, q, a, b);
+  for (int i = 0; i < 8; ++i) {
+    if (!(r.x > 0.0L && r.y > 0.0L)) return r;
+    // Work on the member that is small, as the lower tail of I_s(sa, sb).
+    const bool flip = r.y < r.x;
+    const Extended s = flip ? r.y : r.x;
+    const Extended sa = flip ? b : a;
+    const Extended sb = flip ? a : b;
+    const Extended sp = flip ? q : p;
+    const Extended sq = flip ? p : q;
+    const Extended other = 1.0L - s;
+    const Extended other_lo = (1.0L - other) - s;
+    const Tails t = detail::IncompleteBetaTails(s, 0.0L, other, other_lo, sa, sb);
+    const Extended density =
+        detail::BetaPowerFactor(s, 0.0L, other, other_lo, sa, sb) / (s * other);
+    if (!(density > 0.0L) || !std::isfinite(density)) return r;
+    Extended next;
+    if (sp <= sq) {
+      if (!(t.lower > 0.0L)) return r;
+      next = s * std::exp(-std::log(t.lower / sp) * t.lower / (s * density));
+    } else {
+      next = s - (sq - t.upper) / density;
+    }
+    if (!(next > 0.0L && next < 1.0L)) return r;
+    const bool done = std::fabs(next - s) <= 2.0L * kEpsilon * s;
+    r = flip ? detail::BetaRoot{1.0L - next, next} : detail::BetaRoot{next, 1.0L - next};
+    if (done) break;
+  }
+  return r;
+}
+
+// The root of I_x(a, b) = p as the ratio x / y.
 Extended BetaRootRatio(Extended p, Extended q, Extended a, Extended b) {
-  const detail::BetaRoot r = detail::InverseIncompleteBetaTails(p, q, a, b);
+  const detail::BetaRoot r = BetaRoot(p, q, a, b);
   return r.x / r.y;
 }
 
@@ -546,26 +581,26 @@ Extended BetaDistGreater(Extended X, Extended A, Extended B, Extended Lower, Ext
 Extended InvBetaDistLess(Extended P, Extended A, Extended B) {
   CheckClosedProbability(P);
   CheckBetaShapes(A, B);
-  return detail::InverseIncompleteBetaTails(P, 1.0L - P, A, B).x;
+  return BetaRoot(P, 1.0L - P, A, B).x;
 }
 
 Extended InvBetaDistLess(Extended P, Extended A, Extended B, Extended Lower, Extended Upper) {
   const auto [low, high] = BetaInterval(Lower, Upper);
   const detail::BetaRoot r = (CheckClosedProbability(P), CheckBetaShapes(A, B),
-                              detail::InverseIncompleteBetaTails(P, 1.0L - P, A, B));
+                              BetaRoot(P, 1.0L - P, A, B));
   return r.x <= 0.5L ? low + (high - low) * r.x : high - (high - low) * r.y;
 }
 
 Extended InvBetaDistGreater(Extended P, Extended A, Extended B) {
   CheckClosedProbability(P);
   CheckBetaShapes(A, B);
-  return detail::InverseIncompleteBetaTails(1.0L - P, P, A, B).x;
+  return BetaRoot(1.0L - P, P, A, B).x;
 }
 
 Extended InvBetaDistGreater(Extended P, Extended A, Extended B, Extended Lower, Extended Upper) {
   const auto [low, high] = BetaInterval(Lower, Upper);
   const detail::BetaRoot r = (CheckClosedProbability(P), CheckBetaShapes(A, B),
-                              detail::InverseIncompleteBetaTails(1.0L - P, P, A, B));
+                              BetaRoot(1.0L - P, P, A, B));
   return r.x <= 0.5L ? low + (high - low) * r.x : high - (high - low) * r.y;
 }
 

@@ -54,13 +54,34 @@ Extended Deviance(Extended x, const Pair& m) {
   return d + m.lo * (1.0L - x / m.hi);
 }
 
-// The binomial point probability C(n, x) p^x q^(n - x), with n p and n q given as pairs.
+// (m / x)^x for m = hi + lo: pow of the double-length base, so the result carries only pow's
+// rounding. Not normal when it leaves the range.
+Extended PowerOfRatio(const Pair& m, Extended x) {
+  const Pair q = detail::Quotient(m, Pair{x});
+  return std::pow(q.hi, x) * (1.0L + x * (q.lo / q.hi));
+}
+
+bool AllNormal(Extended a, Extended b, Extended c) {
+  return std::isnormal(a) && std::isnormal(b) && std::isnormal(c);
+}
+
+// The binomial point probability C(n, x) p^x q^(n - x), with n p and n q given as pairs:
+// e^-(bd0(x, np) + bd0(n - x, nq)) = (np / x)^x (nq / (n - x))^(n - x), since the linear terms
+// cancel; the powers are used while they stay in range, the deviances beyond.
 Extended BinomialPoint(Extended x, Extended n, const Pair& np, const Pair& nq) {
-  if (x == 0.0L) return std::exp(-Deviance(n, nq) - np.hi) * (1.0L - np.lo);
-  if (x == n) return std::exp(-Deviance(n, np) - nq.hi) * (1.0L - nq.lo);
-  const Extended exponent = StirlingError(n) - StirlingError(x) - StirlingError(n - x) -
-                            Deviance(x, np) - Deviance(n - x, nq);
-  return std::exp(exponent) * std::sqrt(n / (kTwoPi * x * (n - x)));
+  if (x == 0.0L || x == n) {
+    const Pair& m = x == 0.0L ? nq : np;
+    const Extended power = PowerOfRatio(m, n);
+    if (std::isnormal(power)) return power;
+    const Pair& other = x == 0.0L ? np : nq;
+    return std::exp(-Deviance(n, m) - other.hi) * (1.0L - other.lo);
+  }
+  const Extended stirling = StirlingError(n) - StirlingError(x) - StirlingError(n - x);
+  const Extended root = std::sqrt(n / (kTwoPi * x * (n - x)));
+  const Extended left = PowerOfRatio(np, x);
+  const Extended right = PowerOfRatio(nq, n - x);
+  if (AllNormal(left, right, left * right)) return left * right * std::exp(stirling) * root;
+  return std::exp(stirling - Deviance(x, np) - Deviance(n - x, nq)) * root;
 }
 
 // (p, 1 - p) as pairs, each exact to twice the working precision.
@@ -221,8 +242,19 @@ Extended PoissonEq(Extended Mean, LongWord X) {
   CheckPoisson(Mean);
   if (std::isnan(Mean)) return kNaN;
   if (X == 0) return std::exp(-Mean);
+  // e^-bd0(x, Mean) = (Mean / x)^x e^(x - Mean), from powers while they stay in range.
   const Extended x = X;
-  return std::exp(-StirlingError(x) - Deviance(x, Pair{Mean})) / std::sqrt(kTwoPi * x);
+  const Extended root = std::exp(-StirlingError(x)) / std::sqrt(kTwoPi * x);
+  // The power as the square of its half, which reaches twice as far.
+  const Pair q = detail::Quotient(Pair{Mean}, Pair{x});
+  const Extended half = std::pow(q.hi, 0.5L * x);
+  const Pair d = detail::ExactSum(x, -Mean);
+  const Extended decay = std::exp(d.hi);
+  const Extended partial = half * decay * root;
+  if (AllNormal(half, decay, partial) && std::isnormal(partial * half)) {
+    return partial * half * (1.0L + x * (q.lo / q.hi)) * (1.0L + d.lo);
+  }
+  return std::exp(-Deviance(x, Pair{Mean})) * root;
 }
 
 Extended PoissonLess(Extended Mean, LongWord X) {
