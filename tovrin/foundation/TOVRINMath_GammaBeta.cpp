@@ -938,7 +938,22 @@ Tails IncompleteBetaTails(Extended X, Extended XLo, Extended Y, Extended YLo, Ex
     if (A < kTinyShape && B < kTinyShape) return {B / (A + B), A / (A + B)};
     return A < kTinyShape ? Tails{1.0L, 0.0L} : Tails{0.0L, 1.0L};
   }
-  const BetaValues v = IncompleteBetaBoth(BetaPoint{X, Y, XLo, YLo}, A, B);
+  const BetaPoint p{X, Y, XLo, YLo};
+  BetaValues v = IncompleteBetaBoth(p, A, B);
+  // The side is chosen by the mean; for a very skewed shape the complement can still be small,
+  // and then it is computed directly where the expansion for a small second shape applies.
+  constexpr Extended kDirectBelow = 0.25L;
+  if (std::fmin(A, B) <= kHugeShape) {
+    const bool lower_derived = BetaLambda(p, A, B) < 0.0L;
+    Extended direct;
+    if (lower_derived && v.lower < kDirectBelow &&
+        LowerTailSmallB(p, A, B, v.factor, direct)) {
+      v.lower = direct;
+    } else if (!lower_derived && v.upper < kDirectBelow &&
+               LowerTailSmallB(Swapped(p), B, A, v.factor, direct)) {
+      v.upper = direct;
+    }
+  }
   return {v.lower, v.upper};
 }
 

@@ -586,8 +586,8 @@ Extended InvBetaDistLess(Extended P, Extended A, Extended B) {
 
 Extended InvBetaDistLess(Extended P, Extended A, Extended B, Extended Lower, Extended Upper) {
   const auto [low, high] = BetaInterval(Lower, Upper);
-  const detail::BetaRoot r = (CheckClosedProbability(P), CheckBetaShapes(A, B),
-                              BetaRoot(P, 1.0L - P, A, B));
+  const detail::BetaRoot r =
+      (CheckClosedProbability(P), CheckBetaShapes(A, B), BetaRoot(P, 1.0L - P, A, B));
   return r.x <= 0.5L ? low + (high - low) * r.x : high - (high - low) * r.y;
 }
 
@@ -599,8 +599,8 @@ Extended InvBetaDistGreater(Extended P, Extended A, Extended B) {
 
 Extended InvBetaDistGreater(Extended P, Extended A, Extended B, Extended Lower, Extended Upper) {
   const auto [low, high] = BetaInterval(Lower, Upper);
-  const detail::BetaRoot r = (CheckClosedProbability(P), CheckBetaShapes(A, B),
-                              BetaRoot(1.0L - P, P, A, B));
+  const detail::BetaRoot r =
+      (CheckClosedProbability(P), CheckBetaShapes(A, B), BetaRoot(1.0L - P, P, A, B));
   return r.x <= 0.5L ? low + (high - low) * r.x : high - (high - low) * r.y;
 }
 

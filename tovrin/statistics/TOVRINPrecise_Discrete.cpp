@@ -142,8 +142,7 @@ Extended HyperGeometricPoint(LongWord N, LongWord S, LongWord M, std::int64_t x)
 
 // The sum of the point probabilities from `from` towards `to` (one step at a time), from the
 // first term on by the ratio of neighbours; stops once the terms no longer count.
-Extended HyperGeometricRun(LongWord N, LongWord S, LongWord M, std::int64_t from,
-                           std::int64_t to) {
+Extended HyperGeometricRun(LongWord N, LongWord S, LongWord M, std::int64_t from, std::int64_t to) {
   const Extended n = N;
   const Extended s = S;
   const Extended m = M;
@@ -169,7 +168,9 @@ Tails HyperGeometricSplit(LongWord N, LongWord S, LongWord M, std::int64_t x) {
   const CountRange range = HyperGeometricRange(N, S, M);
   if (x <= range.first) return {0.0L, 1.0L};
   if (x > range.last) return {1.0L, 0.0L};
-  const Extended mode = std::floor((static_cast<Extended>(S) + 1.0L) * (static_cast<Extended>(M) + 1.0L) / (static_cast<Extended>(N) + 2.0L));
+  const Extended mode =
+      std::floor((static_cast<Extended>(S) + 1.0L) * (static_cast<Extended>(M) + 1.0L) /
+                 (static_cast<Extended>(N) + 2.0L));
   if (static_cast<Extended>(x) <= mode) {
     const Extended below = HyperGeometricRun(N, S, M, x - 1, range.first);
     return {below, 1.0L - below};
@@ -200,7 +201,8 @@ Extended BinomialLess(Extended P, LongWord N, LongWord R) {
   if (P == 1) return 0;
   // P(X <= R - 1) = 1 - I_p(R, N - R + 1).
   const Proportion pq = ProportionOf(P);
-  return detail::IncompleteBetaTails(pq.p.hi, pq.p.lo, pq.q.hi, pq.q.lo, R, static_cast<Extended>(N) - R + 1)
+  return detail::IncompleteBetaTails(pq.p.hi, pq.p.lo, pq.q.hi, pq.q.lo, R,
+                                     static_cast<Extended>(N) - R + 1)
       .upper;
 }
 
@@ -212,8 +214,8 @@ Extended BinomialGreater(Extended P, LongWord N, LongWord R) {
   if (P == 1) return 1;
   // P(X >= R + 1) = I_p(R + 1, N - R).
   const Proportion pq = ProportionOf(P);
-  return detail::IncompleteBetaTails(pq.p.hi, pq.p.lo, pq.q.hi, pq.q.lo, static_cast<Extended>(R) + 1,
-                                     static_cast<Extended>(N) - R)
+  return detail::IncompleteBetaTails(pq.p.hi, pq.p.lo, pq.q.hi, pq.q.lo,
+                                     static_cast<Extended>(R) + 1, static_cast<Extended>(N) - R)
       .lower;
 }
 

@@ -37,8 +37,8 @@ TEST(PreciseReference, EveryRowToFullAccuracy) {
     EXPECT_LE(error, bound) << row.name << "(" << static_cast<double>(row.args[0]) << ", "
                             << static_cast<double>(row.args[1]) << ", "
                             << static_cast<double>(row.args[2]) << ", "
-                            << static_cast<double>(row.args[3]) << ") = "
-                            << static_cast<double>(got) << ", want "
+                            << static_cast<double>(row.args[3])
+                            << ") = " << static_cast<double>(got) << ", want "
                             << static_cast<double>(want);
   }
   for (const auto& [name, error] : worst) {
@@ -103,7 +103,8 @@ TEST(PreciseArguments, RaiseTheClassicIdentifiers) {
       {"BinomialEq N 0", rsBinomDistInvalid, [] { return BinomialEq(0.5L, 0, 0); }},
       {"BinomialLess P > 1", rsBinomDistInvalid, [] { return BinomialLess(1.5L, 4, 1); }},
       {"BinomialGreater R > N", rsBinomDistInvalid, [] { return BinomialGreater(0.5L, 4, 5); }},
-      {"HyperGeometricEq S > N", rsHyperGeometricInvalid, [] { return HyperGeometricEq(5, 6, 1, 0); }},
+      {"HyperGeometricEq S > N", rsHyperGeometricInvalid,
+       [] { return HyperGeometricEq(5, 6, 1, 0); }},
       {"HyperGeometricLess X > S", rsHyperGeometricInvalid,
        [] { return HyperGeometricLess(10, 3, 4, 4); }},
       {"HyperGeometricGreater M > N", rsHyperGeometricInvalid,

@@ -83,7 +83,8 @@ inline constexpr NamedCall kPreciseCalls[] = {
        return a[3] == a[4] ? precise::BetaDistGreater(a[0], a[1], a[2])
                            : precise::BetaDistGreater(a[0], a[1], a[2], a[3], a[4]);
      }},
-    {"InvBetaDistLess", [](const Extended* a) { return precise::InvBetaDistLess(a[0], a[1], a[2]); }},
+    {"InvBetaDistLess",
+     [](const Extended* a) { return precise::InvBetaDistLess(a[0], a[1], a[2]); }},
     {"InvBetaDistGreater",
      [](const Extended* a) { return precise::InvBetaDistGreater(a[0], a[1], a[2]); }},
     {"BetaPDF",
