@@ -17,12 +17,14 @@
 #include <atomic>
 #include <cmath>
 #include <cstdint>
+#include <cstring>
 #include <functional>
 #include <initializer_list>
 #include <limits>
 #include <random>
 #include <string>
 #include <thread>
+#include <utility>
 #include <vector>
 
 namespace tovrin {
@@ -513,6 +515,28 @@ TEST(RandomT, BoundOneForOneDegreeOfFreedom) {
   }
 }
 
+TEST(RandomT, QuickRejectionKeepsDrawsFromThreeDegreesOn) {
+  // FNV-1a hashes of the 10 bytes of 20000 draws each, on a fixed 53-bit uniform stream, as the
+  // method gave them with the quick rejection applied at every DF: it only saves time from DF = 3.
+  const std::pair<LongInt, std::uint64_t> expected[] = {{3, 0x775e0ce7cfb05d3au},
+                                                        {4, 0x3a60c1c772180b58u},
+                                                        {7, 0x3c9c1a7fd362b25fu},
+                                                        {30, 0x8308f0c06ad70ec6u},
+                                                        {1000, 0x7951a77dfbee472du}};
+  for (const auto& [df, hash] : expected) {
+    std::mt19937_64 engine(20261124u + static_cast<std::uint64_t>(df));
+    const auto source = [&] { return static_cast<Extended>(engine() >> 11) * 0x1p-53L; };
+    std::uint64_t h = 1469598103934665603u;
+    for (int i = 0; i < 20000; ++i) {
+      const Extended x = Random_T(df, source);
+      unsigned char bytes[10];
+      std::memcpy(bytes, &x, sizeof bytes);
+      for (unsigned char b : bytes) h = (h ^ b) * 1099511628211u;
+    }
+    EXPECT_EQ(h, hash) << "DF " << df;
+  }
+}
+
 TEST(RandomMVNorm, OneDimensionalFactorIsTheSquareRoot) {
   const TQENFloatVector means{5};
   const TQENFloatVector covariance{4};
@@ -671,13 +695,21 @@ TEST(RandomBinomial1, ModeShortcutAndOutwardWalk) {
   }
 }
 
-TEST(RandomBinomial1, UnfinishedWalkRaisesInsteadOfLooping) {
-  // P = 0 makes the mode's probability NaN: u never falls below 0 and both ends are reached.
-  ScriptedSource script{0.5L};
-  ExpectRaises(rsInvalidValue, [&] { Random_Binomial1(3, 0, script); });
-  // N = 0: the mode 0 has probability 1.
+TEST(RandomBinomial1, CertainOutcomesAndUnfinishedWalk) {
+  // P = 0 and P = 1 leave one possible value and draw nothing; N = 0 has the mode 0 with
+  // probability 1.
+  for (LongInt n : {0, 1, 7, 1000000}) {
+    ScriptedSource none{};
+    EXPECT_EQ(Random_Binomial1(n, 0, none), 0);
+    EXPECT_EQ(Random_Binomial1(n, 1, none), n);
+    EXPECT_EQ(none.Draws(), 0u);
+  }
   ScriptedSource zero{0.999L};
   EXPECT_EQ(Random_Binomial1(0, 0.4L, zero), 0);
+  // N = 1, P = 0.01: the probabilities 0.99 and 0.01, held as doubles, add up to less than the
+  // largest uniform, so the walk ends with u still not negative.
+  ScriptedSource last{1 - 0x1p-64L};
+  ExpectRaises(rsInvalidValue, [&] { Random_Binomial1(1, 0.01L, last); });
 }
 
 TEST(RandomBinomial2, InversionNeverGivesZeroBeforeReflection) {
@@ -780,12 +812,112 @@ TEST(RandomPoisson, TableUpToTenNormalMethodAbove) {
     EXPECT_EQ(Random_Poisson(nonPositive, one), 0);
     EXPECT_EQ(one.Draws(), 1u);
   }
+  ScriptedSource literal{0.5L, 0.6L};  // the mean may be a literal
+  EXPECT_EQ(Random_Poisson(10.0001L, literal), 11);
 }
 
 TEST(RandomPoisson, UnrepresentableMeanRaises) {
   for (Extended mu : {kInf, kNaN, 1e30L}) {
     ScriptedSource script{0.5L, 0.6L, 0.5L, 0.6L};
     ExpectRaises(rsInvalidValue, [&] { Random_Poisson(mu, script); });
+  }
+}
+
+// FNV-1a over the value bits of a stream of draws: the 10 bytes of an Extended, the 8 of an
+// Int64.
+class StreamHash {
+ public:
+  void Add(Extended x) {
+    unsigned char bytes[sizeof(Extended)] = {};
+    std::memcpy(bytes, &x, sizeof(Extended));
+    AddBytes(bytes, 10);
+  }
+  void Add(Int64 k) {
+    unsigned char bytes[sizeof(Int64)];
+    std::memcpy(bytes, &k, sizeof(Int64));
+    AddBytes(bytes, sizeof(Int64));
+  }
+  std::uint64_t Value() const { return hash_; }
+
+ private:
+  void AddBytes(const unsigned char* bytes, std::size_t n) {
+    for (std::size_t i = 0; i < n; ++i) hash_ = (hash_ ^ bytes[i]) * 0x100000001B3ULL;
+  }
+  std::uint64_t hash_ = 0xCBF29CE484222325ULL;
+};
+
+TEST(RandomStreams, FixedSeedsGiveTheRecordedDraws) {
+  // The generators are evaluated with shortcuts that must not change a single decision: each
+  // row hashes 20000 draws, through a caller's source and through the thread's own stream,
+  // against the hash recorded from the plain evaluation of the methods.
+  struct Row {
+    const char* name;
+    std::function<void(StreamHash&, TRandomGenFunction)> draw;
+    std::function<void(StreamHash&)> drawOwn;
+    std::uint64_t withSource;
+    std::uint64_t withoutSource;
+  };
+  const std::vector<Row> rows = {
+      {"Normal", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Normal(g)); },
+       [](StreamHash& h) { h.Add(Random_Normal()); }, 0xC2613C5A7626F554ULL, 0xE58B31373893FCCULL},
+      {"Exponential", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Exponential(g)); },
+       [](StreamHash& h) { h.Add(Random_Exponential()); }, 0x812F68D58DCEB87ULL,
+       0x80FC6416F81A1A12ULL},
+      {"Gamma_5", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Gamma(5, g)); },
+       [](StreamHash& h) { h.Add(Random_Gamma(5)); }, 0xBC98F655F235FFBBULL, 0x25F504E6AB77C72ULL},
+      {"Gamma_2_5", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Gamma(2.5L, g)); },
+       [](StreamHash& h) { h.Add(Random_Gamma(2.5L)); }, 0xAB47C815F4EB25D5ULL,
+       0xD3F667094552BFEULL},
+      {"Gamma_0_5", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Gamma(0.5L, g)); },
+       [](StreamHash& h) { h.Add(Random_Gamma(0.5L)); }, 0x6F1ECAEE6CF6C11DULL,
+       0x9C891ED8A23097CCULL},
+      {"Gamma_0_3", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Gamma(0.3L, g)); },
+       [](StreamHash& h) { h.Add(Random_Gamma(0.3L)); }, 0x95E9C5A2A2BE70D7ULL,
+       0xB59F9418A6E9AC0BULL},
+      {"Binomial2_1000_0_3",
+       [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Binomial2(1000, 0.3L, g)); },
+       [](StreamHash& h) { h.Add(Random_Binomial2(1000, 0.3L)); }, 0xCE1CC84225D3A83CULL,
+       0xE0BE97114E21444AULL},
+      {"Binomial2_20_0_3",
+       [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Binomial2(20, 0.3L, g)); },
+       [](StreamHash& h) { h.Add(Random_Binomial2(20, 0.3L)); }, 0xBDB9D402795CCC21ULL,
+       0x329F919F09C92B03ULL},
+      {"Binomial2_100000_0_6",
+       [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Binomial2(100000, 0.6L, g)); },
+       [](StreamHash& h) { h.Add(Random_Binomial2(100000, 0.6L)); }, 0xCDC59516ACE941F4ULL,
+       0x645B5781DBC79630ULL},
+      {"Poisson_100",
+       [](StreamHash& h, TRandomGenFunction g) {
+         Extended mu = 100;
+         h.Add(Random_Poisson(mu, g));
+       },
+       [](StreamHash& h) {
+         Extended mu = 100;
+         h.Add(Random_Poisson(mu));
+       },
+       0x1A789606E9D90A19ULL, 0x94CEF0893552773FULL},
+      {"Poisson_12_5",
+       [](StreamHash& h, TRandomGenFunction g) {
+         Extended mu = 12.5L;
+         h.Add(Random_Poisson(mu, g));
+       },
+       [](StreamHash& h) {
+         Extended mu = 12.5L;
+         h.Add(Random_Poisson(mu));
+       },
+       0x7321250B33791A32ULL, 0x78D834214F0DCB22ULL},
+  };
+  for (const Row& row : rows) {
+    EngineSource engine(2026);
+    StreamHash withSource;
+    for (int i = 0; i < 20000; ++i) row.draw(withSource, engine);
+    SetRandSeed(2026);
+    StreamHash withoutSource;
+    for (int i = 0; i < 20000; ++i) row.drawOwn(withoutSource);
+    EXPECT_EQ(withSource.Value(), row.withSource)
+        << row.name << std::hex << " 0x" << withSource.Value();
+    EXPECT_EQ(withoutSource.Value(), row.withoutSource)
+        << row.name << std::hex << " 0x" << withoutSource.Value();
   }
 }
 
@@ -913,12 +1045,11 @@ TEST(RandomDistribution, BetaAndT) {
   CheckContinuous("Beta_0_5_0_7", [&] { return Random_Beta(0.5L, 0.7L, engine); });
   CheckContinuous("Beta_3_0_4", [] { return Random_Beta(3, 0.4L); });
   CheckContinuous("Beta_0_2_5", [&] { return Random_Beta(0.2L, 5, engine); });
-  // For DF = 1 and 2 the quick rejection bound c / (x^2 + 3) lies under the ratio-of-uniforms
-  // boundary (1 + x^2/n)^e, touching it at x^2 = 1, so it alone shapes the accepted region:
-  // those variates follow (x^2 + 3)^-2, Student's t with 3 degrees of freedom. (The method is
-  // kept as it stands; the tables T_1 and T_2 hold the true Student quantiles.)
-  CheckContinuous("T_3", [] { return Random_T(1); });
-  CheckContinuous("T_3", [&] { return Random_T(2, engine); });
+  // DF 1 and 2 are decided by the exact test alone (the quick rejection would cut their tails):
+  // DF = 1 is the standard Cauchy.
+  CheckContinuous("T_1", [] { return Random_T(1); });
+  CheckContinuous("Cauchy", [&] { return Random_T(1, engine); });
+  CheckContinuous("T_2", [&] { return Random_T(2, engine); });
   CheckContinuous("T_3", [] { return Random_T(3); });
   CheckContinuous("T_10", [&] { return Random_T(10, engine); });
   CheckContinuous("Cauchy", [] { return Random_Cauchy(); });
