@@ -116,6 +116,111 @@ Extended BisectProbability(Extended P, Extended Low, Extended High, Less less) {
   return mid;
 }
 
+// The same bisection for the t distribution, with the same midpoints and decisions, most of
+// them settled without evaluating StudentTLess.
+//
+// For each end of the bracket whose value has been established, an interval [lo, hi] holding
+// the exact distribution function F there is kept. On a bracket of one sign the density f is
+// monotone, so for a midpoint m beside an established end x
+//   F(m) = F(x) + integral of f from x to m  lies within  F(x) + (m - x) [min f, max f],
+// the extremes of f on [x, m] being its values at x and m. f is evaluated in double; its
+// relative error is below 1.2e-15 |E| + 2.3e-16 (|ln scale| + 1) for the exponent
+// E = -(n + 1)/2 log1p(t^2 / n) (the argument, the logarithm, the product and exp, each within
+// 2 units in the last place, and the scale from the 80-bit gamma ratio), here bounded by
+// 2e-15 (|E| + |ln scale| + 1).
+// StudentTLess(m) itself differs from F(m) by at most
+//   Err(m) = 2e-16 Fside + max f 4 u (n + m^2) / (2 |m|) + 1e-18,
+// twice the documented error of IncompleteBeta (1e-16 relative to the two-sided tail 2 Fside,
+// Fside = min(F, 1 - F)), plus what the rounding of its argument n / (n + m^2) by 3 units
+// u = 2^-64 moves F, plus the rounding of the final sums. When the interval for F(m), widened
+// by Err(m), lies beyond P + 1e-16 or below P - 1e-16 (with a margin for this function's own
+// rounding), the evaluation could neither stop the search nor decide the other way, and the
+// midpoint is settled without it. Otherwise StudentTLess(m) is evaluated and decides as in
+// BisectProbability; its value, widened by Err(m), becomes the interval at m.
+Extended BisectStudentT(Extended P, Extended Low, Extended High, LongWord DF) {
+  const auto less = [DF](Extended t) { return StudentTLess(t, DF); };
+  if (!(Low > 0 || High < 0) || !std::isfinite(Low) || !std::isfinite(High)) {
+    return BisectProbability(P, Low, High, less);
+  }
+  const Extended n = DF;
+  const double nD = static_cast<double>(DF);
+  const double halfN1 = (nD + 1) / 2;  // exact: DF < 2^32
+  const double logScale =
+      static_cast<double>(std::log(HalfStepGammaRatio(n / 2) / std::sqrt(n * QENPi)));
+  const double scaleError = 2e-15 * (std::fabs(logScale) + 1);
+  // 4 u (n + m^2) / (2 |m|) for every m of the bracket.
+  const Extended inner = std::fabs(Low) < std::fabs(High) ? std::fabs(Low) : std::fabs(High);
+  const Extended outer = std::fabs(Low) < std::fabs(High) ? std::fabs(High) : std::fabs(Low);
+  const Extended argumentFactor = 0x1p-62L * (n + outer * outer) / (2 * inner);
+  constexpr Extended kMargin = 1.01e-16L;
+
+  struct End {
+    Extended x;
+    Extended lo, hi;      // the exact F(x) lies within
+    Extended fDown, fUp;  // and f(x) within; fUp = 0 when unknown
+  };
+  // The density's bounds at t; both 0 where the double evaluation could lose range.
+  const auto density = [&](Extended t, Extended& down, Extended& up) {
+    const double td = static_cast<double>(t);
+    const double e = -halfN1 * std::log1p(td * td / nD);
+    const double exponent = logScale + e;
+    if (!(exponent > -700 && exponent < 700)) {
+      down = up = 0;
+      return;
+    }
+    const double f = std::exp(exponent);
+    const double error = 2e-15 * std::fabs(e) + scaleError;
+    down = f - f * error;
+    up = f + f * error;
+  };
+  const auto evaluationError = [&](Extended m, Extended lo, Extended hi, Extended fUp) {
+    const Extended side = m < 0 ? hi : 1 - lo;
+    return 2e-16L * (side > 0 ? side : 0) + fUp * argumentFactor + 1e-18L;
+  };
+
+  End low{Low, 0, 1, 0, 0};
+  End high{High, 0, 1, 0, 0};
+  Extended mid = (Low + High) / 2;
+  for (int round = 0; round < 100; ++round) {
+    mid = (low.x + high.x) / 2;
+    Extended fDown, fUp;
+    density(mid, fDown, fUp);
+    // The established end with the narrower interval (both lie half the bracket away).
+    const End* end = nullptr;
+    if (low.fUp > 0) end = &low;
+    if (high.fUp > 0 && (end == nullptr || high.hi - high.lo < end->hi - end->lo)) end = &high;
+    if (fUp > 0 && end != nullptr) {
+      const Extended fLow = fDown < end->fDown ? fDown : end->fDown;
+      const Extended fHigh = fUp > end->fUp ? fUp : end->fUp;
+      const Extended delta = mid - end->x;  // exact: both lie within a factor 1.25
+      const Extended lo0 = end->lo + delta * (delta >= 0 ? fLow : fHigh);
+      const Extended hi0 = end->hi + delta * (delta >= 0 ? fHigh : fLow);
+      const Extended pad = 0x1p-60L * (std::fabs(end->hi) + std::fabs(delta) * fHigh);
+      const Extended lo = lo0 - pad;
+      const Extended hi = hi0 + pad;
+      const Extended err = evaluationError(mid, lo, hi, fHigh);
+      if ((lo - err) - P > kMargin) {
+        high = End{mid, lo, hi, fDown, fUp};
+        continue;
+      }
+      if (P - (hi + err) > kMargin) {
+        low = End{mid, lo, hi, fDown, fUp};
+        continue;
+      }
+    }
+    const Extended value = less(mid);
+    if (std::fabs(value - P) < 1e-16L) break;
+    const Extended err = evaluationError(mid, value, value, fUp);
+    const End here{mid, value - err, value + err, fDown, fUp};
+    if (value > P) {
+      high = here;
+    } else {
+      low = here;
+    }
+  }
+  return mid;
+}
+
 // --- AS 241 -----------------------------------------------------------------------------------
 
 template <std::size_t N>
@@ -639,8 +744,7 @@ Extended InvStudentTLess(Extended P, LongWord DF) {
   if (P == 1) return kInf;
   const Extended g = P <= 0.5L ? -StudentTStart(P, DF) : StudentTStart(1 - P, DF);
   const Extended end1 = g - g / 10, end2 = g + g / 10;
-  return BisectProbability(P, MinXY(end1, end2), MaxXY(end1, end2),
-                           [DF](Extended t) { return StudentTLess(t, DF); });
+  return BisectStudentT(P, MinXY(end1, end2), MaxXY(end1, end2), DF);
 }
 
 Extended InvStudentTGreater(Extended P, LongWord DF) {
