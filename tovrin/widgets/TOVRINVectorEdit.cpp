@@ -36,19 +36,23 @@ class VectorEditModel : public GridModel {
   }
 
   void SetLabels(const QStringList& Labels) {
-    for (std::size_t row = 0; row < labels_.size(); ++row)
+    for (std::size_t row = 0; row < labels_.size(); ++row) {
+      const auto given = static_cast<qsizetype>(row);
+      // An empty entry is an empty label; only rows past the list have none.
       labels_[row] =
-          row < static_cast<std::size_t>(Labels.size())
-              ? (Labels[static_cast<qsizetype>(row)].isNull() ? QString("")
-                                                              : Labels[static_cast<qsizetype>(row)])
-              : QString();
+          given < Labels.size() ? QString(Labels[given].isNull() ? "" : Labels[given]) : QString();
+    }
     if (labelled_ && Count() > 0) emit dataChanged(index(0, 0), index(Count() - 1, 0));
   }
 
   void ReplaceValues(const TQENFloatVector& V) {
+    // Everything is allocated before the views are told, so a failure leaves them consistent.
+    TQENFloatVector values = V;
+    std::vector<bool> null(values.size(), false);
+    labels_.reserve(values.size());
     beginResetModel();
-    values_ = V;
-    null_.assign(values_.size(), false);
+    values_ = std::move(values);
+    null_ = std::move(null);
     nullCount_ = 0;
     labels_.resize(values_.size());
     endResetModel();
@@ -240,7 +244,9 @@ TQENVectorEdit::TQENVectorEdit(bool Labelled, QWidget* parent)
 TQENVectorEdit::~TQENVectorEdit() = default;
 
 TQENFloatVector TQENVectorEdit::Vector() const { return model_->Values(); }
-void TQENVectorEdit::SetVector(const TQENFloatVector& V) { model_->ReplaceValues(V); }
+void TQENVectorEdit::SetVector(const TQENFloatVector& V) {
+  Guard([&] { model_->ReplaceValues(V); });
+}
 int TQENVectorEdit::Count() const { return model_->Count(); }
 
 void TQENVectorEdit::SetCount(int N) {

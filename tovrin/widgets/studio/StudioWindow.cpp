@@ -12,11 +12,10 @@ namespace tovrin {
 
 namespace {
 
-// Sample rows of a small shop's monthly sales, and a matrix whose row reduction is all
-// fractions.
+// Sample rows of a small shop's monthly sales, and a matrix of fractions (determinant 64/3).
 const TQENFloatVector kSales{412.5L, 398.0L, 455.25L, 431.0L, 502.75L, 478.5L, 466.0L, 521.25L};
 const QStringList kMonths{"Jan", "Feb", "Mar", "Apr", "May", "Jun", "Jul", "Aug"};
-const TQENFloatMatrix kMatrix{{2, 1, 1}, {4, 3, 3}, {8, 7, 9}};
+const TQENFloatMatrix kMatrix{{2, 0.5L, 1}, {1.0L / 3, 3, 2}, {1, 0, 4}};
 
 // The determinant as markup: a whole number, a fraction or a decimal.
 QString ValueMarkup(Extended value) {
@@ -44,8 +43,9 @@ StudioWindow::StudioWindow(QWidget* parent) : QWidget(parent) {
   report_ = new QPlainTextEdit;
   report_->setReadOnly(true);
   report_->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont));
-  report_->setTabStopDistance(report_->fontMetrics().horizontalAdvance(QString(22, 'x')));
+  report_->setTabStopDistance(report_->fontMetrics().horizontalAdvance(QString(28, 'x')));
   report_->setAccessibleName(tr("Statistics report"));
+  report_->setMinimumHeight(report_->fontMetrics().lineSpacing() * 22);
   auto* vectorButtons = new QHBoxLayout;
   const std::pair<QString, std::function<bool()>> vectorCommands[] = {
       {tr("Sort"), [this] { return vector_->Sort(); }},

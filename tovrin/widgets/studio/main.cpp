@@ -29,7 +29,7 @@ int main(int argc, char** argv) {
     window.show();
     return QApplication::exec();
   }
-  window.resize(window.sizeHint());
+  window.resize(window.sizeHint().expandedTo(QSize(820, 600)));
   window.show();
   QApplication::processEvents();
   if (!window.grab().save(QString::fromLocal8Bit(screenshot), "PNG")) {
