@@ -1,7 +1,7 @@
-// The number reader of the tovrin program (tools/NumberReader.cpp, compiled in here since the
-// program is not a library). ParseNumber either gives a finite value or nothing, and agrees
-// with Str2Float on every token both accept (both round correctly); the scanner hands over
-// tokens without separators, and ReadNumbers and ReadPairs return or raise InputError only.
+// The number reader of the tovrin program (the tovrin_cli_input library). ParseNumber either gives
+// a finite value or nothing, and agrees with Str2Float on every token both accept (both round
+// correctly); the scanner hands over tokens without separators, and ReadNumbers and ReadPairs
+// return or raise InputError only.
 #include <sys/mman.h>
 #include <unistd.h>
 
@@ -12,7 +12,10 @@
 #include <string_view>
 #include <vector>
 
-#include "tools/NumberReader.cpp"  // NOLINT(bugprone-suspicious-include)
+#include "tools/CommandLine.h"
+#include "tools/NumberReader.h"
+#include "tovrin/foundation/TOVRINConvert.h"
+#include "tovrin/foundation/TOVRINErrors.h"
 
 namespace {
 

@@ -1,11 +1,13 @@
 #!/usr/bin/env bash
-# Builds the libFuzzer targets with clang (address and undefined-behaviour sanitizers) and runs
-# each for a bounded time, adding what it finds to fuzz/corpus/<target>/.
+# Builds the libFuzzer targets with clang (address and undefined-behaviour sanitizers), runs
+# each for a bounded time from its seed corpus, then replaces fuzz/corpus/<target>/ by a fresh
+# minimal seed set of the old seeds and this run's new inputs (the corpus never only grows).
 #   bash fuzz/run.sh [seconds per target, default 60] [target ...]
 set -euo pipefail
 cd "$(dirname "$0")/.."
 seconds=${1:-60}
 shift || true
+bash scripts/setup-clang.sh
 build=build/fuzz
 CXX=clang++ cmake -S . -B $build -DCMAKE_BUILD_TYPE=RelWithDebInfo -DTOVRIN_BUILD_FUZZERS=ON \
   -DTOVRIN_BUILD_TESTS=OFF -DTOVRIN_BUILD_BENCHMARKS=OFF -DTOVRIN_BUILD_TOOLS=OFF \
@@ -18,21 +20,28 @@ if [ ${#targets[@]} -eq 0 ]; then
   for f in fuzz/*_fuzz.cpp; do targets+=("$(basename "$f" _fuzz.cpp)"); done
 fi
 for t in "${targets[@]}"; do
-  cmake --build $build --target "${t}_fuzz" -j2
+  cmake --build $build --target "${t}_fuzz" "${t}_fuzz_seeds" -j2
   mkdir -p "fuzz/corpus/$t"
   work=$(mktemp -d)
   # -fork keeps fuzzing after a finding (crash, leak or 1 s time-out), whose input lands in
-  # $findings/<target>-*; the corpus is merged whatever happened.
+  # $findings/<target>-*; new inputs land in $work whatever happened.
   "$build/${t}_fuzz" -fork=1 -ignore_crashes=1 -ignore_timeouts=1 -ignore_ooms=1 \
     -max_total_time="$seconds" -timeout=1 -rss_limit_mb=2048 \
     -artifact_prefix="$findings/${t}-" "$work" "fuzz/corpus/$t" || true
-  # Keep a minimal set of the inputs that reached new code.
-  "$build/${t}_fuzz" -merge=1 "fuzz/corpus/$t" "$work" >/dev/null 2>&1 || true
-  rm -rf "$work"
+  # First libFuzzer's merge into an empty folder (inputs that crash or hang are left out), then
+  # the fewest of those that still reach every edge (see fuzz/seeds_main.cpp).
+  merged=$(mktemp -d)
+  "$build/${t}_fuzz" -merge=1 -timeout=1 -rss_limit_mb=2048 "$merged" \
+    "fuzz/corpus/$t" "$work" >/dev/null 2>&1 || true
+  seeds=$(mktemp -d)
+  "$build/${t}_fuzz_seeds" "fuzz/corpus/$t" "$merged" | xargs -r cp -t "$seeds"
+  rm -rf "fuzz/corpus/$t" "$work" "$merged"
+  mv "$seeds" "fuzz/corpus/$t"
+  chmod 755 "fuzz/corpus/$t"
 done
 if [ -n "$(ls -A "$findings")" ]; then
   ls "$findings"/*
-  echo "findings above (in $findings): reduce each, fix, then keep the input in fuzz/corpus/<target>/"
+  echo "findings above (in $findings): reduce each, fix, then keep the input as fuzz/findings/<target>-<what>"
   exit 1
 fi
 echo "no findings"

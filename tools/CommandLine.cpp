@@ -31,6 +31,11 @@ Arguments::Arguments(std::span<const std::string> Words,
     if (const auto eq = word.find('='); eq != std::string::npos && word.starts_with("--")) {
       name = word.substr(0, eq);
       inline_value = word.substr(eq + 1);
+    } else if (word[1] != '-' && word.size() > 2 &&
+               std::find(ValueOptions.begin(), ValueOptions.end(), word.substr(0, 2)) !=
+                   ValueOptions.end()) {
+      name = word.substr(0, 2);  // "-t," is "-t ,"
+      inline_value = word.substr(2);
     }
     if (std::find(FlagOptions.begin(), FlagOptions.end(), name) != FlagOptions.end()) {
       if (inline_value) throw UsageError("option " + name + " takes no value");
@@ -103,12 +108,12 @@ Byte ParseDecimals(const Arguments& Args) {
   return static_cast<Byte>(ParseUnsignedArgument(*text, "--decimals", 20));
 }
 
-std::string FormatSignificant(Extended X) {
+std::string FormatSignificant(Extended X, int Digits) {
   if (std::isnan(X)) return "NAN";
   if (std::isinf(X)) return X > 0 ? "INF" : "-INF";
   char buffer[64];
   const auto [end, ec] =
-      std::to_chars(buffer, buffer + sizeof buffer, X, std::chars_format::general, 21);
+      std::to_chars(buffer, buffer + sizeof buffer, X, std::chars_format::general, Digits);
   return std::string(buffer, ec == std::errc() ? end : buffer);
 }
 

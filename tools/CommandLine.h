@@ -33,7 +33,8 @@ class InputError : public std::runtime_error {
 
 // The arguments of one subcommand, split into options and operands. Every word that starts
 // with '-' and is not a number (and not "-" alone, which names standard input) is an option.
-// Options that take a value take the next word, whatever it is.
+// Options that take a value take the next word, whatever it is, or the text after '=' of a
+// long option ("--decimals=2") or after the letter of a short one ("-t,").
 class Arguments {
  public:
   // ValueOptions are the options that take a value, FlagOptions those that do not. "--help"
@@ -65,9 +66,9 @@ std::int64_t ParseSignedArgument(std::string_view Text, std::string_view What, s
 // The --decimals option: 0 to 20, 4 when absent.
 Byte ParseDecimals(const Arguments& Args);
 
-// Output of real results: 21 significant digits (general notation, trailing zeros dropped),
-// and the shortest text that reads back to the same Extended (for JSON).
-std::string FormatSignificant(Extended X);
+// Output of real results: 21 significant digits, or Digits (general notation, trailing zeros
+// dropped), and the shortest text that reads back to the same Extended (for JSON).
+std::string FormatSignificant(Extended X, int Digits = 21);
 std::string FormatShortest(Extended X);
 
 }  // namespace tovrin::cli

@@ -32,14 +32,6 @@ const std::array<Extended, kExactPowers + 1>& PowersOfTen() {
   return powers;
 }
 
-std::string Quoted(std::string_view Token) {
-  constexpr std::size_t kShown = 60;
-  std::string text = "'";
-  text.append(Token.substr(0, kShown));
-  if (Token.size() > kShown) text += "...";
-  return text + "'";
-}
-
 }  // namespace
 
 std::optional<Extended> ParseNumber(std::string_view Token) {
@@ -104,6 +96,14 @@ std::optional<Extended> ParseNumber(std::string_view Token) {
 }
 
 std::string SourceName(const std::string& Source) { return Source == "-" ? "<stdin>" : Source; }
+
+std::string QuotedToken(std::string_view Token) {
+  constexpr std::size_t kShown = 60;
+  std::string text = "'";
+  text.append(Token.substr(0, kShown));
+  if (Token.size() > kShown) text += "...";
+  return text + "'";
+}
 
 void ScanTokens(const std::string& Source,
                 const std::function<void(std::string_view, std::size_t)>& OnToken,
@@ -191,7 +191,7 @@ namespace {
 
 [[noreturn]] void NotANumber(const std::string& Source, std::size_t Line, std::string_view Token) {
   throw InputError(SourceName(Source) + ":" + std::to_string(Line) +
-                   ": not a number: " + Quoted(Token));
+                   ": not a number: " + QuotedToken(Token));
 }
 
 // Values gathered in fixed blocks, so that collecting n values never holds more than n plus
@@ -235,12 +235,18 @@ std::vector<std::string> SourcesOrStdin(const std::vector<std::string>& Sources)
 
 }  // namespace
 
-TQENFloatVector ReadNumbers(const std::vector<std::string>& Sources) {
+TQENFloatVector ReadNumbers(const std::vector<std::string>& Sources,
+                            const std::function<bool(std::string_view)>& IsMissing,
+                            std::size_t* Missing) {
   BlockList values;
   for (const std::string& source : SourcesOrStdin(Sources)) {
     ScanTokens(
         source,
         [&](std::string_view token, std::size_t line) {
+          if (IsMissing && IsMissing(token)) {
+            ++*Missing;
+            return;
+          }
           const std::optional<Extended> value = ParseNumber(token);
           if (!value) NotANumber(source, line, token);
           values.Add(*value);
@@ -261,7 +267,7 @@ void ReadPairs(const std::vector<std::string>& Sources, TQENFloatVector& X, TQEN
           if (!value) NotANumber(source, line, token);
           if (on_line == 2) {
             throw InputError(SourceName(source) + ":" + std::to_string(line) +
-                             ": more than two numbers on a line: " + Quoted(token));
+                             ": more than two numbers on a line: " + QuotedToken(token));
           }
           (on_line++ == 0 ? xs : ys).push_back(*value);
         },

@@ -32,10 +32,16 @@ void ScanTokens(const std::string& Source,
 // The name of a source in messages: "<stdin>" for "-".
 std::string SourceName(const std::string& Source);
 
+// A token in messages: in single quotes, cut after 60 characters.
+std::string QuotedToken(std::string_view Token);
+
 // Every number of the sources, in order (standard input when Sources is empty), into one
 // vector of exactly the right length. The numbers are gathered in blocks first, so the
-// vector never grows by copying.
-TQENFloatVector ReadNumbers(const std::vector<std::string>& Sources);
+// vector never grows by copying. When IsMissing is given, the tokens it accepts are skipped
+// and counted in Missing.
+TQENFloatVector ReadNumbers(const std::vector<std::string>& Sources,
+                            const std::function<bool(std::string_view)>& IsMissing = nullptr,
+                            std::size_t* Missing = nullptr);
 
 // Pairs "x y", two numbers per line, from the sources (standard input when none).
 void ReadPairs(const std::vector<std::string>& Sources, TQENFloatVector& X, TQENFloatVector& Y);

@@ -6,6 +6,7 @@
 #include "tools/CommandLine.h"
 #include "tools/NumberReader.h"
 #include "tools/Subcommands.h"
+#include "tools/Table.h"
 #include "tovrin/statistics/TOVRINPairStats.h"
 #include "tovrin/statistics/TOVRINStatistics_Sample.h"
 #include "tovrin/statistics/TOVRIN_RS_DescStats.h"
@@ -14,7 +15,7 @@ namespace tovrin::cli {
 namespace {
 
 constexpr std::string_view kHelp =
-    "Usage: tovrin regress [--decimals N] [FILE...]\n"
+    "Usage: tovrin regress [--decimals N] [TABLE OPTION...] [FILE...]\n"
     "\n"
     "Reads pairs 'x y', two numbers per line, from the FILEs (standard input when none is\n"
     "named, or for '-') and prints the paired-data report: number of pairs, mean and\n"
@@ -23,9 +24,20 @@ constexpr std::string_view kHelp =
     "and the least-squares parabola y = a + b x + c x^2. Standard deviations and the\n"
     "covariance divide by n - 1, so at least two pairs are needed.\n"
     "\n"
+    "\n"
+    "Tables: with -t C (fields separated by the character C, quoted with \" as in CSV) or\n"
+    "-W (runs of blanks), -H (the first line names the fields) and -f X,Y (the two fields,\n"
+    "by number from 1 or by name; default 1,2), X and Y come from those fields of every line.\n"
+    "A line where either is missing (--na LIST, default 'NA,NaN,') is skipped and counted.\n"
+    "\n"
     "Options:\n"
-    "  --decimals N   decimal places, 0 to 20 (default 4)\n"
-    "  --help         show this help\n";
+    "  -t C, --delimiter C   fields are separated by the character C ('tab' for TAB)\n"
+    "  -W, --whitespace      fields are separated by runs of blanks\n"
+    "  -H, --header          the first line names the fields\n"
+    "  -f X,Y, --field X,Y   the fields of x and of y\n"
+    "  --na LIST             field texts that mean a missing value\n"
+    "  --decimals N          decimal places, 0 to 20 (default 4)\n"
+    "  --help                show this help\n";
 
 // A signed term of a polynomial as text: " + 2.0000x" or " - 2.0000x".
 std::string Term(Extended Coefficient, Byte Decimals, const char* Power) {
@@ -37,16 +49,48 @@ std::string Term(Extended Coefficient, Byte Decimals, const char* Power) {
 }  // namespace
 
 int RunRegress(std::span<const std::string> Words) {
-  static constexpr std::array<std::string_view, 0> kFlags{};
-  static constexpr std::array<std::string_view, 1> kValues{"--decimals"};
-  const Arguments args(Words, kFlags, kValues);
+  const std::vector<std::string_view> flags(std::begin(kTableFlags), std::end(kTableFlags));
+  std::vector<std::string_view> values{"--decimals"};
+  values.insert(values.end(), std::begin(kTableValues), std::end(kTableValues));
+  const Arguments args(Words, flags, values);
   if (args.Help()) {
     WriteOut(std::string(kHelp));
     return kExitOk;
   }
   const Byte decimals = ParseDecimals(args);
+  if (args.Value("-g") || args.Value("--group")) {
+    throw UsageError("-g/--group: regress has no groups");
+  }
   TQENFloatVector x, y;
-  ReadPairs(args.Operands(), x, y);
+  std::size_t skipped = 0;
+  if (const std::optional<TableOptions> table = ReadTableOptions(args, "1,2")) {
+    const MissingTexts missing(args.Value("--na").value_or("NA,NaN,"));
+    std::vector<TableField> fields;
+    ScanTable(
+        args.Operands(), *table,
+        [&](const std::vector<std::string>& names, std::size_t count) {
+          fields = ResolveFields(table->fields, "-f/--field", names, count);
+          if (fields.size() != 2) {
+            throw UsageError("-f/--field: regress takes two fields, x and y, not '" +
+                             table->fields + "'");
+          }
+        },
+        [&](const RecordReader& reader) {
+          const std::optional<Extended> vx =
+              FieldValue(reader, fields[0], FieldOf(reader, fields[0]), missing);
+          const std::optional<Extended> vy =
+              FieldValue(reader, fields[1], FieldOf(reader, fields[1]), missing);
+          if (vx && vy) {
+            x.push_back(*vx);
+            y.push_back(*vy);
+          } else {
+            ++skipped;
+          }
+        });
+  } else {
+    if (args.Value("--na")) throw UsageError("--na applies to tables (with -t, -W or -f)");
+    ReadPairs(args.Operands(), x, y);
+  }
   if (x.size() < 2) {
     throw InputError("regress needs at least two pairs, got " + std::to_string(x.size()));
   }
@@ -66,6 +110,7 @@ int RunRegress(std::span<const std::string> Words) {
   };
   const auto number = [&](Extended X) { return Float2EStr(X, decimals); };
   std::string text = "Number of Pairs:\t" + std::to_string(n) + "\n";
+  if (skipped > 0) text += "Lines Skipped (missing values):\t" + std::to_string(skipped) + "\n";
   text += line(rsDSMeanX, number(mean_x));
   text += line(rsDSStdDevX, number(sd_x));
   text += line(rsDSMeanY, number(mean_y));

@@ -254,6 +254,147 @@ run 2 describe --json=1 "$DATA"
 run 2 describe --frobnicate "$DATA"
 expect_err "unknown option --frobnicate"
 
+# --- describe: tables --------------------------------------------------------------------------
+# A CSV with a header, a quoted name holding the delimiter, a quoted header name, doubled
+# quotes, missing values (NA, NaN and the empty field) and a CRLF line end. Exact values:
+# temp 4, 16, 6, 19, 18, 2: sum 65, sum of squares 997, mean 65/6, variance (997 - 65^2/6)/5
+# = 1757/30 = 58.5666...; rain 800, 700, 10 (three missing): mean 1510/3, variance 555100/3.
+# By city: Oslo temp 4, 6, 2 (mean 4, variance 4), Rome 16, 18 (mean 17, variance 2, rain all
+# missing), "Lima, Peru" 19 (one value: no variance).
+printf 'city,temp,rain,"note, free"\nOslo,4,800,"cold, wet"\r\nRome,16,NA,warm\n\nOslo,6,700,"say ""hi"""\n"Lima, Peru",19,10,x\nRome,18,,y\nOslo,2,NaN,z\n' >"$WORK/cities.csv"
+run 0 describe -t , -H -f temp "$WORK/cities.csv"
+expect_line "Number of Values:${TAB}6"
+expect_line "Sum:${TAB}65.0000"
+expect_line "Sum of Squares:${TAB}997.0000"
+expect_line "Mean:${TAB}10.8333"
+expect_line "Variance:${TAB}58.5667"
+checks=$((checks + 1))
+grep -q "Missing" "$WORK/out" && fail "a field without missing values reports them"
+run 0 describe -t, --header --field 3 "$WORK/cities.csv"
+expect_line "Number of Values:${TAB}3"
+expect_line "Missing Values:${TAB}3"
+expect_line "Mean:${TAB}503.3333"
+expect_line "Variance:${TAB}185033.3333"
+# Groups in order of first appearance, the quoted name whole, NA where undefined.
+run 0 describe -t , -H -g city -f temp "$WORK/cities.csv"
+expect_line "Statistic${TAB}Oslo${TAB}Rome${TAB}Lima, Peru"
+expect_line "Number of Values:${TAB}3${TAB}2${TAB}1"
+expect_line "Mean:${TAB}4.0000${TAB}17.0000${TAB}19.0000"
+expect_line "Variance:${TAB}4.0000${TAB}2.0000${TAB}NA"
+expect_line "Mode:${TAB}NA${TAB}NA${TAB}19.0000"
+# Several fields by group; Rome's rain is all missing.
+run 0 describe -t , -H -g 1 -f temp,rain --decimals 1 "$WORK/cities.csv"
+expect_line "Statistic${TAB}Oslo:temp${TAB}Oslo:rain${TAB}Rome:temp${TAB}Rome:rain${TAB}Lima, Peru:temp${TAB}Lima, Peru:rain"
+expect_line "Number of Values:${TAB}3${TAB}2${TAB}2${TAB}0${TAB}1${TAB}1"
+expect_line "Missing Values:${TAB}0${TAB}1${TAB}0${TAB}2${TAB}0${TAB}0"
+expect_line "Mean:${TAB}4.0${TAB}750.0${TAB}17.0${TAB}NA${TAB}19.0${TAB}10.0"
+# Several fields without groups, by range.
+run 0 describe -t , -H -f 2-3 "$WORK/cities.csv"
+expect_line "Statistic${TAB}temp${TAB}rain"
+expect_line "Sum:${TAB}65.0000${TAB}1510.0000"
+# --stats: a TSV table at full precision; --decimals rounds it.
+run 0 describe -t , -H -g city -f temp --stats Mean,Variance,Missing,NoOfValues "$WORK/cities.csv"
+expect_out "group${TAB}Mean${TAB}Variance${TAB}Missing${TAB}NoOfValues
+Oslo${TAB}4${TAB}4${TAB}0${TAB}3
+Rome${TAB}17${TAB}2${TAB}0${TAB}2
+Lima, Peru${TAB}19${TAB}NA${TAB}0${TAB}1"
+run 0 describe -t , -H -f temp,rain --stats Sum,Mean --decimals 2 "$WORK/cities.csv"
+expect_out "field${TAB}Sum${TAB}Mean
+temp${TAB}65.00${TAB}10.83
+rain${TAB}1510.00${TAB}503.33"
+run 2 describe -t , -H -f temp --stats Mean,Average "$WORK/cities.csv"
+expect_err "'Average'"
+# JSON: null for every undefined statistic, Missing counted, groups in order.
+run 0 describe -t , -H -g city -f rain --json "$WORK/cities.csv"
+checks=$((checks + 1))
+python3 - "$WORK/out" <<'PY' || fail "describe -g --json"
+import json, sys
+d = json.load(open(sys.argv[1]))
+assert list(d) == ["Oslo", "Rome", "Lima, Peru"], list(d)
+assert d["Oslo"]["NoOfValues"] == 2 and d["Oslo"]["Missing"] == 1 and d["Oslo"]["Mean"] == 750
+assert d["Oslo"]["Variance"] == 5000 and d["Oslo"]["Mode"] is None and d["Oslo"]["Skew"] is None
+rome = d["Rome"]
+assert rome["NoOfValues"] == 0 and rome["Missing"] == 2
+assert all(rome[k] is None for k in rome if k not in ("NoOfValues", "Missing")), rome
+lima = d["Lima, Peru"]
+assert lima["Mean"] == 10 and lima["Mode"] == 10 and lima["Variance"] is None
+assert lima["StdDev"] is None and lima["Kurtosis"] is None
+PY
+run 0 describe -t , -H -f temp,rain --json --stats Sum,Missing,Range "$WORK/cities.csv"
+expect_out '{"temp": {"Sum": 65, "Missing": 0, "Range": 17}, "rain": {"Sum": 1510, "Missing": 3, "Range": 790}}'
+# An all-missing field: the empty-list report and its missing count.
+printf 'a;b\n1;NA\n2;\n' >"$WORK/semi.csv"
+run 0 describe -t ';' -H -f b "$WORK/semi.csv"
+expect_out "Vector is empty
+Missing Values:${TAB}2"
+# --na replaces the missing texts; -W, TSV, several files each with a header.
+printf 'x y\n1 -\n 3   5\n' >"$WORK/ws.txt"
+run 0 describe -W -H -f y --na - "$WORK/ws.txt"
+expect_line "Number of Values:${TAB}1"
+expect_line "Missing Values:${TAB}1"
+printf 'v\tw\n1\t"a\tb"\n' >"$WORK/t1.tsv"
+printf 'v\tw\n5\tc\n' >"$WORK/t2.tsv"
+run 0 describe -t tab -H -f v "$WORK/t1.tsv" "$WORK/t2.tsv"
+expect_line "Number of Values:${TAB}2"
+expect_line "Sum:${TAB}6.0000"
+# A quoted field over two lines: the line numbers of later records stay right.
+printf 'n,t\n1,"two\nlines"\n2,x\nzz,y\n' >"$WORK/multi.csv"
+run 1 describe -t , -H -f n "$WORK/multi.csv"
+expect_no_out
+expect_err "multi.csv:5: field 'n': not a number: 'zz'"
+printf 'n\n1\n"2\n' >"$WORK/open.csv"
+run 1 describe -t , -H "$WORK/open.csv"
+expect_err "not closed"
+# Records cut by the ends of the 1 MiB read blocks, quoted fields among them, and a record
+# longer than a block: values i + 0.5 for i = 0 .. 149999 sum to 150000^2 / 2; the long
+# record is in a group of its own with a missing value.
+python3 - "$WORK/big.csv" <<'PY'
+import sys
+with open(sys.argv[1], "w") as f:
+    f.write("k,v\n")
+    for i in range(150000):
+        f.write('"k%d, ""q""",%d.5\n' % (i % 7, i) if i % 3 else "k%d,%d.5\r\n" % (i % 7, i))
+        if i == 70000:
+            f.write('"%s",NA\n' % ("long\n" * 300000))
+PY
+run 0 describe -t , -H -f v --decimals 1 "$WORK/big.csv"
+expect_line "Number of Values:${TAB}150000"
+expect_line "Missing Values:${TAB}1"
+expect_line "Sum:${TAB}11250000000.0"
+STDIN=$WORK/big.csv run 0 describe -t , -H -g k -f v --stats NoOfValues
+checks=$((checks + 1))
+[ "$(grep -c "$TAB" "$WORK/out")" -eq 16 ] || fail "expected 15 groups: $(head -c 300 "$WORK/out")"
+expect_line "k1${TAB}7143"
+expect_line "k1, \"q\"${TAB}14286"
+printf 'z,x\n' >>"$WORK/big.csv"
+run 1 describe -t , -H -f v "$WORK/big.csv"
+expect_err "big.csv:450003: field 'v': not a number: 'x'"
+# Bad values: nothing on stdout, the file, line, field and text on stderr.
+run 1 describe -t , -H -f 4 "$WORK/cities.csv"
+expect_no_out
+expect_err "cities.csv:2: field 'note, free': not a number: 'cold, wet'"
+printf '1,2\n3,x\n' >"$WORK/nohead.csv"
+STDIN=$WORK/nohead.csv run 1 describe -t, -f 2
+expect_no_out
+expect_err "<stdin>:2: field 2: not a number: 'x'"
+printf '1,2\n3\n' >"$WORK/short.csv"
+run 1 describe -t , -f 2 "$WORK/short.csv"
+expect_err "short.csv:2: no field 2"
+# Usage errors name the field or the option.
+run 2 describe -t , -H -f humidity "$WORK/cities.csv"
+expect_no_out
+expect_err "'humidity'"
+run 2 describe -t , -H -f 5 "$WORK/cities.csv"
+expect_err "field 5 does not exist"
+run 2 describe -t , -f temp "$WORK/nohead.csv"
+expect_err "-H/--header"
+run 2 describe -t , -H -g town "$WORK/cities.csv"
+expect_err "-g/--group: no field 'town'"
+run 2 describe -t ab "$WORK/cities.csv"
+expect_err "-t/--delimiter"
+run 2 describe -t , -W "$WORK/cities.csv"
+run 2 describe -t , -f 3-2 "$WORK/cities.csv"
+
 # --- regress -----------------------------------------------------------------------------------
 printf '0 1\n1 3\n\n2 5 # exact line\n' >"$WORK/pairs"
 run 0 regress "$WORK/pairs"
@@ -282,6 +423,16 @@ expect_err ":2: a pair needs two numbers"
 printf '0 1\n' >"$WORK/pair"
 run 1 regress "$WORK/pair"
 run 2 regress --population "$WORK/pairs"
+# A table: x and y by name, a line with a missing y skipped; y = 1 + 2x exactly.
+printf 'id,y,x\na,1,0\nb,NA,7\nc,3,1\nd,5,2\n' >"$WORK/pairs.csv"
+run 0 regress -t , -H -f x,y "$WORK/pairs.csv"
+expect_line "Number of Pairs:${TAB}3"
+expect_line "Lines Skipped (missing values):${TAB}1"
+expect_line "Regression Line:${TAB}y = 1.0000 + 2.0000x"
+run 2 regress -t , -H -f x "$WORK/pairs.csv"
+expect_err "two fields"
+run 1 regress -t , -H -f id,y "$WORK/pairs.csv"
+expect_err "field 'id': not a number: 'a'"
 
 # --- grouped -----------------------------------------------------------------------------------
 # Frequencies 1, 2, 1 over [0, 10), [10, 20), [20, 30): midpoints 5, 15, 25; mean 15;
@@ -377,13 +528,32 @@ expect_err "'abc'"
 run 2 eval ChiSquareLess 1 -2
 run 2 eval ChiSquareLess 1 2.5
 run 2 eval
+# The list: signature, then a description in one column.
 run 0 eval --list
-expect_line "NormalLess Z"
-expect_line "BinomialBetween P N R1 R2"
-expect_line "AreaTriangle A B C"
-expect_line "Gamma X"
+checks=$((checks + 1))
+grep -qE '^NormalLess Z +standard normal: P\(Z < z\)$' "$WORK/out" || fail "eval --list NormalLess"
+for signature in "BinomialBetween P N R1 R2" "AreaTriangle A B C" "Gamma X"; do
+  checks=$((checks + 1))
+  grep -qE "^$signature  +[a-z]" "$WORK/out" || fail "eval --list lacks '$signature' or its description"
+done
 checks=$((checks + 1))
 [ "$(wc -l <"$WORK/out")" -ge 150 ] || fail "eval --list lists only $(wc -l <"$WORK/out") functions"
+checks=$((checks + 1))
+awk '!/^[A-Za-z0-9_]+( [A-Za-z0-9:]+)*(\.\.\.)?  +[^ ]/ { print; bad = 1 } END { exit bad }' \
+  "$WORK/out" >"$WORK/undescribed" || fail "eval --list without descriptions: $(cat "$WORK/undescribed")"
+# --digits: significant digits of real results, the labelled lines too; integers as well.
+run 0 eval --digits 6 NormalLess 1.96
+expect_out "0.975002"
+run 0 eval --digits=3 GetCircleWithPoints 0 0 2 0 0 2
+expect_out "CX${TAB}1
+CY${TAB}1
+R${TAB}1.41"
+run 0 eval --digits 2 SameFloat 1 1
+expect_out "True"
+run 2 eval --digits 0 Gamma 2
+expect_err "--digits"
+run 2 eval --digits
+run 2 eval Gamma 2 --digits 3
 
 # --- random ------------------------------------------------------------------------------------
 run 0 random Random_Normal --count 5 --seed 42
@@ -427,8 +597,10 @@ run 2 random Random_Normal --count -1
 run 2 random Random_Normal --seed x
 run 2 random
 run 0 random --list
-expect_line "Random_Gamma Shape"
-expect_line "Random_Binomial2 N P"
+for signature in "Random_Gamma Shape" "Random_Binomial2 N P" "Random_Cauchy"; do
+  checks=$((checks + 1))
+  grep -qE "^$signature  +[a-z]" "$WORK/out" || fail "random --list lacks '$signature' or its description"
+done
 
 echo "$checks checks, $failures failures"
 [ "$failures" -eq 0 ]
