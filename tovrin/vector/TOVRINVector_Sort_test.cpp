@@ -9,9 +9,9 @@
 #include <string>
 #include <utility>
 
+#include "tovrin/detail/QuickSort.h"
 #include "tovrin/testing/TOVRIN_testing.h"
 #include "tovrin/vector/TOVRINVector.h"
-#include "tovrin/vector/detail/QuickSort.h"
 
 namespace tovrin {
 namespace {
