@@ -151,14 +151,6 @@ TYPED_TEST(MatrixAllTypes, ToFloatMatrixKeepsTheShapeAndTheValues) {
             static_cast<long double>(std::numeric_limits<V>::lowest()));
 }
 
-TEST(MatrixConversion, ExactValuesOfWideTypes) {
-  const TQENFloatMatrix i = Matrix2FloatMatrix(TQENInt64Matrix{{9223372036854775807LL}});
-  EXPECT_EQ(static_cast<long double>(i[0][0]), 9223372036854775807.0L);
-  const TQENFloatMatrix d = Matrix2FloatMatrix(TQENDoubleMatrix{{0.1}});
-  EXPECT_EQ(static_cast<long double>(d[0][0]), static_cast<long double>(0.1));
-  EXPECT_NE(static_cast<long double>(d[0][0]), 0.1L);
-}
-
 // --- Arithmetic element types ---------------------------------------------------------------
 
 template <typename T>

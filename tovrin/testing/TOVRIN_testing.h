@@ -117,6 +117,41 @@ std::vector<std::vector<Extended>> Values(const std::vector<std::vector<T>>& m) 
   for (const auto& row : m) out.push_back(Values(row));
   return out;
 }
+// Money values (TQENCurrency, TQENLongCurrency, Currency) from their stored integers, and back.
+template <typename T>
+T Money(Int64 stored) {
+  return static_cast<T>(static_cast<std::underlying_type_t<T>>(stored));
+}
+template <typename T>
+std::vector<T> MoneyVec(std::initializer_list<Int64> stored) {
+  std::vector<T> v;
+  for (const Int64 s : stored) v.push_back(Money<T>(s));
+  return v;
+}
+template <typename T>
+std::vector<std::vector<T>> MoneyMat(std::initializer_list<std::initializer_list<Int64>> rows) {
+  std::vector<std::vector<T>> m;
+  for (const auto& row : rows) m.push_back(MoneyVec<T>(row));
+  return m;
+}
+template <typename T>
+requires std::is_enum_v<T> Int64 Stored(T x) {
+  return static_cast<Int64>(static_cast<std::underlying_type_t<T>>(x));
+}
+template <typename T>
+requires std::is_enum_v<T> std::vector<Int64> Stored(const std::vector<T>& v) {
+  std::vector<Int64> out;
+  for (const T x : v) out.push_back(Stored(x));
+  return out;
+}
+template <typename T>
+requires std::is_enum_v<T> std::vector<std::vector<Int64>> Stored(
+    const std::vector<std::vector<T>>& m) {
+  std::vector<std::vector<Int64>> out;
+  for (const auto& row : m) out.push_back(Stored(row));
+  return out;
+}
+
 using Row = std::vector<Extended>;
 using Rows = std::vector<Row>;
 
