@@ -81,8 +81,8 @@ std::vector<std::string_view> TableLines(std::string_view Text, bool Whitespace)
     const std::size_t end = std::min(Text.find('\n'), Text.size());
     std::string_view line = Text.substr(0, end);
     if (!line.empty() && line.back() == '\r') line.remove_suffix(1);
-    const bool blank = Whitespace ? line.find_first_not_of(" \t") == std::string_view::npos
-                                  : line.empty();
+    const bool blank =
+        Whitespace ? line.find_first_not_of(" \t") == std::string_view::npos : line.empty();
     if (!blank) lines.push_back(line);
     Text.remove_prefix(std::min(end + 1, Text.size()));
   }
