@@ -842,6 +842,16 @@ Int64 BinomialBtpe(Int64 n, Extended p, Extended q, Extended np, Gen& gen) {
     }
     const Extended rho = (k / npq) * ((k * (k / 3 + 0.625L) + 0.1666666666666L) / npq + 0.5L);
     const Extended t = -k * k / (2 * npq);
+    // The squeeze, first from ln v in double.
+    BoundedLog approximateLogV;
+    if (DoubleLog(v, approximateLogV)) {
+      const Settled below = SettleLess(approximateLogV.value, approximateLogV.bound, t - rho, 0);
+      if (below == Settled::kYes) return y;
+      if (below == Settled::kNo &&
+          SettleLess(t + rho, 0, approximateLogV.value, approximateLogV.bound) == Settled::kYes) {
+        continue;
+      }
+    }
     const Extended logV = std::log(v);
     if (logV < t - rho) return y;
     if (logV > t + rho) continue;
