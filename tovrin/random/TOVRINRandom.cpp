@@ -186,9 +186,16 @@ Extended TruncExtended(Extended x) {
 }
 
 // Below 2^53 the whole number converts to double exactly, and from there to Int64 in one step.
+// The step toward zero is taken without a branch: whether rounding went up or down is
+// random in the generators.
 [[gnu::always_inline]] inline bool SmallTruncInt64(Extended x, Int64& result) {
   if (!(std::fabs(x) < 0x1p53L)) return false;
-  result = static_cast<Int64>(static_cast<double>(NearTrunc(x)));
+  constexpr Extended kShift = 0x1.8p63L;
+  const Extended nearest = (x + kShift) - kShift;
+  const auto whole = static_cast<Int64>(static_cast<double>(nearest));
+  const int overshoot = static_cast<int>(x >= 0) & static_cast<int>(nearest > x);
+  const int undershoot = static_cast<int>(x < 0) & static_cast<int>(nearest < x);
+  result = whole - overshoot + undershoot;
   return true;
 }
 
