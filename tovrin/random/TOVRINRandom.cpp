@@ -6,7 +6,7 @@
 // call per draw).
 #include "tovrin/random/TOVRINRandom.h"
 
-#include "tovrin/foundation/detail/ElementRules.h"
+#include "tovrin/foundation/detail/Wrapping.h"
 
 #include <algorithm>
 #include <array>
