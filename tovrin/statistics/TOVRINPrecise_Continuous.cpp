@@ -508,7 +508,8 @@ Pair ExponentialRate(Extended Mean, Extended X) {
 Extended ExponentialLess(Extended Mean, Extended X) {
   const Pair q = ExponentialRate(Mean, X);
   if (std::isinf(q.hi)) return 1;
-  return -std::expm1(-q.hi) + q.lo * std::exp(-q.hi);
+  const Extended less = -std::expm1(-q.hi);
+  return less + q.lo * (1.0L - less);
 }
 
 Extended ExponentialGreater(Extended Mean, Extended X) {
