@@ -254,7 +254,8 @@ void PrintAccuracy() {
       ours = std::fmax(ours, e);
       ours_ok += e <= goal;
 #ifdef TOVRIN_HAVE_BOOST
-      const bool interval = r->args[3] != r->args[4];  // beta on an interval: tovrin only
+      // The beta on an interval: tovrin only.
+      const bool interval = c.name.starts_with("Beta") && r->args[3] != r->args[4];
       if (const PreciseCall p = FindPeer(c.name); p != nullptr && !interval) {
         const Extended pe = RelativeError(CallPeer(p, r->args), r->expected);
         peer = std::fmax(peer, pe);
