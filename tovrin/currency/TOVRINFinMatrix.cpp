@@ -3,9 +3,9 @@
 #include <utility>
 
 #include "tovrin/currency/detail/MoneyRules.h"
-#include "tovrin/matrix/detail/MatrixArithmetic.h"
-#include "tovrin/matrix/detail/MatrixRowCol.h"
-#include "tovrin/matrix/detail/MatrixShape.h"
+#include "tovrin/detail/MatrixArithmetic.h"
+#include "tovrin/detail/MatrixRowCol.h"
+#include "tovrin/detail/MatrixShape.h"
 
 namespace tovrin {
 namespace {

@@ -4,9 +4,9 @@
 #include <utility>
 
 #include "tovrin/currency/detail/MoneyRules.h"
-#include "tovrin/vector/detail/QuickSort.h"
-#include "tovrin/vector/detail/Ranking.h"
-#include "tovrin/vector/detail/VectorAlgorithms.h"
+#include "tovrin/detail/QuickSort.h"
+#include "tovrin/detail/Ranking.h"
+#include "tovrin/detail/VectorAlgorithms.h"
 
 namespace tovrin {
 namespace {

@@ -75,9 +75,9 @@ using TQENSIntMatrix = std::vector<TQENSIntVector>;
 
 // Fixed-point money. Distinct types so that they overload apart from the integer vectors:
 // `Currency{15000}` is the amount 1.5; `static_cast<Int64>(c)` reads the stored integer.
-enum class TQENCurrency : LongInt {};      // amount x 100
-enum class TQENLongCurrency : Int64 {};    // amount x 1000000
-enum class Currency : Int64 {};            // amount x 10000
+enum class TQENCurrency : LongInt {};    // amount x 100
+enum class TQENLongCurrency : Int64 {};  // amount x 1000000
+enum class Currency : Int64 {};          // amount x 10000
 
 using TQENCurrVector = std::vector<TQENCurrency>;
 using TQENLongCurrVector = std::vector<TQENLongCurrency>;
@@ -85,13 +85,6 @@ using TQENCurrencyVector = std::vector<Currency>;
 using TQENCurrMatrix = std::vector<TQENCurrVector>;
 using TQENLongCurrMatrix = std::vector<TQENLongCurrVector>;
 using TQENCurrencyMatrix = std::vector<TQENCurrencyVector>;
-
-// One entry of the explicit stack of the quick sorts: 1-based bounds of a stretch still
-// to be sorted.
-struct TQStackRec {
-  LongInt Lower;
-  LongInt Upper;
-};
 
 inline constexpr Extended QENPi = 3.14159265358979323846264338327950288L;
 inline constexpr Extended TwoPi = 6.28318530717958647692528676655900577L;

@@ -2,11 +2,10 @@
 // functions and the grand mean.
 #include <cmath>
 
-#include "tovrin/foundation/detail/ElementRules.h"
+#include "tovrin/detail/ElementRules.h"
+#include "tovrin/detail/MatrixArithmetic.h"
+#include "tovrin/detail/MatrixShape.h"
 #include "tovrin/matrix/TOVRINMatrix.h"
-#include "tovrin/matrix/detail/MatrixArithmetic.h"
-#include "tovrin/matrix/detail/MatrixShape.h"
-#include "tovrin/matrix/detail/NumericRules.h"
 
 namespace tovrin {
 namespace {
@@ -14,7 +13,7 @@ namespace {
 using detail::MatrixOf;
 
 template <typename T>
-using Rules = detail::MatrixRules<T>;
+using Rules = detail::ElementRules<T>;
 
 // --- Shape queries ---
 

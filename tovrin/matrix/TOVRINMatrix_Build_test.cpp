@@ -5,7 +5,7 @@
 #include <cmath>
 #include <limits>
 
-#include "tovrin/foundation/detail/ElementRules.h"
+#include "tovrin/detail/ElementRules.h"
 #include "tovrin/matrix/TOVRINMatrix.h"
 #include "tovrin/matrix/TOVRINMatrix_test_support.h"
 

@@ -9,10 +9,10 @@
 #include <cstddef>
 #include <vector>
 
-#include "tovrin/foundation/detail/ElementRules.h"
+#include "tovrin/detail/ElementRules.h"
 #include "tovrin/matrix/TOVRINMatrix.h"
-#include "tovrin/matrix/detail/MatrixRowCol.h"
-#include "tovrin/matrix/detail/MatrixShape.h"
+#include "tovrin/detail/MatrixRowCol.h"
+#include "tovrin/detail/MatrixShape.h"
 #include "tovrin/vector/TOVRINVector.h"
 
 namespace tovrin {

@@ -5,11 +5,10 @@
 #include <type_traits>
 #include <vector>
 
-#include "tovrin/foundation/detail/ElementRules.h"
+#include "tovrin/detail/ElementRules.h"
+#include "tovrin/detail/MatrixRowCol.h"
+#include "tovrin/detail/MatrixShape.h"
 #include "tovrin/matrix/TOVRINMatrix.h"
-#include "tovrin/matrix/detail/MatrixRowCol.h"
-#include "tovrin/matrix/detail/MatrixShape.h"
-#include "tovrin/matrix/detail/NumericRules.h"
 
 namespace tovrin {
 namespace {
@@ -17,7 +16,7 @@ namespace {
 using detail::MatrixOf;
 
 template <typename T>
-using Rules = detail::MatrixRules<T>;
+using Rules = detail::ElementRules<T>;
 
 // Exactly 1: for Int64 both 32-bit halves are compared with those of 1, which is the same.
 template <typename K>

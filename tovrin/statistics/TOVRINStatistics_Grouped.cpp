@@ -5,7 +5,7 @@
 #include <cstddef>
 #include <vector>
 
-#include "tovrin/foundation/detail/ElementRules.h"
+#include "tovrin/foundation/detail/Wrapping.h"
 #include "tovrin/vector/TOVRINVector.h"
 
 namespace tovrin {

@@ -10,9 +10,9 @@
 
 #include <gtest/gtest.h>
 
+#include "tovrin/detail/QuickSort.h"
 #include "tovrin/vector/TOVRINVector.h"
 #include "tovrin/vector/TOVRINVector_testing.h"
-#include "tovrin/vector/detail/QuickSort.h"
 
 namespace tovrin {
 namespace {

@@ -6,7 +6,7 @@
 
 #include <gtest/gtest.h>
 
-#include "tovrin/foundation/detail/ElementRules.h"
+#include "tovrin/detail/ElementRules.h"
 #include "tovrin/vector/TOVRINVector.h"
 
 namespace tovrin::testing {

@@ -6,8 +6,8 @@
 #include <cstddef>
 #include <utility>
 
+#include "tovrin/detail/MatrixShape.h"
 #include "tovrin/foundation/TOVRINErrors.h"
-#include "tovrin/matrix/detail/MatrixShape.h"
 
 namespace tovrin::detail {
 

@@ -9,11 +9,11 @@
 #include <cstddef>
 #include <vector>
 
+#include "tovrin/detail/ElementRules.h"
+#include "tovrin/detail/MatrixShape.h"
+#include "tovrin/detail/QuickSort.h"
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINSystem.h"
-#include "tovrin/foundation/detail/ElementRules.h"
-#include "tovrin/matrix/detail/MatrixShape.h"
-#include "tovrin/vector/detail/QuickSort.h"
 
 namespace tovrin::detail {
 

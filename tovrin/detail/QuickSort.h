@@ -20,11 +20,22 @@
 #include <utility>
 #include <vector>
 
+#include "tovrin/foundation/TOVRINElementTypes.h"
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINGlobals.h"
 #include "tovrin/foundation/TOVRINMath.h"
 #include "tovrin/foundation/TOVRINSystem.h"
-#include "tovrin/foundation/detail/ElementRules.h"
+
+namespace tovrin {
+
+// One entry of the explicit stack of the quick sorts: 1-based bounds of a stretch still
+// to be sorted.
+struct TQStackRec {
+  LongInt Lower;
+  LongInt Upper;
+};
+
+}  // namespace tovrin
 
 namespace tovrin::detail {
 

@@ -19,9 +19,9 @@
 #include <utility>
 #include <vector>
 
+#include "tovrin/detail/ElementRules.h"
+#include "tovrin/detail/QuickSort.h"
 #include "tovrin/foundation/TOVRINGlobals.h"
-#include "tovrin/foundation/detail/ElementRules.h"
-#include "tovrin/vector/detail/QuickSort.h"
 
 namespace tovrin::detail {
 

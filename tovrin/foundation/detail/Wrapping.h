@@ -1,23 +1,12 @@
-// Type-dependent arithmetic rules shared by the vector, matrix, statistics and money units.
-// Integer arithmetic that wraps is done in unsigned types and converted back, so no signed
+// Integer arithmetic that wraps. It is done in unsigned types and converted back, so no signed
 // overflow ever happens.
 #pragma once
 
-#include <concepts>
-#include <type_traits>
+#include <cstdint>
 
 #include "tovrin/foundation/TOVRINGlobals.h"
-#include "tovrin/foundation/TOVRINMath.h"
 
 namespace tovrin::detail {
-
-// The stored element type as arithmetic sees it: PackedExtended reads as Extended.
-template <typename T>
-using ValueOf = std::conditional_t<std::is_same_v<T, PackedExtended>, Extended, T>;
-
-template <typename T>
-inline constexpr bool kIsFloatElement =
-    std::is_same_v<T, PackedExtended> || std::is_floating_point_v<T>;
 
 // Two's-complement wrapping on Int64.
 constexpr Int64 WrappingAdd64(Int64 a, Int64 b) {
@@ -42,22 +31,16 @@ constexpr Int64 WrappingSquare32(Int64 x) {
 constexpr Int64 WrappingSquareU32(LongWord x) {
   return static_cast<Int64>(static_cast<std::uint32_t>(static_cast<std::uint64_t>(x) * x));
 }
-// 32-bit wrapping differences.
+
+// 32-bit wrapping sums, differences and products.
+constexpr LongInt WrappingAdd32(LongInt a, LongInt b) {
+  return static_cast<LongInt>(static_cast<std::uint32_t>(a) + static_cast<std::uint32_t>(b));
+}
 constexpr LongInt WrappingSub32(LongInt a, LongInt b) {
   return static_cast<LongInt>(static_cast<std::uint32_t>(a) - static_cast<std::uint32_t>(b));
 }
-
-// Equality of two elements as ranking and the modal tests see it: SameFloat at the element's
-// own precision for floats, exact for integers.
-template <typename T>
-bool ElementEquals(T a, T b) {
-  if constexpr (std::is_same_v<T, PackedExtended>) {
-    return SameFloat(Extended(a), Extended(b));
-  } else if constexpr (std::is_floating_point_v<T>) {
-    return SameFloat(a, b);
-  } else {
-    return a == b;
-  }
+constexpr LongInt WrappingMul32(LongInt a, LongInt b) {
+  return static_cast<LongInt>(static_cast<std::uint32_t>(a) * static_cast<std::uint32_t>(b));
 }
 
 }  // namespace tovrin::detail

@@ -12,9 +12,9 @@
 #include <utility>
 #include <vector>
 
+#include "tovrin/detail/ElementRules.h"
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINGlobals.h"
-#include "tovrin/foundation/detail/ElementRules.h"
 
 namespace tovrin::detail {
 

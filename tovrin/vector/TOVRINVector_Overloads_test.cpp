@@ -1,0 +1,44 @@
+// The families exist for exactly the element types of their lists: a call with any other
+// element type does not compile. Checked at compile time, one family per list.
+#include "tovrin/vector/TOVRINVector.h"
+
+namespace tovrin {
+namespace {
+
+template <typename V>
+concept CanSqrt = requires(V& v) {
+  SqrtVector(v);
+};
+template <typename V>
+concept CanAppend = requires(V& v) {
+  AppendValue2Vector(v, 1);
+};
+template <typename V>
+concept CanAdd = requires(const V& v) {
+  AddVectors(v, v);
+};
+template <typename V>
+concept CanTestSign = requires(const V& v) {
+  VectorPositive(v);
+};
+template <typename V>
+concept CanConvertToLInt = requires(const V& v) {
+  Vector2LIntVector(v);
+};
+template <typename V>
+concept CanSort = requires(V& v) {
+  QSortVector(v, true);
+};
+
+static_assert(CanSqrt<TQENFloatVector> && CanSqrt<TQENSingleVector>);
+static_assert(!CanSqrt<TQENInt64Vector> && !CanSqrt<TQENWordVector>);
+static_assert(CanAppend<TQENLWordVector> && !CanAppend<TQENWordVector>);
+static_assert(CanAdd<TQENLIntVector> && !CanAdd<TQENLWordVector>);
+static_assert(CanTestSign<TQENInt64Vector> && !CanTestSign<TQENLIntVector>);
+static_assert(CanConvertToLInt<TQENWordVector> && !CanConvertToLInt<TQENLWordVector>);
+// Neither a vector of another element type nor a matrix is an element vector.
+static_assert(CanSort<TQENSIntVector> && !CanSort<std::vector<Int64*>>);
+static_assert(!CanSort<TQENFloatMatrix> && !CanSort<std::vector<long double>>);
+
+}  // namespace
+}  // namespace tovrin
