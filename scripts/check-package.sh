@@ -45,8 +45,28 @@ for example in examples/*.cpp; do
   g++ "$example" -o "$build/$name-pkgconfig-moved" $flags
   "$build/$name-pkgconfig-moved" >/dev/null
 done
+widgetflags=$(PKG_CONFIG_PATH="$moved/lib/pkgconfig" pkg-config --cflags --libs tovrin-widgets)
+case "$widgetflags" in
+  *"$elsewhere"* | *"$prefix"*)
+    echo "tovrin-widgets.pc points at a former place: $widgetflags" >&2; exit 1 ;;
+esac
 echo "package check: a moved install serves find_package and pkg-config consumers"
 cmake -S examples/subdirectory -B $build/subdirectory -DCMAKE_BUILD_TYPE=Release >/dev/null
 cmake --build $build/subdirectory -j2
 "$build/subdirectory/quickstart" >/dev/null
 echo "package check: add_subdirectory consumer built and ran"
+# The widgets component: a find_package(... COMPONENTS widgets) consumer and a pkg-config one,
+# then the installed tovrin-studio's offscreen screenshot, which must not be blank.
+export QT_QPA_PLATFORM=offscreen
+cmake -S examples/widgets -B $build/widgets -DCMAKE_PREFIX_PATH="$prefix" >/dev/null
+cmake --build $build/widgets -j2
+expected=$'3/5 -1/5\n-1/5 2/5'
+[ "$("$build/widgets/fraction_inverse")" = "$expected" ]
+PKG_CONFIG_PATH="$prefix/lib/pkgconfig" g++ examples/widgets/fraction_inverse.cpp \
+  -o "$build/fraction_inverse-pkgconfig" \
+  $(PKG_CONFIG_PATH="$prefix/lib/pkgconfig" pkg-config --cflags --libs tovrin-widgets)
+[ "$("$build/fraction_inverse-pkgconfig")" = "$expected" ]
+rm -f "$build/studio.png"
+"$prefix/bin/tovrin-studio" --screenshot "$build/studio.png"
+"$build/widgets/screenshot_check" "$build/studio.png"
+echo "package check: widgets consumers built and ran; tovrin-studio's screenshot is not blank"

@@ -79,6 +79,7 @@ constexpr auto kDescriptions = std::to_array<Entry>({
     {"IncompleteBeta", "regularised incomplete beta I_X(A, B)"},
     {"IncompleteGamma", "regularised lower incomplete gamma P(A, X)"},
     {"IncompleteGamma2", "upper incomplete gamma Gamma(A, X), A whole or half-whole"},
+    {"IncompleteGammaUpper", "regularised upper incomplete gamma Q(A, X) = 1 - P(A, X)"},
     {"InvBetaDistGreater", "beta distribution: the x with P(X > x) = P"},
     {"InvBetaDistLess", "beta distribution: the x with P(X < x) = P"},
     {"InvChiSquareGreater", "chi-square: the x with P(X > x) = P"},

@@ -17,6 +17,8 @@ using U = LongWord;
 constexpr std::string_view kHelp =
     "Usage: tovrin eval [--digits N] FUNCTION [ARG...]\n"
     "       tovrin eval --list\n"
+    "       tovrin eval --precise FUNCTION [ARG...]\n"
+    "       tovrin eval --precise --list\n"
     "\n"
     "Calls the library's scalar function FUNCTION (its exact name) with the ARGs and prints\n"
     "the result with 21 significant digits (N with --digits N), a Boolean as True or False.\n"
@@ -40,6 +42,7 @@ constexpr std::string_view kHelp =
     "  --digits N   significant digits of real results, 1 to 40 (default 21, which tell\n"
     "               every Extended apart)\n"
     "  --list       list the functions with their argument names and what they compute\n"
+    "  --precise    use the precise distribution family (tovrin::precise) instead\n"
     "  --help       show this help\n";
 
 std::string Labelled(const char* Name, Extended Value) {
@@ -340,9 +343,16 @@ int RunEval(std::span<const std::string> Words) {
     }
   }
   std::optional<int> digits;
+  bool precise = false;
   std::size_t first = 0;
-  for (; first < Words.size() && Words[first].starts_with("--digits"); ++first) {
+  for (; first < Words.size() &&
+         (Words[first].starts_with("--digits") || Words[first] == "--precise");
+       ++first) {
     const std::string& word = Words[first];
+    if (word == "--precise") {
+      precise = true;
+      continue;
+    }
     std::string text;
     if (word.starts_with("--digits=")) {
       text = word.substr(9);
@@ -356,13 +366,15 @@ int RunEval(std::span<const std::string> Words) {
   }
   Words = Words.subspan(first);
   if (Words.empty()) throw UsageError("eval needs a FUNCTION name (eval --list shows them)");
+  const CallableTable& table = precise ? PreciseEvalTable() : EvalTable();
   if (Words[0] == "--list") {
     if (Words.size() > 1) throw UsageError("--list takes no arguments");
-    WriteOut(ListCallables(EvalTable()));
+    WriteOut(ListCallables(table));
     return kExitOk;
   }
   if (Words[0].starts_with("-")) throw UsageError("unknown option " + Words[0]);
-  const auto call = BindByName(EvalTable(), "function", Words[0], Words.subspan(1));
+  const auto call =
+      BindByName(table, precise ? "precise function" : "function", Words[0], Words.subspan(1));
   const std::string result = call();
   WriteOut((digits ? WithDigits(result, *digits) : result) + "\n");
   return kExitOk;

@@ -145,4 +145,7 @@ std::function<std::string()> BindByName(const CallableTable& Table, const std::s
 // One line per signature: "Name Param Param ..." and a one-line description.
 std::string ListCallables(const CallableTable& Table);
 
+// The precise distribution family (tovrin::precise), for eval --precise.
+const CallableTable& PreciseEvalTable();
+
 }  // namespace tovrin::cli
