@@ -186,9 +186,16 @@ Extended TruncExtended(Extended x) {
 }
 
 // Below 2^53 the whole number converts to double exactly, and from there to Int64 in one step.
+// The step toward zero is taken without a branch: whether rounding went up or down is
+// random in the generators.
 [[gnu::always_inline]] inline bool SmallTruncInt64(Extended x, Int64& result) {
   if (!(std::fabs(x) < 0x1p53L)) return false;
-  result = static_cast<Int64>(static_cast<double>(NearTrunc(x)));
+  constexpr Extended kShift = 0x1.8p63L;
+  const Extended nearest = (x + kShift) - kShift;
+  const auto whole = static_cast<Int64>(static_cast<double>(nearest));
+  const int overshoot = static_cast<int>(x >= 0) & static_cast<int>(nearest > x);
+  const int undershoot = static_cast<int>(x < 0) & static_cast<int>(nearest < x);
+  result = whole - overshoot + undershoot;
   return true;
 }
 
@@ -307,6 +314,34 @@ Extended ExponentialVariate(Gen& gen) {
 // ---------------------------------------------------------------------------------------------
 // Gamma and its relatives
 
+// Comparisons with a logarithm on one side are first settled from the logarithm in double:
+// only where the two sides lie within the bound below does the Extended logarithm decide.
+//
+// ln x in double for a positive x in the normal double range, with a bound on its distance
+// from std::log(x) in Extended: rounding x to double moves ln x by 1.2e-16, the double log is
+// within an ulp (2.3e-16 |ln x|) and so is the Extended one; 5e-16 (1 + |ln x|) covers all.
+struct BoundedLog {
+  double value;
+  double bound;
+};
+inline bool DoubleLog(Extended x, BoundedLog& out) {
+  const auto xd = static_cast<double>(x);
+  if (!(xd > 0x1p-1000 && xd < 0x1p1000)) return false;
+  const double value = std::log(xd);
+  out = {value, 5e-16 * (1 + std::fabs(value))};
+  return true;
+}
+
+enum class Settled { kNo, kYes, kUnsure };
+
+// a < b for values known within a +- ea and b +- eb (and the rounding of this test itself).
+inline Settled SettleLess(Extended a, Extended ea, Extended b, Extended eb) {
+  const Extended slack = ea + eb + 0x1p-61L * (std::fabs(a) + std::fabs(b));
+  if (a + slack < b) return Settled::kYes;
+  if (a - slack > b) return Settled::kNo;
+  return Settled::kUnsure;
+}
+
 // Marsaglia and Tsang, for Shape > 1.
 template <typename Gen>
 Extended GammaLargeShape(Extended shape, Gen& gen) {
@@ -322,6 +357,19 @@ Extended GammaLargeShape(Extended shape, Gen& gen) {
     const Extended u = gen();
     const Extended x2 = x * x;
     if (u < 1 - 0.0331L * x2 * x2) return d * t;
+    // ln u < x^2 / 2 + d (1 - t + ln t), the logarithms first in double: the right side then
+    // differs from its Extended value by d times the bound of ln t and its roundings.
+    BoundedLog logU;
+    BoundedLog logT;
+    if (DoubleLog(u, logU) && DoubleLog(t, logT)) {
+      const Extended lnT = logT.value;
+      const Extended right = 0.5L * x2 + d * (1 - t + lnT);
+      const Extended rightError =
+          d * Extended(logT.bound) * 1.01L + 0x1p-60L * (0.5L * x2 + d * (1 + t + std::fabs(lnT)));
+      const Settled settled = SettleLess(logU.value, logU.bound, right, rightError);
+      if (settled == Settled::kYes) return d * t;
+      if (settled == Settled::kNo) continue;
+    }
     if (std::log(u) < 0.5L * x2 + d * (1 - t + std::log(t))) return d * t;
   }
 }
@@ -345,14 +393,20 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
     const Extended u = gen();
     if (u >= 1) continue;
     Extended x;
-    Extended w;
-    if (u > p) {
-      if (!haveTLnT) {
-        tLnT = t * std::log(t);
-        haveTLnT = true;
-      }
+    Extended w = 0;        // in the tail, an estimate of t ln x - t ln t within wError
+    Extended wError = -1;  // -1: w is not known yet
+    const bool tail = u > p;
+    if (tail) {
       x = t - std::log((1 - u) / (1 - p));
-      w = t * std::log(x) - tLnT;
+      BoundedLog logX;
+      BoundedLog logT;
+      if (DoubleLog(x, logX) && DoubleLog(t, logT)) {
+        const Extended lnX = logX.value;
+        const Extended lnT = logT.value;
+        w = t * lnX - t * lnT;
+        wError = t * Extended(logX.bound + logT.bound) * 1.01L +
+                 0x1p-60L * t * (std::fabs(lnX) + std::fabs(lnT));
+      }
     } else {
       if (u <= floorBound && !haveW0) {
         w0 = p * XtoY(kTiny / t, shape);
@@ -361,8 +415,33 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
       if (u <= floorBound && u <= w0) return 0;
       x = t * Power(u / p, 1 / shape);
       w = x;
+      wError = 0;
     }
     const Extended u2 = gen();
+    // Accept if w < 1 - u2, or u2 <= 0, or u2 (1 + w) < 1 and w < -ln u2: first from the
+    // estimates, then, where they cannot tell, from the exact w and logarithm.
+    if (wError >= 0) {
+      const Settled below = SettleLess(w, wError, 1 - u2, 0);
+      if (below == Settled::kYes) return x;
+      if (below == Settled::kNo) {
+        if (u2 <= 0) return x;
+        const Settled product = SettleLess(u2 * (1 + w), u2 * wError, 1, 0);
+        if (product == Settled::kNo) continue;
+        BoundedLog logU2;
+        if (product == Settled::kYes && DoubleLog(u2, logU2)) {
+          const Settled beyond = SettleLess(w, wError, -logU2.value, logU2.bound);
+          if (beyond == Settled::kYes) return x;
+          if (beyond == Settled::kNo) continue;
+        }
+      }
+    }
+    if (tail) {
+      if (!haveTLnT) {
+        tLnT = t * std::log(t);
+        haveTLnT = true;
+      }
+      w = t * std::log(x) - tLnT;
+    }
     if (w < 1 - u2) return x;
     if (u2 <= 0) return x;
     if (u2 * (1 + w) < 1 && w < -std::log(u2)) return x;
@@ -770,6 +849,16 @@ Int64 BinomialBtpe(Int64 n, Extended p, Extended q, Extended np, Gen& gen) {
     }
     const Extended rho = (k / npq) * ((k * (k / 3 + 0.625L) + 0.1666666666666L) / npq + 0.5L);
     const Extended t = -k * k / (2 * npq);
+    // The squeeze, first from ln v in double.
+    BoundedLog approximateLogV;
+    if (DoubleLog(v, approximateLogV)) {
+      const Settled below = SettleLess(approximateLogV.value, approximateLogV.bound, t - rho, 0);
+      if (below == Settled::kYes) return y;
+      if (below == Settled::kNo &&
+          SettleLess(t + rho, 0, approximateLogV.value, approximateLogV.bound) == Settled::kYes) {
+        continue;
+      }
+    }
     const Extended logV = std::log(v);
     if (logV < t - rho) return y;
     if (logV > t + rho) continue;
