@@ -861,7 +861,8 @@ Extended ErfcOfSqrt(Extended x) {
   const ExactPair ss = TwoProduct(s, s);
   const Extended s_lo = ((x - ss.hi) - ss.lo) / (2.0L * s);
   Extended e = std::erfc(s);
-  if (s_lo != 0.0L && x < 12000.0L) e -= s_lo * 1.12837916709551257389615890312154517L * std::exp(-x);
+  if (s_lo != 0.0L && x < 12000.0L)
+    e -= s_lo * 1.12837916709551257389615890312154517L * std::exp(-x);
   return e;
 }
 
@@ -946,8 +947,7 @@ Tails IncompleteBetaTails(Extended X, Extended XLo, Extended Y, Extended YLo, Ex
   if (std::fmin(A, B) <= kHugeShape) {
     const bool lower_derived = BetaLambda(p, A, B) < 0.0L;
     Extended direct;
-    if (lower_derived && v.lower < kDirectBelow &&
-        LowerTailSmallB(p, A, B, v.factor, direct)) {
+    if (lower_derived && v.lower < kDirectBelow && LowerTailSmallB(p, A, B, v.factor, direct)) {
       v.lower = direct;
     } else if (!lower_derived && v.upper < kDirectBelow &&
                LowerTailSmallB(Swapped(p), B, A, v.factor, direct)) {
