@@ -904,9 +904,11 @@ Tails IncompleteGammaTails(Extended A, Extended X) {
     if (std::fabs(t.hi) <= kTemmeMaxOffset) return TemmeGammaTails(A, t);
   }
   if (A <= 1.0L && X < 1.1L) {
-    const Extended p = GammaFactor(A, X) / A * LowerGammaSeries(A, X);
-    if (A == 0.5L) return {p, ErfcOfSqrt(X)};
-    return {p, ScaledUpperGamma(A, X, 0.0L)};
+    // Both tails directly; where Q is the smaller, P is its complement (for a shape near the
+    // bottom of the range, r / a would lose its digits to the subnormals).
+    const Extended q = A == 0.5L ? ErfcOfSqrt(X) : ScaledUpperGamma(A, X, 0.0L);
+    if (q <= 0.5L) return {1.0L - q, q};
+    return {GammaFactor(A, X) / A * LowerGammaSeries(A, X), q};
   }
   if (A == 0.5L) {
     const Extended q = ErfcOfSqrt(X);
