@@ -83,7 +83,13 @@ void BM_Std_Gamma(benchmark::State& state) {
   std::gamma_distribution<double> dist(state.range(0) / 10.0);
   RunDraws(state, [&] { return dist(Engine()); });
 }
+void BM_Random_Gamma_MtSource(benchmark::State& state) {
+  const Extended shape = state.range(0) / 10.0L;
+  auto source = [] { return static_cast<Extended>(Engine()()) * 0x1p-64L; };
+  RunDraws(state, [&] { return Random_Gamma(shape, source); });
+}
 BENCHMARK(BM_Random_Gamma)->Arg(5)->Arg(50);
+BENCHMARK(BM_Random_Gamma_MtSource)->Arg(5)->Arg(50);
 BENCHMARK(BM_Std_Gamma)->Arg(5)->Arg(50);
 
 void BM_Random_Beta(benchmark::State& state) {
@@ -122,7 +128,14 @@ void BM_Std_Binomial(benchmark::State& state) {
   std::binomial_distribution<std::int64_t> dist(state.range(0), state.range(1) / 100.0);
   RunDraws(state, [&] { return dist(Engine()); });
 }
+void BM_Random_Binomial2_MtSource(benchmark::State& state) {
+  const Int64 n = state.range(0);
+  const Extended p = state.range(1) / 100.0L;
+  auto source = [] { return static_cast<Extended>(Engine()()) * 0x1p-64L; };
+  RunDraws(state, [&] { return Random_Binomial2(n, p, source); });
+}
 BENCHMARK(BM_Random_Binomial2)->Args({1000, 30})->Args({20, 30});
+BENCHMARK(BM_Random_Binomial2_MtSource)->Args({1000, 30});
 BENCHMARK(BM_Std_Binomial)->Args({1000, 30})->Args({20, 30});
 void BM_Random_Binomial1(benchmark::State& state) {
   const auto n = static_cast<LongInt>(state.range(0));
@@ -141,7 +154,13 @@ void BM_Std_Poisson(benchmark::State& state) {
   std::poisson_distribution<std::int64_t> dist(static_cast<double>(state.range(0)));
   RunDraws(state, [&] { return dist(Engine()); });
 }
+void BM_Random_Poisson_MtSource(benchmark::State& state) {
+  Extended mu = static_cast<Extended>(state.range(0));
+  auto source = [] { return static_cast<Extended>(Engine()()) * 0x1p-64L; };
+  RunDraws(state, [&] { return Random_Poisson(mu, source); });
+}
 BENCHMARK(BM_Random_Poisson)->Arg(4)->Arg(100);
+BENCHMARK(BM_Random_Poisson_MtSource)->Arg(100);
 BENCHMARK(BM_Std_Poisson)->Arg(4)->Arg(100);
 
 }  // namespace

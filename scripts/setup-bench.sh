@@ -1,10 +1,12 @@
 #!/usr/bin/env bash
-# Installs the benchmark-only yardstick: Debian's Boost.Math headers. The tovrin library itself
-# never depends on Boost; bench/gammabeta_bench.cpp compares against it when the headers exist.
+# Installs the benchmark-only yardsticks: Debian's Boost.Math headers and GNU datamash. The
+# tovrin library itself never depends on either; bench/gammabeta_bench.cpp compares against
+# Boost when the headers exist, and bench/describe_bench.sh runs `tovrin describe` beside
+# datamash.
 set -euo pipefail
 
-if [ -f /usr/include/boost/math/special_functions/gamma.hpp ]; then
-  echo "Boost.Math headers already present"
+if [ -f /usr/include/boost/math/special_functions/gamma.hpp ] && command -v datamash >/dev/null; then
+  echo "Boost.Math headers and datamash already present"
   exit 0
 fi
 
@@ -14,4 +16,4 @@ if [ "$(id -u)" -ne 0 ]; then
 fi
 export DEBIAN_FRONTEND=noninteractive
 $SUDO apt-get update
-$SUDO apt-get install -y --no-install-recommends libboost-math-dev libboost-dev
+$SUDO apt-get install -y --no-install-recommends libboost-math-dev libboost-dev datamash

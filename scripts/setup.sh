@@ -7,6 +7,10 @@ command -v g++ >/dev/null || missing+=(g++)
 command -v pkg-config >/dev/null || missing+=(pkg-config)
 [ -d /usr/include/gtest ] || missing+=(libgtest-dev libgmock-dev)
 [ -d /usr/include/benchmark ] || missing+=(libbenchmark-dev)
+# Qt 6 Widgets for tovrin::widgets and tovrin-studio (fonts for their offscreen rendering).
+[ -n "$(find /usr/lib -path '*/cmake/Qt6Widgets/Qt6WidgetsConfig.cmake' -print -quit 2>/dev/null)" ] ||
+  missing+=(qt6-base-dev)
+[ -n "$(find /usr/share/fonts -name '*.ttf' -print -quit 2>/dev/null)" ] || missing+=(fonts-dejavu-core)
 if [ ${#missing[@]} -gt 0 ]; then
   echo "installing: ${missing[*]}"
   if [ "$(id -u)" -eq 0 ]; then SUDO=""; else SUDO="sudo"; fi

@@ -108,12 +108,12 @@ Byte ParseDecimals(const Arguments& Args) {
   return static_cast<Byte>(ParseUnsignedArgument(*text, "--decimals", 20));
 }
 
-std::string FormatSignificant(Extended X) {
+std::string FormatSignificant(Extended X, int Digits) {
   if (std::isnan(X)) return "NAN";
   if (std::isinf(X)) return X > 0 ? "INF" : "-INF";
   char buffer[64];
   const auto [end, ec] =
-      std::to_chars(buffer, buffer + sizeof buffer, X, std::chars_format::general, 21);
+      std::to_chars(buffer, buffer + sizeof buffer, X, std::chars_format::general, Digits);
   return std::string(buffer, ec == std::errc() ? end : buffer);
 }
 

@@ -66,9 +66,9 @@ std::int64_t ParseSignedArgument(std::string_view Text, std::string_view What, s
 // The --decimals option: 0 to 20, 4 when absent.
 Byte ParseDecimals(const Arguments& Args);
 
-// Output of real results: 21 significant digits (general notation, trailing zeros dropped),
-// and the shortest text that reads back to the same Extended (for JSON).
-std::string FormatSignificant(Extended X);
+// Output of real results: 21 significant digits, or Digits (general notation, trailing zeros
+// dropped), and the shortest text that reads back to the same Extended (for JSON).
+std::string FormatSignificant(Extended X, int Digits = 21);
 std::string FormatShortest(Extended X);
 
 }  // namespace tovrin::cli

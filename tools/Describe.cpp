@@ -50,8 +50,8 @@ constexpr std::string_view kHelp =
     "  --population   treat the numbers as a whole population (divisor n, not n - 1)\n"
     "  --decimals N   decimal places, 0 to 20 (default 4)\n"
     "  --json         JSON instead: an object of the statistics at full precision, null for\n"
-    "                 those that cannot be computed (for several fields or groups, an object\n"
-    "                 of such objects by name)\n"
+    "                 those that cannot be computed; with -f or -g, an object of such objects\n"
+    "                 by field name (or number) or by group (and then by field, for several)\n"
     "  --stats LIST   only the statistics named (NoOfValues, Missing, Maximum, Minimum, Range,\n"
     "                 Sum, SumSq, Mean, Mode, Median, Variance, StdDev, Kurtosis, Skew,\n"
     "                 Quartile1st, Quartile3rd, IQR, FenceLower, FenceUpper), as a table with\n"
@@ -357,7 +357,8 @@ int RunDescribe(std::span<const std::string> Words) {
   const bool want_lines = !output.json && !output.stats;
 
   std::vector<Summary> summaries;
-  bool grouped = false, by_field = false;
+  // JSON maps names to objects whenever fields are chosen (even one), text only for several.
+  bool grouped = false, by_field = false, json_by_field = false;
   if (!table) {
     // The plain stream of numbers: one sample.
     const MissingTexts missing_texts(na_list.value_or(""));
@@ -426,6 +427,7 @@ int RunDescribe(std::span<const std::string> Words) {
         });
     grouped = group_field.has_value();
     by_field = fields.size() > 1;
+    json_by_field = by_field || (!grouped && table->fields_given);
     for (std::size_t c = 0; c < columns.size(); ++c) {
       Summary s = Summarize(std::move(columns[c].values), population, output.decimals,
                             want_lines && !grouped && fields.size() == 1);
@@ -439,7 +441,7 @@ int RunDescribe(std::span<const std::string> Words) {
 
   std::string text;
   if (output.json) {
-    text = JsonReport(summaries, grouped, by_field, output);
+    text = JsonReport(summaries, grouped, json_by_field, output);
   } else if (output.stats) {
     text = StatsTable(summaries, grouped, by_field, output);
   } else if (!grouped && summaries.size() == 1) {

@@ -3,6 +3,7 @@
 #include <string_view>
 
 #include "tools/CommandLine.h"
+#include "tools/NumberReader.h"
 #include "tools/Registry.h"
 #include "tools/Subcommands.h"
 #include "tovrin/tovrin.h"
@@ -14,15 +15,18 @@ using E = Extended;
 using U = LongWord;
 
 constexpr std::string_view kHelp =
-    "Usage: tovrin eval FUNCTION [ARG...]\n"
+    "Usage: tovrin eval [--digits N] FUNCTION [ARG...]\n"
     "       tovrin eval --list\n"
+    "       tovrin eval --precise FUNCTION [ARG...]\n"
+    "       tovrin eval --precise --list\n"
     "\n"
     "Calls the library's scalar function FUNCTION (its exact name) with the ARGs and prints\n"
-    "the result with 21 significant digits, a Boolean as True or False. Functions with\n"
-    "several results print one line each: name, TAB, value.\n"
+    "the result with 21 significant digits (N with --digits N), a Boolean as True or False.\n"
+    "Functions with several results print one line each: name, TAB, value.\n"
     "\n"
     "Examples:\n"
     "  tovrin eval NormalLess 1.96\n"
+    "  tovrin eval --digits 6 NormalLess 1.96\n"
     "  tovrin eval InvStudentTLess 0.975 10\n"
     "  tovrin eval BinomialBetween 0.5 4 1 3\n"
     "  tovrin eval AreaTriangle 3 4 5\n"
@@ -35,8 +39,11 @@ constexpr std::string_view kHelp =
     "An error raised by the function is printed on standard error (exit status 1).\n"
     "\n"
     "Options:\n"
-    "  --list   list the functions with their argument names\n"
-    "  --help   show this help\n";
+    "  --digits N   significant digits of real results, 1 to 40 (default 21, which tell\n"
+    "               every Extended apart)\n"
+    "  --list       list the functions with their argument names and what they compute\n"
+    "  --precise    use the precise distribution family (tovrin::precise) instead\n"
+    "  --help       show this help\n";
 
 std::string Labelled(const char* Name, Extended Value) {
   return std::string(Name) + "\t" + FormatSignificant(Value);
@@ -302,26 +309,74 @@ const CallableTable& EvalTable() {
   return table;
 }
 
+// The result with Digits significant digits in place of 21: every line's value (after its TAB,
+// if any) that is a number is written again. 21 digits identify an Extended, so reading the
+// text back gives the result itself.
+std::string WithDigits(const std::string& Result, int Digits) {
+  std::string text;
+  std::size_t start = 0;
+  while (start <= Result.size()) {
+    std::size_t end = Result.find('\n', start);
+    if (end == std::string::npos) end = Result.size();
+    const std::string_view line(Result.data() + start, end - start);
+    const std::size_t tab = line.find('\t');
+    const std::size_t value_at = tab == std::string_view::npos ? 0 : tab + 1;
+    const std::optional<Extended> value = ParseNumber(line.substr(value_at));
+    text += value ? std::string(line.substr(0, value_at)) + FormatSignificant(*value, Digits)
+                  : std::string(line);
+    if (end == Result.size()) break;
+    text += '\n';
+    start = end + 1;
+  }
+  return text;
+}
+
 }  // namespace
 
 int RunEval(std::span<const std::string> Words) {
-  // Only the first word can be an option: every word after the function's name is one of
-  // its arguments (so that negative numbers pass), except --help.
-  if (Words.empty()) throw UsageError("eval needs a FUNCTION name (eval --list shows them)");
+  // Options come before the function's name: every word after it is one of its arguments
+  // (so that negative numbers pass), except --help.
   for (const std::string& word : Words) {
     if (word == "--help" || word == "-h") {
       WriteOut(std::string(kHelp));
       return kExitOk;
     }
   }
+  std::optional<int> digits;
+  bool precise = false;
+  std::size_t first = 0;
+  for (; first < Words.size() &&
+         (Words[first].starts_with("--digits") || Words[first] == "--precise");
+       ++first) {
+    const std::string& word = Words[first];
+    if (word == "--precise") {
+      precise = true;
+      continue;
+    }
+    std::string text;
+    if (word.starts_with("--digits=")) {
+      text = word.substr(9);
+    } else if (word == "--digits") {
+      if (first + 1 == Words.size()) throw UsageError("option --digits needs a value");
+      text = Words[++first];
+    } else {
+      throw UsageError("unknown option " + word);
+    }
+    digits = static_cast<int>(ParseSignedArgument(text, "--digits", 1, 40));
+  }
+  Words = Words.subspan(first);
+  if (Words.empty()) throw UsageError("eval needs a FUNCTION name (eval --list shows them)");
+  const CallableTable& table = precise ? PreciseEvalTable() : EvalTable();
   if (Words[0] == "--list") {
     if (Words.size() > 1) throw UsageError("--list takes no arguments");
-    WriteOut(ListCallables(EvalTable()));
+    WriteOut(ListCallables(table));
     return kExitOk;
   }
   if (Words[0].starts_with("-")) throw UsageError("unknown option " + Words[0]);
-  const auto call = BindByName(EvalTable(), "function", Words[0], Words.subspan(1));
-  WriteOut(call() + "\n");
+  const auto call =
+      BindByName(table, precise ? "precise function" : "function", Words[0], Words.subspan(1));
+  const std::string result = call();
+  WriteOut((digits ? WithDigits(result, *digits) : result) + "\n");
   return kExitOk;
 }
 

@@ -1,5 +1,9 @@
 #include "tools/Registry.h"
 
+#include <algorithm>
+
+#include "tools/Descriptions.h"
+
 namespace tovrin::cli {
 
 std::vector<const Callable*> FindCallables(const CallableTable& Table, const std::string& Name) {
@@ -44,8 +48,21 @@ std::function<std::string()> BindByName(const CallableTable& Table, const std::s
 }
 
 std::string ListCallables(const CallableTable& Table) {
+  // The descriptions start in one column, after the longest signature (up to a limit).
+  constexpr std::size_t kWidest = 40;
+  std::size_t width = 0;
+  for (const Callable& entry : Table) width = std::max(width, Signature(entry).size());
+  width = std::min(width, kWidest) + 2;
   std::string text;
-  for (const Callable& entry : Table) text += Signature(entry) + "\n";
+  for (const Callable& entry : Table) {
+    std::string line = Signature(entry);
+    const std::string_view description = Description(entry.name);
+    if (!description.empty()) {
+      line.resize(std::max(line.size() + 2, width), ' ');
+      line += description;
+    }
+    text += line + "\n";
+  }
   return text;
 }
 

@@ -142,7 +142,10 @@ std::vector<const Callable*> FindCallables(const CallableTable& Table, const std
 std::function<std::string()> BindByName(const CallableTable& Table, const std::string& What,
                                         const std::string& Name,
                                         std::span<const std::string> Arguments);
-// One line per signature: "Name Param Param ...".
+// One line per signature: "Name Param Param ..." and a one-line description.
 std::string ListCallables(const CallableTable& Table);
+
+// The precise distribution family (tovrin::precise), for eval --precise.
+const CallableTable& PreciseEvalTable();
 
 }  // namespace tovrin::cli

@@ -49,6 +49,7 @@ std::optional<TableOptions> ReadTableOptions(const Arguments& Args,
   if (delimiter) options.format.delimiter = ParseDelimiter(*delimiter);
   options.header = header;
   options.fields = fields ? *fields : std::string(DefaultFields);
+  options.fields_given = fields.has_value();
   if (options.fields.empty()) throw UsageError("-f/--field needs at least one field");
   options.group = group;
   if (group && group->empty()) throw UsageError("-g/--group needs a field");

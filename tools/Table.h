@@ -46,7 +46,8 @@ struct TableField {
 struct TableOptions {
   TableFormat format;
   bool header = false;
-  std::string fields;                // the -f LIST as given
+  std::string fields;                // the -f LIST as given, or the default
+  bool fields_given = false;         // -f was given
   std::optional<std::string> group;  // the -g FIELD
 };
 

@@ -322,6 +322,18 @@ assert lima["StdDev"] is None and lima["Kurtosis"] is None
 PY
 run 0 describe -t , -H -f temp,rain --json --stats Sum,Missing,Range "$WORK/cities.csv"
 expect_out '{"temp": {"Sum": 65, "Missing": 0, "Range": 17}, "rain": {"Sum": 1510, "Missing": 3, "Range": 790}}'
+# One chosen field: JSON names it; without -f, field 1 and one object.
+run 0 describe -t , -H -f rain --json "$WORK/cities.csv"
+checks=$((checks + 1))
+python3 - "$WORK/out" <<'PY' || fail "describe -f rain --json"
+import json, sys
+d = json.load(open(sys.argv[1]))
+assert list(d) == ["rain"] and d["rain"]["NoOfValues"] == 3 and d["rain"]["Missing"] == 3, d
+assert d["rain"]["Sum"] == 1510 and d["rain"]["Mode"] is None and d["rain"]["Kurtosis"] is None
+PY
+printf 'n\n1\n\n3\nNA\n' >"$WORK/col.csv"
+run 0 describe -t , -H --json --stats NoOfValues,Missing,Mean,Variance,Skew "$WORK/col.csv"
+expect_out '{"NoOfValues": 2, "Missing": 1, "Mean": 2, "Variance": 2, "Skew": null}'
 # An all-missing field: the empty-list report and its missing count.
 printf 'a;b\n1;NA\n2;\n' >"$WORK/semi.csv"
 run 0 describe -t ';' -H -f b "$WORK/semi.csv"
@@ -528,13 +540,32 @@ expect_err "'abc'"
 run 2 eval ChiSquareLess 1 -2
 run 2 eval ChiSquareLess 1 2.5
 run 2 eval
+# The list: signature, then a description in one column.
 run 0 eval --list
-expect_line "NormalLess Z"
-expect_line "BinomialBetween P N R1 R2"
-expect_line "AreaTriangle A B C"
-expect_line "Gamma X"
+checks=$((checks + 1))
+grep -qE '^NormalLess Z +standard normal: P\(Z < z\)$' "$WORK/out" || fail "eval --list NormalLess"
+for signature in "BinomialBetween P N R1 R2" "AreaTriangle A B C" "Gamma X"; do
+  checks=$((checks + 1))
+  grep -qE "^$signature  +[a-z]" "$WORK/out" || fail "eval --list lacks '$signature' or its description"
+done
 checks=$((checks + 1))
 [ "$(wc -l <"$WORK/out")" -ge 150 ] || fail "eval --list lists only $(wc -l <"$WORK/out") functions"
+checks=$((checks + 1))
+awk '!/^[A-Za-z0-9_]+( [A-Za-z0-9:]+)*(\.\.\.)?  +[^ ]/ { print; bad = 1 } END { exit bad }' \
+  "$WORK/out" >"$WORK/undescribed" || fail "eval --list without descriptions: $(cat "$WORK/undescribed")"
+# --digits: significant digits of real results, the labelled lines too; integers as well.
+run 0 eval --digits 6 NormalLess 1.96
+expect_out "0.975002"
+run 0 eval --digits=3 GetCircleWithPoints 0 0 2 0 0 2
+expect_out "CX${TAB}1
+CY${TAB}1
+R${TAB}1.41"
+run 0 eval --digits 2 SameFloat 1 1
+expect_out "True"
+run 2 eval --digits 0 Gamma 2
+expect_err "--digits"
+run 2 eval --digits
+run 2 eval Gamma 2 --digits 3
 
 # --- random ------------------------------------------------------------------------------------
 run 0 random Random_Normal --count 5 --seed 42
@@ -578,8 +609,10 @@ run 2 random Random_Normal --count -1
 run 2 random Random_Normal --seed x
 run 2 random
 run 0 random --list
-expect_line "Random_Gamma Shape"
-expect_line "Random_Binomial2 N P"
+for signature in "Random_Gamma Shape" "Random_Binomial2 N P" "Random_Cauchy"; do
+  checks=$((checks + 1))
+  grep -qE "^$signature  +[a-z]" "$WORK/out" || fail "random --list lacks '$signature' or its description"
+done
 
 echo "$checks checks, $failures failures"
 [ "$failures" -eq 0 ]

@@ -6,6 +6,7 @@
 #include "tovrin/vector/TOVRINVector.h"
 #include "tovrin/matrix/TOVRINMatrix.h"
 #include "tovrin/statistics/TOVRINStatistics.h"
+#include "tovrin/statistics/TOVRINPrecise.h"
 #include "tovrin/statistics/TOVRINPairStats.h"
 #include "tovrin/statistics/TOVRIN_RS_DescStats.h"
 #include "tovrin/statistics/TOVRINDescStats.h"

@@ -33,14 +33,7 @@ void ScaleInPlace(MatrixOf<T>& M, Extended K) {
 
 template <typename T>
 void LinearTransformOf(MatrixOf<T>& M, Extended A, Extended B) {
-  auto op = [A, B](T x) { return MoneyRules<T>::Linear(x, A, B); };
-  if constexpr (MoneyRules<T>::kLinearMayRaise) {
-    // A conversion may raise part way: build the result aside so that M stays as it was.
-    MatrixOf<T> result = detail::MapMatrix(M, op);
-    M.swap(result);
-  } else {
-    detail::MapMatrixInPlace(M, op);
-  }
+  detail::MapMatrixInPlace(M, [A, B](T x) { return MoneyRules<T>::Linear(x, A, B); });
 }
 
 template <typename T>

@@ -4,7 +4,8 @@
 // TOVRINMatrix.h and runs the same algorithm; shape queries follow QENMatrixRectangularCheck
 // exactly as there. What differs is the element arithmetic: stored integers add and subtract
 // with wrap-around at their own width (32 bits for TQENCurrency, 64 for the others), products
-// by an Extended constant are rounded half to even. There is no row reduction, product, row or
+// by an Extended constant and linear transforms are rounded half to even with an overflow that
+// is not reported (the one rule of TOVRINFinancials.h). There is no row reduction, product, row or
 // column scaling or sum, and no element-wise function for money.
 #pragma once
 
@@ -77,9 +78,9 @@ void MultiplyMatrixByConst2(TQENCurrMatrix& M, Extended K);
 void MultiplyMatrixByConst2(TQENLongCurrMatrix& M, Extended K);
 void MultiplyMatrixByConst2(TQENCurrencyMatrix& M, Extended K);
 // Element := element x A + B in money terms, each row at its own length; rsMatrixIsEmpty for
-// no rows. TQENCurrency and TQENLongCurrency: Float2QEN...(Currency2Float(element) x A + B),
-// which raises rsInvalidValue for a result out of range, leaving M as it was. Currency: the
-// stored integer x A + B x 10000 rounded half to even (B is an amount), overflow unreported.
+// no rows. TQENCurrency and TQENLongCurrency: Float2QEN...(Currency2Float(element) x A + B).
+// Currency: the stored integer x A + B x 10000 (B is an amount). Each rounded half to even,
+// overflow unreported.
 void LinearTransformMatrix(TQENCurrMatrix& M, Extended A, Extended B);
 void LinearTransformMatrix(TQENLongCurrMatrix& M, Extended A, Extended B);
 void LinearTransformMatrix(TQENCurrencyMatrix& M, Extended A, Extended B);

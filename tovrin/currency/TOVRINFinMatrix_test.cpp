@@ -290,10 +290,14 @@ TEST(MoneyMatrixLinearTransform, WorksInAmounts) {
   auto l = Mat<TQENLongCurrency>({{1500000}});
   LinearTransformMatrix(l, 2, 0.25L);
   EXPECT_EQ(StoredOf(l), (IntRows{{3250000}}));
-  // Out of range through the conversion service: raises, the matrix stays as it was.
+  // Out of range the conversion wraps unreported: 10^10 hundredths keep their low 32 bits.
   auto big = Mat<TQENCurrency>({{1, 2}, {10000000}});
-  ExpectRaises(rsInvalidValue, [&] { LinearTransformMatrix(big, 1000, 0); });
-  EXPECT_EQ(StoredOf(big), (IntRows{{1, 2}, {10000000}}));
+  LinearTransformMatrix(big, 1000, 0);
+  EXPECT_EQ(StoredOf(big), (IntRows{{1000, 2000}, {10000000000 % 4294967296}}));
+  // The same amount rounds alike through every money path: 6.5 stored units go to 6.
+  auto half = Mat<Currency>({{1}});
+  MultiplyMatrixByConst2(half, 6.5L);
+  EXPECT_EQ(StoredOf(half), (IntRows{{6}}));
 }
 
 TEST(MoneyMatrixConversion, ToFloatKeepsTheShape) {

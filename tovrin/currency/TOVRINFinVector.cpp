@@ -22,15 +22,7 @@ T SumOf(const std::vector<T>& V) {
 template <typename T>
 void LinearTransformOf(std::vector<T>& V, Extended A, Extended B) {
   detail::RequireElements(V);
-  auto op = [A, B](T x) { return MoneyRules<T>::Linear(x, A, B); };
-  if constexpr (MoneyRules<T>::kLinearMayRaise) {
-    // A conversion may raise part way: work on a copy so that V stays as it was.
-    std::vector<T> work(V);
-    detail::ApplyInPlace(work, op);
-    V.swap(work);
-  } else {
-    detail::ApplyInPlace(V, op);
-  }
+  detail::ApplyInPlace(V, [A, B](T x) { return MoneyRules<T>::Linear(x, A, B); });
 }
 
 template <typename To, typename From, typename ConvertFn>
@@ -47,15 +39,7 @@ T Same(T x) {
 
 TQENCurrency CurrFromFloat(PackedExtended x) { return Float2QENCurrency(x); }
 TQENLongCurrency LongCurrFromFloat(PackedExtended x) { return Float2QENLongCurrency(x); }
-// x x 10000 rounded to the nearest unit, an exact half to the even one. Within Currency's range
-// the exact product is rounded; beyond it (and for a NaN or an infinity) the overflow is not
-// reported: the product wraps as the other unreported money overflows do.
-Currency CurrencyFromFloat(PackedExtended x) {
-  const Extended v = x;
-  constexpr Extended kProductFits = 922337203685477.5L;  // v x 10000 stays below 2^63 - 1
-  if (std::fabs(v) < kProductFits) return detail::Float2Money<Currency>(v);
-  return Currency{detail::RoundWrapping(v * detail::kMoneyScale<Currency>)};
-}
+Currency CurrencyFromFloat(PackedExtended x) { return detail::Float2Money<Currency>(x); }
 PackedExtended FloatOf(TQENCurrency x) { return Currency2Float(x); }
 PackedExtended FloatOf(TQENLongCurrency x) { return Currency2Float(x); }
 PackedExtended FloatOf(Currency x) { return Currency2Float(x); }

@@ -3,7 +3,9 @@
 // Each function has the name, argument order, checks and result shape of its namesake in
 // TOVRINVector.h and runs the same algorithm; what differs is the element arithmetic. Stored
 // integers are compared, copied and swapped as they are; sums wrap at the stored width (32
-// bits for TQENCurrency, 64 for the others) without an error.
+// bits for TQENCurrency, 64 for the others) without an error. Every rounding and overflow
+// follows the one rule of TOVRINFinancials.h: the Extended result rounded half to even, an
+// overflow not reported (wrapped); nothing here raises for a value out of range.
 #pragma once
 
 #include "tovrin/foundation/TOVRINFinancials.h"
@@ -77,9 +79,8 @@ void QSortVector(TQENCurrencyVector& V, bool Ascending);
 
 // --- Arithmetic and transforms ----------------------------------------------------------------
 // Element := element x A + B in money terms; rsVectorIsEmpty for an empty V.
-// TQENCurrency and TQENLongCurrency: Float2QEN...(Currency2Float(element) x A + B), which
-// raises rsInvalidValue for a result out of range; V is then left as it was. Currency: the
-// stored integer x A + B x 10000, rounded half to even, overflow wrapping unreported.
+// TQENCurrency and TQENLongCurrency: Float2QEN...(Currency2Float(element) x A + B). Currency:
+// the stored integer x A + B x 10000. Each rounded half to even, overflow wrapping unreported.
 void LinearTransformVector(TQENCurrVector& V, Extended A, Extended B);
 void LinearTransformVector(TQENLongCurrVector& V, Extended A, Extended B);
 void LinearTransformVector(TQENCurrencyVector& V, Extended A, Extended B);
@@ -133,10 +134,10 @@ LongInt Vector2RankValue(const TQENCurrencyVector& V, Currency Value, bool Ascen
 // --- Conversions between vectors --------------------------------------------------------------
 // A vector of the source's length (empty for an empty source, no error). The same type is
 // copied; other money types go through the conversion services (QENCurrency2QENLongCurrency
-// and the rest, rounding half to even and raising rsInvalidValue out of range); a float
-// vector through Float2QENCurrency and Float2QENLongCurrency (the same rule and range check),
-// or for Currency x x 10000 rounded to the nearest unit, halves to even, with an overflow that
-// is not reported (the rounded product wraps modulo 2^64; a NaN or an infinity gives -2^63).
+// and the rest); a float vector through Float2QENCurrency and Float2QENLongCurrency, or for
+// Currency the Extended product x x 10000 rounded to the nearest unit. All round halves to
+// even and wrap an overflow unreported (modulo 2^64, then the low 32 bits for TQENCurrency; a
+// NaN or an infinity gives -2^63): Vector2QENCurrencyVector({0.00065L}) stores 6.
 TQENCurrVector Vector2QENCurrVector(const TQENCurrVector& V);
 TQENCurrVector Vector2QENCurrVector(const TQENLongCurrVector& V);
 TQENCurrVector Vector2QENCurrVector(const TQENCurrencyVector& V);

@@ -266,13 +266,18 @@ TEST(MoneyVectorLinearTransform, HalvesGoToEven) {
   EXPECT_EQ(StoredOf(c), (Ints{0, 2, 2}));
 }
 
-TEST(MoneyVectorLinearTransform, OutOfRangeRaisesAndLeavesTheVector) {
+TEST(MoneyVectorLinearTransform, OverflowWrapsUnreported) {
+  // 10^10 hundredths keep their low 32 bits; 2 x 10^19 millionths wrap modulo 2^64.
   auto q = Vec<TQENCurrency>({1, 10000000});
-  ExpectRaises(rsInvalidValue, [&] { LinearTransformVector(q, 1000, 0); });
-  EXPECT_EQ(StoredOf(q), (Ints{1, 10000000}));
-  auto l = Vec<TQENLongCurrency>({1, INT64_MAX / 2});
-  ExpectRaises(rsInvalidValue, [&] { LinearTransformVector(l, 4, 0); });
-  EXPECT_EQ(StoredOf(l), (Ints{1, INT64_MAX / 2}));
+  LinearTransformVector(q, 1000, 0);
+  EXPECT_EQ(StoredOf(q), (Ints{1000, 10000000000 % 4294967296}));
+  auto l = Vec<TQENLongCurrency>({1, 5000000000000000000});
+  LinearTransformVector(l, 4, 0);
+  EXPECT_EQ(StoredOf(l), (Ints{4, 1553255926290448384}));
+  // 0.00065 as B: 6.5 stored units round to 6, as the conversion rounds it.
+  auto b = Vec<Currency>({0});
+  LinearTransformVector(b, 1, 0.00065L);
+  EXPECT_EQ(StoredOf(b), (Ints{6}));
   // Currency works on its stored integer and wraps unreported: (2^63 - 1) x 2 = 2^64 - 2.
   auto c = Vec<Currency>({INT64_MAX});
   LinearTransformVector(c, 2, 0);
@@ -289,17 +294,21 @@ TEST(MoneyVectorConversions, ToFloatDividesByTheScale) {
   EXPECT_TRUE(Vector2FloatVector(std::vector<Currency>{}).empty());
 }
 
-TEST(MoneyVectorConversions, FromFloatRoundsTheExactProduct) {
+TEST(MoneyVectorConversions, FromFloatRoundsTheExtendedProduct) {
   const TQENFloatVector f{1.23456L};
   EXPECT_EQ(StoredOf(Vector2QENCurrencyVector(f)), (Ints{12346}));
-  // 0.125 is a true half of a hundredth; 2.675L lies below 2.675 (see TOVRINFinancials_ref.py).
+  // 0.125 is a true half of a hundredth; 2.675L x 100 rounds to 267.5 in Extended, as 0.00065L
+  // x 10000 does to 6.5 (see TOVRINFinancials_ref.py).
   const TQENFloatVector g{0.125L, 0.375L, 2.675L, -0.125L};
-  EXPECT_EQ(StoredOf(Vector2QENCurrVector(g)), (Ints{12, 38, 267, -12}));
+  EXPECT_EQ(StoredOf(Vector2QENCurrVector(g)), (Ints{12, 38, 268, -12}));
   EXPECT_EQ(StoredOf(Vector2QENLongCurrVector(TQENFloatVector{0.0078125L, 0.0000005L})),
-            (Ints{7812, 1}));
+            (Ints{7812, 0}));
+  EXPECT_EQ(StoredOf(Vector2QENCurrencyVector(TQENFloatVector{0.00065L, 0.00035L})), (Ints{6, 4}));
   EXPECT_EQ(StoredOf(Vector2QENCurrencyVector(TQENFloatVector{0.000025L, 0.00015L})), (Ints{0, 2}));
   EXPECT_TRUE(Vector2QENCurrVector(TQENFloatVector{}).empty());
-  ExpectRaises(rsInvalidValue, [] { Vector2QENCurrVector(TQENFloatVector{1, 1e300L}); });
+  // Overflow wraps as everywhere in money: 2^31 hundredths become -2^31.
+  EXPECT_EQ(StoredOf(Vector2QENCurrVector(TQENFloatVector{1, 21474836.48L})),
+            (Ints{100, INT32_MIN}));
 }
 
 TEST(MoneyVectorConversions, FloatToCurrencyOverflowIsNotReported) {
@@ -325,8 +334,9 @@ TEST(MoneyVectorConversions, BetweenMoneyTypes) {
   EXPECT_EQ(StoredOf(Vector2QENCurrVector(Vec<Currency>({150, -50}))), (Ints{2, 0}));
   EXPECT_EQ(StoredOf(Vector2QENLongCurrVector(Vec<Currency>({-15}))), (Ints{-1500}));
   EXPECT_TRUE(Vector2QENLongCurrVector(std::vector<Currency>{}).empty());
-  ExpectRaises(rsInvalidValue, [] { Vector2QENCurrVector(Vec<Currency>({214748364750})); });
-  ExpectRaises(rsInvalidValue, [] { Vector2QENLongCurrVector(Vec<Currency>({INT64_MAX})); });
+  // Past the range: 2147483647.5 hundredths round to 2^31 and wrap; (2^63 - 1) x 100 wraps to -100.
+  EXPECT_EQ(StoredOf(Vector2QENCurrVector(Vec<Currency>({214748364750}))), (Ints{INT32_MIN}));
+  EXPECT_EQ(StoredOf(Vector2QENLongCurrVector(Vec<Currency>({INT64_MAX}))), (Ints{-100}));
 }
 
 }  // namespace

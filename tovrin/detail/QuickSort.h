@@ -14,6 +14,8 @@
 #pragma once
 
 #include <cmath>
+#include <cstdint>
+#include <cstring>
 #include <type_traits>
 #include <utility>
 #include <vector>
@@ -118,6 +120,41 @@ bool EqualElementsAreIdentical(const std::vector<T>& V) {
   }
 }
 
+// An integer key that orders packed Extended values as their `<` does: the magnitude
+// (15-bit exponent above the 64-bit mantissa) with the sign applied, so that -0 and +0 get the
+// same key. It holds for canonical encodings that are not NaN (zeros and denormals with the
+// explicit integer bit clear, normals and infinities with it set); PackedKeysAreExact checks
+// a vector for them.
+struct PackedExtendedFields {
+  std::uint64_t mantissa;
+  std::uint16_t signExponent;
+};
+inline PackedExtendedFields FieldsOf(const PackedExtended& x) {
+  PackedExtendedFields f;
+  std::memcpy(&f.mantissa, &x, 8);
+  std::memcpy(&f.signExponent, reinterpret_cast<const unsigned char*>(&x) + 8, 2);
+  return f;
+}
+inline __int128 PackedKey(const PackedExtended& x) {
+  const PackedExtendedFields f = FieldsOf(x);
+  const auto magnitude = static_cast<__int128>(
+      (static_cast<unsigned __int128>(f.signExponent & 0x7FFF) << 64) | f.mantissa);
+  const __int128 sign = -static_cast<__int128>(f.signExponent >> 15);  // 0 or all ones
+  return (magnitude ^ sign) - sign;
+}
+inline bool PackedKeysAreExact(const std::vector<PackedExtended>& V) {
+  for (const PackedExtended& x : V) {
+    const PackedExtendedFields f = FieldsOf(x);
+    const unsigned exponent = f.signExponent & 0x7FFFu;
+    const bool integerBit = (f.mantissa >> 63) != 0;
+    const bool canonical = exponent == 0 ? !integerBit
+                                         : integerBit && (exponent != 0x7FFFu ||
+                                                          f.mantissa == (std::uint64_t{1} << 63));
+    if (!canonical) return false;
+  }
+  return true;
+}
+
 // Sorts a vector in place by the elements' own `<` (exact, also for floats), with SwapXY
 // exchanging elements (found by argument-dependent lookup, so the money types' overloads
 // serve too). PackedExtended elements are compared as Extended values. Where equal elements
@@ -128,9 +165,18 @@ void QuickSortVector(std::vector<T>& V, bool Ascending) {
   const LongInt n = static_cast<LongInt>(V.size());
   if (n < 2) return;
   T* const data = V.data();  // position p is data[p - 1]
+  auto swap = [data](LongInt p, LongInt q) { SwapXY(data[p - 1], data[q - 1]); };
+  if constexpr (std::is_same_v<T, PackedExtended>) {
+    // The same comparisons through integer keys, which read the packed bytes directly.
+    if (PackedKeysAreExact(V)) {
+      QuickSortPositions(
+          n, Ascending, [data](LongInt p) { return PackedKey(data[p - 1]); },
+          [](__int128 a, __int128 b) { return a < b; }, swap);
+      return;
+    }
+  }
   auto key = [data](LongInt p) { return static_cast<ValueOf<T>>(data[p - 1]); };
   auto less = [](ValueOf<T> a, ValueOf<T> b) { return a < b; };
-  auto swap = [data](LongInt p, LongInt q) { SwapXY(data[p - 1], data[q - 1]); };
   if (!EqualElementsAreIdentical(V)) {
     QuickSortPositions(n, Ascending, key, less, swap);
     return;

@@ -3,15 +3,18 @@
 // The three money types hold a whole number of stored units: TQENCurrency hundredths,
 // Currency ten-thousandths and TQENLongCurrency millionths of an amount.
 //
-// Rounding rule (every conversion that can lose digits): the result is the stored integer
-// nearest to the exact value (the exact product X * scale for a float, the exact quotient for
-// a conversion to a coarser money type); an exact half goes to the even integer. The product
-// is never rounded to Extended first, so Float2QENCurrency(0.125) is 12 (a true half) while
-// Float2QENCurrency(2.675L) is 267: the binary value of 2.675L lies just below 2.675, although
-// its product by 100 rounded to Extended would be exactly 267.5.
+// Rounding rule (every conversion that can lose digits, and every money operation of the
+// currency units): all float work is done in Extended, so a float X becomes the stored integer
+// nearest to the Extended product X * scale, an exact half going to the even integer; a
+// conversion to a coarser money type rounds the quotient of the stored integers the same way
+// (that quotient is never moved across a half by rounding). Float2QENCurrency(0.125) is 12 and
+// Float2QENCurrency(2.675L) is 268: the binary value of 2.675L lies just below 2.675, but its
+// product by 100 rounded to Extended is exactly 267.5.
 //
-// Range rule: a result that does not fit the stored integer of its type, and a NaN or an
-// infinity, raise EMathError(rsInvalidValue); nothing is stored then.
+// Overflow rule: overflow is not reported. A rounded value beyond the stored integer's range is
+// reduced modulo 2^64 into 64 bits (two's complement), and a TQENCurrency keeps the low 32 bits
+// of that; a NaN or an infinity gives the integer indefinite -2^63 (0 in a TQENCurrency). No
+// conversion raises.
 #pragma once
 
 #include <cmath>
@@ -29,13 +32,13 @@ namespace tovrin {
 Extended Currency2Float(TQENCurrency X);
 Extended Currency2Float(TQENLongCurrency X);
 Extended Currency2Float(Currency X);
-// X as an amount: round(X * 100) and round(X * 1000000) by the rule above.
+// X as an amount: round(X * 100) and round(X * 1000000) by the rules above.
 TQENCurrency Float2QENCurrency(Extended X);
 TQENLongCurrency Float2QENLongCurrency(Extended X);
 
 // --- Between money types ----------------------------------------------------------------------
-// QENCurrency2QENLongCurrency and QENCurrency2Currency are exact and never raise; the others
-// round by the rule above and raise rsInvalidValue for a result out of range.
+// QENCurrency2QENLongCurrency and QENCurrency2Currency are exact; the others round and wrap by
+// the rules above.
 TQENLongCurrency QENCurrency2QENLongCurrency(TQENCurrency X);
 Currency QENCurrency2Currency(TQENCurrency X);
 TQENCurrency QENLongCurrency2QENCurrency(TQENLongCurrency X);  // round(stored / 10000)
@@ -105,8 +108,7 @@ inline Extended RoundHalfEven(Extended X) {
   return X < 0 ? -r : r;
 }
 
-// The rounding of the money arithmetic whose overflow is not reported (products by a
-// constant, the Currency linear transform): X rounded half to even and reduced
+// The rounding of all money arithmetic and conversion: X rounded half to even and reduced
 // modulo 2^64 into an Int64 (two's complement); a NaN or an infinity gives -2^63, the x87
 // integer indefinite. Storing into a TQENCurrency then keeps the low 32 bits.
 Int64 RoundWrapping(Extended X);
@@ -115,9 +117,9 @@ Int64 RoundWrapping(Extended X);
 // arithmetic (0 < D <= 2^32).
 Int64 DivRoundHalfEven(Int64 Q, Int64 D);
 
-// Float X times the money scale of T, rounded by the rule of this header into T's stored
-// integer; raises rsInvalidValue out of range. Float2QENCurrency and Float2QENLongCurrency
-// are this for their types; the Currency instance serves float-to-Currency vector conversion.
+// Float X times the money scale of T, rounded and wrapped by the rules of this header into T's
+// stored integer. Float2QENCurrency and Float2QENLongCurrency are this for their types; the
+// Currency instance serves float-to-Currency vector conversion.
 template <typename T>
 T Float2Money(Extended X);
 template <>

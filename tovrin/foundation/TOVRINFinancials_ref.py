@@ -2,9 +2,10 @@
 """Reference values for TOVRINFinancials_test.cpp, in exact rational arithmetic.
 
 For each decimal literal L (as written with an L suffix in C++), find the 80-bit value the
-compiler stores (nearest with a 64-bit significand, ties to even), multiply it exactly by the
-money scale and round to the nearest integer, exact halves to even. Also report what rounding
-the product to 80 bits first would give, to show which cases tell the two rules apart.
+compiler stores (nearest with a 64-bit significand, ties to even), multiply it by the money
+scale in 80-bit arithmetic (the exact product rounded to 64 significant bits, ties to even) and
+round that to the nearest integer, exact halves to even: the money rule. Also report what
+rounding the exact product would give, to show which cases tell the two rules apart.
 """
 from fractions import Fraction
 import math
@@ -36,11 +37,12 @@ def round_half_even(q: Fraction) -> int:
 
 for lit, scale in [("1.005", 100), ("2.675", 100), ("0.125", 100), ("1.015", 100),
                    ("0.0000005", 1000000), ("1.23456", 10000), ("1.0000005", 1000000),
-                   ("-1.005", 100), ("1234567.885", 100), ("0.00015", 10000)]:
+                   ("-1.005", 100), ("1234567.885", 100), ("0.00015", 10000),
+                   ("0.00065", 10000), ("0.00035", 10000)]:
     x = nearest_ext(Fraction(lit))
     exact = round_half_even(x * scale)
     prod80 = nearest_ext(x * scale)
     twostep = round_half_even(prod80)
-    print(f"{lit}L x {scale}: exact product rounds to {exact}; "
-          f"rounded product {float(prod80)!r} gives {twostep}; "
+    print(f"{lit}L x {scale}: the 80-bit product {float(prod80)!r} rounds to {twostep}; "
+          f"the exact product would round to {exact}; "
           f"literal {'above' if x > Fraction(lit) else 'below' if x < Fraction(lit) else 'equal to'} decimal")

@@ -33,7 +33,13 @@ Extended MaxXY(Extended X, Extended Y) { return Y > X ? Y : X; }
 Int64 MaxXY(Int64 X, Int64 Y) { return Y > X ? Y : X; }
 
 Extended SignXY(Extended X, Extended Y) { return Y >= 0 ? std::fabs(X) : -std::fabs(X); }
-Extended XtoY(Extended X, Extended Y) { return std::pow(X, Y); }
+// The C library's powl forms the powers -1 to 3 by multiplication (and 1 / X); the same
+// products here give its results without the call.
+Extended XtoY(Extended X, Extended Y) {
+  if (Y == 2) return X * X;
+  if (Y == 3) return X * X * X;
+  return std::pow(X, Y);
+}
 Extended TwoToY(Extended Y) { return std::exp2(Y); }
 Extended QENLog10(Extended X) {
   // The C library's log10 may miss an exact power of ten by a unit in the last place; the

@@ -13,6 +13,7 @@
 #include <chrono>
 #include <cmath>
 #include <cstddef>
+#include <cstring>
 #include <functional>
 #include <mutex>
 #include <thread>
@@ -106,8 +107,18 @@ class ThreadSource {
   ThreadSource() : stream_(CurrentStream()) {}
   Extended operator()() { return UniformFromBits(NextBits(stream_)); }
   // The next uniform rounded to double, without the trip through the x87 unit: rounding the
-  // 64-bit word to 53 bits and scaling by 2^-64 rounds the exact uniform the same way.
-  double NextDouble() { return static_cast<double>(NextBits(stream_)) * 0x1p-64; }
+  // 64-bit word to 53 bits and scaling by 2^-64 rounds the exact uniform the same way. A word
+  // of 2^63 or more is halved first with its last bit kept as a sticky bit (it lies below the
+  // rounding position), which rounds the same way; the choice is made without a branch,
+  // which would go either way at random.
+  double NextDouble() {
+    const std::uint64_t bits = NextBits(stream_);
+    const std::uint64_t high = bits >> 63;
+    const std::uint64_t mask = 0 - high;
+    const std::uint64_t word = bits ^ ((bits ^ ((bits >> 1) | (bits & 1))) & mask);
+    const auto factor = static_cast<double>(static_cast<std::int64_t>(high + 1));  // 1 or 2
+    return static_cast<double>(static_cast<std::int64_t>(word)) * 0x1p-64 * factor;
+  }
 
  private:
   ThreadStream& stream_;
@@ -117,20 +128,113 @@ class ThreadSource {
 // Conversions to integers. Truncating NaN or a value past the Int64 range has no integer
 // result (and would be undefined in C++): it raises rsInvalidValue.
 
-Int64 TruncChecked(Extended x) {
-  const Extended t = std::trunc(x);
-  if (!(t >= -0x1p63L && t < 0x1p63L)) RaiseMathError(rsInvalidValue);
-  return static_cast<Int64>(t);
+// The x87 unit would change its rounding mode twice for each truncation, which costs more than
+// the rest of a typical draw: the truncations work by arithmetic below 2^53 and read the bits
+// of the 80-bit value (64-bit mantissa with its leading bit explicit, 15-bit biased exponent)
+// above.
+struct ExtendedBits {
+  std::uint64_t mantissa;
+  bool negative;
+  int exponent;  // unbiased: the value is mantissa 2^(exponent - 63)
+  bool nan;
+};
+
+inline ExtendedBits BitsOf(Extended x) {
+  unsigned char bytes[sizeof(Extended)];
+  std::memcpy(bytes, &x, sizeof(Extended));
+  ExtendedBits b;
+  std::memcpy(&b.mantissa, bytes, 8);
+  std::uint16_t signExponent;
+  std::memcpy(&signExponent, bytes + 8, 2);
+  b.negative = (signExponent & 0x8000) != 0;
+  b.exponent = (signExponent & 0x7FFF) - 16383;
+  b.nan = (signExponent & 0x7FFF) == 0x7FFF && (b.mantissa << 1) != 0;
+  return b;
+}
+
+// Trunc(x) for |x| < 2^63 (the exponent is below 63).
+inline Int64 SmallTrunc(const ExtendedBits& b) {
+  if (b.exponent < 0) return 0;
+  const auto magnitude = static_cast<Int64>(b.mantissa >> (63 - b.exponent));
+  return b.negative ? -magnitude : magnitude;
+}
+
+// -2^63 itself: the one value with exponent 63 that has an Int64.
+inline bool IsMinInt64(const ExtendedBits& b) {
+  return b.negative && b.exponent == 63 && b.mantissa == 0x8000000000000000ULL;
+}
+
+// Trunc(x) for |x| < 2^62, by arithmetic: adding and removing 1.5 2^63 rounds x to the
+// nearest integer (the sum's last mantissa bit is worth 1), and one step toward zero makes it
+// Trunc. A zero result is +0.
+[[gnu::always_inline]] inline Extended NearTrunc(Extended x) {
+  constexpr Extended kShift = 0x1.8p63L;
+  Extended nearest = (x + kShift) - kShift;
+  if (x >= 0) {
+    if (nearest > x) nearest -= 1;
+  } else if (nearest < x) {
+    nearest += 1;
+  }
+  return nearest;
+}
+
+// std::trunc(x) in the 80-bit type, up to the sign of a zero result.
+Extended TruncExtended(Extended x) {
+  if (std::fabs(x) < 0x1p62L) [[likely]]
+    return NearTrunc(x);
+  return std::trunc(x);
+}
+
+// Below 2^53 the whole number converts to double exactly, and from there to Int64 in one step.
+// The step toward zero is taken without a branch: whether rounding went up or down is
+// random in the generators.
+[[gnu::always_inline]] inline bool SmallTruncInt64(Extended x, Int64& result) {
+  if (!(std::fabs(x) < 0x1p53L)) return false;
+  constexpr Extended kShift = 0x1.8p63L;
+  const Extended nearest = (x + kShift) - kShift;
+  const auto whole = static_cast<Int64>(static_cast<double>(nearest));
+  const int overshoot = static_cast<int>(x >= 0) & static_cast<int>(nearest > x);
+  const int undershoot = static_cast<int>(x < 0) & static_cast<int>(nearest < x);
+  result = whole - overshoot + undershoot;
+  return true;
+}
+
+[[gnu::noinline]] Int64 TruncCheckedFromBits(Extended x) {
+  const ExtendedBits b = BitsOf(x);
+  if (b.exponent < 63) return SmallTrunc(b);
+  if (IsMinInt64(b)) return std::numeric_limits<Int64>::min();
+  RaiseMathError(rsInvalidValue);
+}
+
+[[gnu::always_inline]] inline Int64 TruncChecked(Extended x) {
+  Int64 small;
+  if (SmallTruncInt64(x, small)) [[likely]]
+    return small;
+  return TruncCheckedFromBits(x);
 }
 
 // For a candidate that a range test refuses next: values past either end of Int64 (from the
 // logarithm of a zero uniform) saturate, so the test sees them as out of range. NaN raises.
-Int64 TruncSaturated(Extended x) {
-  const Extended t = std::trunc(x);
-  if (std::isnan(t)) RaiseMathError(rsInvalidValue);
-  if (t >= 0x1p63L) return std::numeric_limits<Int64>::max();
-  if (t < -0x1p63L) return std::numeric_limits<Int64>::min();
-  return static_cast<Int64>(t);
+[[gnu::noinline]] Int64 TruncSaturatedFromBits(Extended x) {
+  const ExtendedBits b = BitsOf(x);
+  if (b.exponent < 63) return SmallTrunc(b);
+  if (b.nan) RaiseMathError(rsInvalidValue);
+  return b.negative ? std::numeric_limits<Int64>::min() : std::numeric_limits<Int64>::max();
+}
+
+[[gnu::always_inline]] inline Int64 TruncSaturated(Extended x) {
+  Int64 small;
+  if (SmallTruncInt64(x, small)) [[likely]]
+    return small;
+  return TruncSaturatedFromBits(x);
+}
+
+// XtoY, with the squares and cubes of the methods (Gamma's (1 + c x)^3, the body's power for
+// Shape 1/2) formed in place: XtoY gives the same products.
+[[gnu::always_inline]] inline Extended Power(Extended x, Extended y) {
+  if (y == 2) return x * x;
+  if (y == 3) return x * x * x;
+  return XtoY(x, y);
 }
 
 // ---------------------------------------------------------------------------------------------
@@ -210,6 +314,34 @@ Extended ExponentialVariate(Gen& gen) {
 // ---------------------------------------------------------------------------------------------
 // Gamma and its relatives
 
+// Comparisons with a logarithm on one side are first settled from the logarithm in double:
+// only where the two sides lie within the bound below does the Extended logarithm decide.
+//
+// ln x in double for a positive x in the normal double range, with a bound on its distance
+// from std::log(x) in Extended: rounding x to double moves ln x by 1.2e-16, the double log is
+// within an ulp (2.3e-16 |ln x|) and so is the Extended one; 5e-16 (1 + |ln x|) covers all.
+struct BoundedLog {
+  double value;
+  double bound;
+};
+inline bool DoubleLog(Extended x, BoundedLog& out) {
+  const auto xd = static_cast<double>(x);
+  if (!(xd > 0x1p-1000 && xd < 0x1p1000)) return false;
+  const double value = std::log(xd);
+  out = {value, 5e-16 * (1 + std::fabs(value))};
+  return true;
+}
+
+enum class Settled { kNo, kYes, kUnsure };
+
+// a < b for values known within a +- ea and b +- eb (and the rounding of this test itself).
+inline Settled SettleLess(Extended a, Extended ea, Extended b, Extended eb) {
+  const Extended slack = ea + eb + 0x1p-61L * (std::fabs(a) + std::fabs(b));
+  if (a + slack < b) return Settled::kYes;
+  if (a - slack > b) return Settled::kNo;
+  return Settled::kUnsure;
+}
+
 // Marsaglia and Tsang, for Shape > 1.
 template <typename Gen>
 Extended GammaLargeShape(Extended shape, Gen& gen) {
@@ -220,11 +352,24 @@ Extended GammaLargeShape(Extended shape, Gen& gen) {
     Extended t;
     do {
       x = StandardNormal(gen);
-      t = XtoY(1 + c * x, 3);
+      t = Power(1 + c * x, 3);
     } while (!(t > 0));
     const Extended u = gen();
     const Extended x2 = x * x;
     if (u < 1 - 0.0331L * x2 * x2) return d * t;
+    // ln u < x^2 / 2 + d (1 - t + ln t), the logarithms first in double: the right side then
+    // differs from its Extended value by d times the bound of ln t and its roundings.
+    BoundedLog logU;
+    BoundedLog logT;
+    if (DoubleLog(u, logU) && DoubleLog(t, logT)) {
+      const Extended lnT = logT.value;
+      const Extended right = 0.5L * x2 + d * (1 - t + lnT);
+      const Extended rightError =
+          d * Extended(logT.bound) * 1.01L + 0x1p-60L * (0.5L * x2 + d * (1 + t + std::fabs(lnT)));
+      const Settled settled = SettleLess(logU.value, logU.bound, right, rightError);
+      if (settled == Settled::kYes) return d * t;
+      if (settled == Settled::kNo) continue;
+    }
     if (std::log(u) < 0.5L * x2 + d * (1 - t + std::log(t))) return d * t;
   }
 }
@@ -248,24 +393,55 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
     const Extended u = gen();
     if (u >= 1) continue;
     Extended x;
-    Extended w;
-    if (u > p) {
-      if (!haveTLnT) {
-        tLnT = t * std::log(t);
-        haveTLnT = true;
-      }
+    Extended w = 0;        // in the tail, an estimate of t ln x - t ln t within wError
+    Extended wError = -1;  // -1: w is not known yet
+    const bool tail = u > p;
+    if (tail) {
       x = t - std::log((1 - u) / (1 - p));
-      w = t * std::log(x) - tLnT;
+      BoundedLog logX;
+      BoundedLog logT;
+      if (DoubleLog(x, logX) && DoubleLog(t, logT)) {
+        const Extended lnX = logX.value;
+        const Extended lnT = logT.value;
+        w = t * lnX - t * lnT;
+        wError = t * Extended(logX.bound + logT.bound) * 1.01L +
+                 0x1p-60L * t * (std::fabs(lnX) + std::fabs(lnT));
+      }
     } else {
       if (u <= floorBound && !haveW0) {
         w0 = p * XtoY(kTiny / t, shape);
         haveW0 = true;
       }
       if (u <= floorBound && u <= w0) return 0;
-      x = t * XtoY(u / p, 1 / shape);
+      x = t * Power(u / p, 1 / shape);
       w = x;
+      wError = 0;
     }
     const Extended u2 = gen();
+    // Accept if w < 1 - u2, or u2 <= 0, or u2 (1 + w) < 1 and w < -ln u2: first from the
+    // estimates, then, where they cannot tell, from the exact w and logarithm.
+    if (wError >= 0) {
+      const Settled below = SettleLess(w, wError, 1 - u2, 0);
+      if (below == Settled::kYes) return x;
+      if (below == Settled::kNo) {
+        if (u2 <= 0) return x;
+        const Settled product = SettleLess(u2 * (1 + w), u2 * wError, 1, 0);
+        if (product == Settled::kNo) continue;
+        BoundedLog logU2;
+        if (product == Settled::kYes && DoubleLog(u2, logU2)) {
+          const Settled beyond = SettleLess(w, wError, -logU2.value, logU2.bound);
+          if (beyond == Settled::kYes) return x;
+          if (beyond == Settled::kNo) continue;
+        }
+      }
+    }
+    if (tail) {
+      if (!haveTLnT) {
+        tLnT = t * std::log(t);
+        haveTLnT = true;
+      }
+      w = t * std::log(x) - tLnT;
+    }
     if (w < 1 - u2) return x;
     if (u2 <= 0) return x;
     if (u2 * (1 + w) < 1 && w < -std::log(u2)) return x;
@@ -353,7 +529,9 @@ Extended StudentTVariate(LongInt df, Gen& gen) {
     const Extended x = (2 * v - 1) * m / u;
     const Extended x2 = x * x;
     if (x2 <= 5 - s * u) return x;
-    if (c < (x2 + 3) * u) continue;
+    // The quick rejection c < (x^2 + 3) u only holds the acceptance region inside it from three
+    // degrees of freedom on; below that the exact test alone decides.
+    if (df >= 3 && c < (x2 + 3) * u) continue;
     if (u <= XtoY(1 + x2 / n, e)) return x;
   }
 }
@@ -462,6 +640,9 @@ Extended InverseGaussianVariate(Extended lambda, Extended omega, Gen& gen) {
 // held as doubles.
 template <typename Gen>
 Int64 BinomialFromMode(LongInt n, Extended prob, Gen& gen) {
+  // The mode's probability would need ln 0 here; the outcome is certain anyway.
+  if (prob == 0) return 0;
+  if (prob == 1) return n;
   const Extended trials = n;
   const Int64 mode = TruncChecked((trials + 1) * prob);
   const Extended modeX = static_cast<Extended>(mode);
@@ -528,15 +709,102 @@ inline Extended StirlingTail(Extended a) {
   return (13860 - (462 - (132 - (99 - 140 / a2) / a2) / a2) / a2) / a / 166320;
 }
 
+// BTPE's test v <= f, f = prod (g/i - r) over i = M + 1..y, or 1 / prod over i = y + 1..M,
+// evaluated in Extended factor by factor. The same product in double settles the test first
+// unless v lies within its error bound: for i <= 7 (N + 1)/9, g/i >= 9 r / 7 (g / r = N + 1),
+// so g/i - r >= (g/i + r) / 8, and each factor's rounding in either precision (g and r
+// rounded to double, the quotient, the difference, the product) stays below
+// 18 (2^-53 + 2^-64) < 2.1e-15 of it: the double and Extended products differ by less than
+// 5e-15 per factor.
+inline bool BtpeRecursionAccepts(Extended v, Int64 mode, Int64 y, Extended g, Extended r,
+                                 Extended trials) {
+  const Int64 from = mode < y ? mode : y;
+  const Int64 to = mode < y ? y : mode;
+  const Int64 count = to - from;
+  if (count <= 1000 && to < (Int64{1} << 53) && 9 * static_cast<Extended>(to) <= 7 * (trials + 1)) {
+    const double gd = static_cast<double>(g);
+    const double rd = static_cast<double>(r);
+    double product = 1;
+    for (Int64 i = from + 1; i <= to; ++i) product *= gd / static_cast<double>(i) - rd;
+    const double f = mode < y ? product : 1 / product;
+    if (f > 1e-290 && f < 1e290) {
+      const double slack = 5e-15 * static_cast<double>(count + 2) * f;
+      if (v < f - slack) return true;
+      if (v > f + slack) return false;
+    }
+  }
+  Extended f = 1;
+  for (Int64 i = mode; i < y;) {
+    ++i;
+    f = f * (g / static_cast<Extended>(i) - r);
+  }
+  for (Int64 i = y; i < mode;) {
+    ++i;
+    f = f / (g / static_cast<Extended>(i) - r);
+  }
+  return v <= f;
+}
+
+// BTPE's first attempt, where most draws end: u = U1 p4 <= p1 gives y = Trunc(xm - p1 v + u)
+// without the other regions' constants. p4 depends on all of the set-up, which in Extended
+// costs more than the rest of such a draw, so the set-up is first run in double: p1 exactly
+// (unless 2.195 sqrt(npq) - 4.6 q lies within 1e-12 of a whole number), and p4 with a
+// relative error below
+//   eps = 2 (6 fm / (p1 - 1/2) + 40) (2^-53 + 2^-64),
+// against the Extended p4: each quantity's rounding (about 40 roundings and constants in all)
+// is bounded by its operands' relative errors, and the only cancellations are fm - xl and
+// xr - fm, both at least p1 - 1/2 apart while fm is their scale. Both the region test and
+// Trunc are settled when u and xm - p1 v + u lie farther than their error bounds from p1 and
+// from a whole number; otherwise (or for N at or above 2^52) the Extended set-up decides.
+inline bool BtpeFirstAttemptInDouble(Int64 n, Extended p, Extended q, Extended np, Int64 mode,
+                                     Extended first, Extended second, Int64& y) {
+  if (n >= (Int64{1} << 52)) return false;
+  constexpr double kUnit = 0x1p-53 + 0x1p-64;
+  const double pd = static_cast<double>(p);
+  const double qd = static_cast<double>(q);
+  const double npd = static_cast<double>(np);
+  const double spread = 2.195 * std::sqrt(npd * qd) - 4.6 * qd;
+  const double whole = std::floor(spread);
+  if (!(spread - whole > 1e-12 * spread && whole + 1 - spread > 1e-12 * spread)) return false;
+  const double p1 = whole + 0.5;
+  const double modeD = static_cast<double>(mode);
+  const double fm = npd + pd;
+  const double xm = modeD + 0.5;
+  const double xl = xm - p1;
+  const double xr = xm + p1;
+  const double c = 0.134 + 20.5 / (15.3 + modeD);
+  double a = (fm - xl) / (fm - xl * pd);
+  const double lambdaL = a * (1 + 0.5 * a);
+  a = (xr - fm) / (xr * qd);
+  const double lambdaR = a * (1 + 0.5 * a);
+  const double p4 = p1 * (1 + 2 * c) + c / lambdaL + c / lambdaR;
+  const double eps = 2 * (6 * fm / (p1 - 0.5) + 40) * kUnit;
+  const double u = static_cast<double>(first) * p4;
+  if (!(u + u * (eps + 3 * kUnit) < p1)) return false;
+  const double v = static_cast<double>(second);
+  const double z = xm - p1 * v + u;
+  const double error = (eps + 8 * kUnit) * (xm + p1 + u + z);
+  const double low = std::floor(z - error);
+  if (!(z - error >= 0) || low != std::floor(z + error)) return false;
+  y = static_cast<Int64>(low);
+  return true;
+}
+
 // Kachitvichyanukul and Schmeiser's BTPE for N p > 30, p <= 0.5.
 template <typename Gen>
 Int64 BinomialBtpe(Int64 n, Extended p, Extended q, Extended np, Gen& gen) {
-  const Extended trials = static_cast<Extended>(n);
-  const Extended npq = np * q;
   const Extended fm = np + p;
   const Int64 mode = TruncChecked(fm);
+  // The first attempt's uniforms.
+  Extended first = gen();
+  Extended second = gen();
+  Int64 quick;
+  if (BtpeFirstAttemptInDouble(n, p, q, np, mode, first, second, quick)) return quick;
+
+  const Extended trials = static_cast<Extended>(n);
+  const Extended npq = np * q;
   const Extended modeX = static_cast<Extended>(mode);
-  const Extended p1 = std::trunc(2.195L * std::sqrt(npq) - 4.6L * q) + 0.5L;
+  const Extended p1 = TruncExtended(2.195L * std::sqrt(npq) - 4.6L * q) + 0.5L;
   const Extended xm = modeX + 0.5L;
   const Extended xl = xm - p1;
   const Extended xr = xm + p1;
@@ -550,9 +818,13 @@ Int64 BinomialBtpe(Int64 n, Extended p, Extended q, Extended np, Gen& gen) {
   const Extended p4 = p3 + c / lambdaR;
   const Extended r = p / q;
   const Extended g = (trials + 1) * r;
-  for (;;) {
-    const Extended u = gen() * p4;
-    Extended v = gen();
+  for (bool drawn = true;; drawn = false) {
+    if (!drawn) {
+      first = gen();
+      second = gen();
+    }
+    const Extended u = first * p4;
+    Extended v = second;
     Int64 y;
     if (u <= p1) return TruncSaturated(xm - p1 * v + u);
     if (u <= p2) {
@@ -572,20 +844,21 @@ Int64 BinomialBtpe(Int64 n, Extended p, Extended q, Extended np, Gen& gen) {
     const Extended yX = static_cast<Extended>(y);
     const Extended k = std::fabs(yX - modeX);
     if (k <= 20 || k >= npq / 2 - 1) {
-      Extended f = 1;
-      for (Int64 i = mode; i < y;) {
-        ++i;
-        f = f * (g / static_cast<Extended>(i) - r);
-      }
-      for (Int64 i = y; i < mode;) {
-        ++i;
-        f = f / (g / static_cast<Extended>(i) - r);
-      }
-      if (v <= f) return y;
+      if (BtpeRecursionAccepts(v, mode, y, g, r, trials)) return y;
       continue;
     }
     const Extended rho = (k / npq) * ((k * (k / 3 + 0.625L) + 0.1666666666666L) / npq + 0.5L);
     const Extended t = -k * k / (2 * npq);
+    // The squeeze, first from ln v in double.
+    BoundedLog approximateLogV;
+    if (DoubleLog(v, approximateLogV)) {
+      const Settled below = SettleLess(approximateLogV.value, approximateLogV.bound, t - rho, 0);
+      if (below == Settled::kYes) return y;
+      if (below == Settled::kNo &&
+          SettleLess(t + rho, 0, approximateLogV.value, approximateLogV.bound) == Settled::kYes) {
+        continue;
+      }
+    }
     const Extended logV = std::log(v);
     if (logV < t - rho) return y;
     if (logV > t + rho) continue;
@@ -603,7 +876,7 @@ Int64 BinomialBtpe(Int64 n, Extended p, Extended q, Extended np, Gen& gen) {
 
 template <typename Gen>
 Int64 BinomialVariate(Int64 n, Extended prob, Gen& gen) {
-  const Extended p = MinXY(prob, 1 - prob);
+  const Extended p = 1 - prob < prob ? 1 - prob : prob;  // MinXY(P, 1 - P)
   const Extended q = 1 - p;
   const Extended np = static_cast<Extended>(n) * p;
   const Int64 y = np <= 30 ? BinomialInversion(n, p, q, gen) : BinomialBtpe(n, p, q, np, gen);
@@ -625,7 +898,7 @@ Int64 NegativeBinomialVariate(Extended r, Extended prob, Gen& gen) {
       do {
         u = gen();
       } while (!(u > 0));
-      count += std::trunc(std::log(u) / logP);
+      count += TruncExtended(std::log(u) / logP);
     }
     rho = r - static_cast<Extended>(whole);
   }
@@ -986,8 +1259,8 @@ Extended Random_Cauchy() {
   return CauchyVariate(gen);
 }
 
-Int64 Random_Poisson(Extended& Mu, TRandomGenFunction Gen) { return PoissonVariate(Mu, Gen); }
-Int64 Random_Poisson(Extended& Mu) {
+Int64 Random_Poisson(const Extended& Mu, TRandomGenFunction Gen) { return PoissonVariate(Mu, Gen); }
+Int64 Random_Poisson(const Extended& Mu) {
   ThreadSource gen;
   return PoissonVariate(Mu, gen);
 }

@@ -123,7 +123,9 @@ Extended Random_Weibull(Extended Shape);
 // for A <= 0 or B <= 0.
 Extended Random_Beta(Extended A, Extended B, TRandomGenFunction Gen);
 Extended Random_Beta(Extended A, Extended B);
-// Student t by ratio of uniforms. Raises rsInvalidValue for DF < 1.
+// Student t by ratio of uniforms with a quick acceptance and, from DF = 3 on, a quick rejection
+// (below 3 it would cut into the acceptance region; DF = 1 gives a standard Cauchy variate).
+// Raises rsInvalidValue for DF < 1.
 Extended Random_T(LongInt DF, TRandomGenFunction Gen);
 Extended Random_T(LongInt DF);
 
@@ -151,7 +153,8 @@ Extended Random_Inv_Gauss(Extended Lambda, Extended Omega);
 
 // --- Binomial and negative binomial ---
 // Binomial(N, P) by inversion walking outward from the mode Trunc((N + 1) P); the mode is returned
-// at once when the first uniform lies below its probability. Arguments are not checked. If rounding
+// at once when the first uniform lies below its probability. P = 0 gives 0 and P = 1 gives N,
+// drawing nothing. Arguments are not otherwise checked. If rounding
 // leaves the walk unfinished once both ends are reached (it could only step on for ever),
 // rsInvalidValue is raised.
 Int64 Random_Binomial1(LongInt N, Extended P, TRandomGenFunction Gen);
@@ -182,8 +185,9 @@ Extended Random_Cauchy();
 
 // --- Poisson ---
 // Poisson(Mu) by Ahrens-Dieter PD: table inversion for Mu <= 10, the normal-based method above.
-// Mu is read only. A non-positive Mu gives 0.
-Int64 Random_Poisson(Extended& Mu, TRandomGenFunction Gen);
-Int64 Random_Poisson(Extended& Mu);
+// Mu is read only (passed by reference, so literals and temporaries are accepted too). A
+// non-positive Mu gives 0.
+Int64 Random_Poisson(const Extended& Mu, TRandomGenFunction Gen);
+Int64 Random_Poisson(const Extended& Mu);
 
 }  // namespace tovrin

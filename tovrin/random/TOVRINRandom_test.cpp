@@ -24,6 +24,7 @@
 #include <random>
 #include <string>
 #include <thread>
+#include <utility>
 #include <vector>
 
 namespace tovrin {
@@ -514,6 +515,28 @@ TEST(RandomT, BoundOneForOneDegreeOfFreedom) {
   }
 }
 
+TEST(RandomT, QuickRejectionKeepsDrawsFromThreeDegreesOn) {
+  // FNV-1a hashes of the 10 bytes of 20000 draws each, on a fixed 53-bit uniform stream, as the
+  // method gave them with the quick rejection applied at every DF: it only saves time from DF = 3.
+  const std::pair<LongInt, std::uint64_t> expected[] = {{3, 0x775e0ce7cfb05d3au},
+                                                        {4, 0x3a60c1c772180b58u},
+                                                        {7, 0x3c9c1a7fd362b25fu},
+                                                        {30, 0x8308f0c06ad70ec6u},
+                                                        {1000, 0x7951a77dfbee472du}};
+  for (const auto& [df, hash] : expected) {
+    std::mt19937_64 engine(20261124u + static_cast<std::uint64_t>(df));
+    const auto source = [&] { return static_cast<Extended>(engine() >> 11) * 0x1p-53L; };
+    std::uint64_t h = 1469598103934665603u;
+    for (int i = 0; i < 20000; ++i) {
+      const Extended x = Random_T(df, source);
+      unsigned char bytes[10];
+      std::memcpy(bytes, &x, sizeof bytes);
+      for (unsigned char b : bytes) h = (h ^ b) * 1099511628211u;
+    }
+    EXPECT_EQ(h, hash) << "DF " << df;
+  }
+}
+
 TEST(RandomMVNorm, OneDimensionalFactorIsTheSquareRoot) {
   const TQENFloatVector means{5};
   const TQENFloatVector covariance{4};
@@ -672,13 +695,21 @@ TEST(RandomBinomial1, ModeShortcutAndOutwardWalk) {
   }
 }
 
-TEST(RandomBinomial1, UnfinishedWalkRaisesInsteadOfLooping) {
-  // P = 0 makes the mode's probability NaN: u never falls below 0 and both ends are reached.
-  ScriptedSource script{0.5L};
-  ExpectRaises(rsInvalidValue, [&] { Random_Binomial1(3, 0, script); });
-  // N = 0: the mode 0 has probability 1.
+TEST(RandomBinomial1, CertainOutcomesAndUnfinishedWalk) {
+  // P = 0 and P = 1 leave one possible value and draw nothing; N = 0 has the mode 0 with
+  // probability 1.
+  for (LongInt n : {0, 1, 7, 1000000}) {
+    ScriptedSource none{};
+    EXPECT_EQ(Random_Binomial1(n, 0, none), 0);
+    EXPECT_EQ(Random_Binomial1(n, 1, none), n);
+    EXPECT_EQ(none.Draws(), 0u);
+  }
   ScriptedSource zero{0.999L};
   EXPECT_EQ(Random_Binomial1(0, 0.4L, zero), 0);
+  // N = 1, P = 0.01: the probabilities 0.99 and 0.01, held as doubles, add up to less than the
+  // largest uniform, so the walk ends with u still not negative.
+  ScriptedSource last{1 - 0x1p-64L};
+  ExpectRaises(rsInvalidValue, [&] { Random_Binomial1(1, 0.01L, last); });
 }
 
 TEST(RandomBinomial2, InversionNeverGivesZeroBeforeReflection) {
@@ -781,6 +812,8 @@ TEST(RandomPoisson, TableUpToTenNormalMethodAbove) {
     EXPECT_EQ(Random_Poisson(nonPositive, one), 0);
     EXPECT_EQ(one.Draws(), 1u);
   }
+  ScriptedSource literal{0.5L, 0.6L};  // the mean may be a literal
+  EXPECT_EQ(Random_Poisson(10.0001L, literal), 11);
 }
 
 TEST(RandomPoisson, UnrepresentableMeanRaises) {
@@ -1012,12 +1045,11 @@ TEST(RandomDistribution, BetaAndT) {
   CheckContinuous("Beta_0_5_0_7", [&] { return Random_Beta(0.5L, 0.7L, engine); });
   CheckContinuous("Beta_3_0_4", [] { return Random_Beta(3, 0.4L); });
   CheckContinuous("Beta_0_2_5", [&] { return Random_Beta(0.2L, 5, engine); });
-  // For DF = 1 and 2 the quick rejection bound c / (x^2 + 3) lies under the ratio-of-uniforms
-  // boundary (1 + x^2/n)^e, touching it at x^2 = 1, so it alone shapes the accepted region:
-  // those variates follow (x^2 + 3)^-2, Student's t with 3 degrees of freedom. (The method is
-  // kept as it stands; the tables T_1 and T_2 hold the true Student quantiles.)
-  CheckContinuous("T_3", [] { return Random_T(1); });
-  CheckContinuous("T_3", [&] { return Random_T(2, engine); });
+  // DF 1 and 2 are decided by the exact test alone (the quick rejection would cut their tails):
+  // DF = 1 is the standard Cauchy.
+  CheckContinuous("T_1", [] { return Random_T(1); });
+  CheckContinuous("Cauchy", [&] { return Random_T(1, engine); });
+  CheckContinuous("T_2", [&] { return Random_T(2, engine); });
   CheckContinuous("T_3", [] { return Random_T(3); });
   CheckContinuous("T_10", [&] { return Random_T(10, engine); });
   CheckContinuous("Cauchy", [] { return Random_Cauchy(); });

@@ -31,12 +31,21 @@ std::string Labelled(TResStringId Label, const std::string& Value) {
   return line;
 }
 
-// Every line converted with Str2Float, into a fresh vector (the caller's values are left
+// An Items line as a value: Str2Float, or one of the spellings Float2EStr gives the values
+// Str2Float refuses (AddValue writes them, so they must read back).
+Extended ItemValue(const std::string& Line) {
+  if (Line == "INF") return std::numeric_limits<Extended>::infinity();
+  if (Line == "-INF") return -std::numeric_limits<Extended>::infinity();
+  if (Line == "NAN") return std::numeric_limits<Extended>::quiet_NaN();
+  return Str2Float(Line);
+}
+
+// Every line converted with ItemValue, into a fresh vector (the caller's values are left
 // alone when a line is not a number).
 TQENFloatVector ConvertLines(const std::vector<std::string>& Lines) {
   TQENFloatVector values;
   values.reserve(Lines.size());
-  for (const std::string& line : Lines) values.push_back(Str2Float(line));
+  for (const std::string& line : Lines) values.push_back(ItemValue(line));
   return values;
 }
 
@@ -290,8 +299,8 @@ void TQENDescStats::LoadFromStream(std::istream& Stream) {
   if (line != kStreamTag) StreamError(line_number, std::string("expected '") + kStreamTag + "'");
 
   // Everything is read into temporaries; the component changes only once all of it is good.
-  Byte decimals = 4;
-  bool population = false;
+  Byte decimals = fDecimals;  // what the stream does not say stays as it is
+  bool population = FPopulation;
   bool seen_decimals = false, seen_population = false, seen_version = false;
   std::string name, text;
   for (;;) {
@@ -334,7 +343,7 @@ void TQENDescStats::LoadFromStream(std::istream& Stream) {
   for (unsigned long long i = 0; i < count; ++i) {
     next_line("item line");
     try {
-      values.push_back(Str2Float(line));
+      values.push_back(ItemValue(line));
     } catch (const EConvertError& e) {
       StreamError(line_number, e.what());
     }

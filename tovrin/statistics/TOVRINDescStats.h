@@ -11,9 +11,11 @@
 // last recomputation. Updates do not nest; one EndUpdate ends any number of BeginUpdate calls.
 //
 // The component raises nothing of its own: an empty list, too few values and a zero spread
-// are reported in the text of the report. A line of Items that is not a number raises
-// EConvertError (from Str2Float); SetItems and LoadFromStream then leave the component
-// exactly as it was.
+// are reported in the text of the report. A line of Items is read with Str2Float, except the
+// three lines the component itself writes for values Str2Float refuses: "INF", "-INF" and
+// "NAN" (Float2EStr's spellings), so every value AddValue accepts survives Items, SetItems and
+// the stream. Any other line that is not a number raises EConvertError; SetItems and
+// LoadFromStream then leave the component exactly as it was.
 #pragma once
 
 #include <iosfwd>
@@ -120,7 +122,8 @@ class TQENDescStats {
   //   End
   //
   // "Items n" is followed by exactly n lines, each one Items line as it stands. Lines end with
-  // '\n' (a '\r' before it is ignored on loading).
+  // '\n' (a '\r' before it is ignored on loading). A property line that is absent keeps the
+  // component's current value of that property.
   void SaveToStream(std::ostream& Stream) const;
   // Reads what SaveToStream writes, then ends with Loaded. A malformed stream raises
   // EConvertError naming the line, and so does an item that is not a number; either way the

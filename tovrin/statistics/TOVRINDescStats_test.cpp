@@ -466,14 +466,41 @@ TEST(DescStatsStreamTest, EmptyComponentRoundTrips) {
   EXPECT_TRUE(copy.Items().empty());
 }
 
-TEST(DescStatsStreamTest, LoadingAcceptsCarriageReturnsAndDefaults) {
+TEST(DescStatsStreamTest, LoadingAcceptsCarriageReturnsAndKeepsAbsentProperties) {
   std::istringstream in("TQENDescStats\r\nItems 2\r\n3\r\n5\r\nEnd\r\n");
   TQENDescStats stats = WithValues({1}, true);
   stats.SetDecimalPlaces(9);
   stats.LoadFromStream(in);
   EXPECT_EQ(stats.Mean(), 4.0L);
-  EXPECT_FALSE(stats.Population());  // absent properties take their defaults
-  EXPECT_EQ(stats.DecimalPlaces(), 4);
+  EXPECT_TRUE(stats.Population());  // absent properties keep their current values
+  EXPECT_EQ(stats.DecimalPlaces(), 9);
+}
+
+TEST(DescStatsStreamTest, InfinitiesAndNaNSurviveEveryRoundTrip) {
+  constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
+  TQENDescStats stats;
+  for (Extended v : {kInf, -kInf, std::numeric_limits<Extended>::quiet_NaN(), 2.5L}) {
+    stats.AddValue(v);
+  }
+  EXPECT_EQ(stats.Items(), (Lines{"INF", "-INF", "NAN", "2.5"}));
+  const auto expectSame = [](const TQENDescStats& copy) {
+    const TQENFloatVector v = copy.Values();
+    ASSERT_EQ(v.size(), 4u);
+    EXPECT_EQ(Extended(v[0]), std::numeric_limits<Extended>::infinity());
+    EXPECT_EQ(Extended(v[1]), -std::numeric_limits<Extended>::infinity());
+    EXPECT_TRUE(std::isnan(Extended(v[2])));
+    EXPECT_EQ(Extended(v[3]), 2.5L);
+  };
+  std::stringstream stream;
+  stats.SaveToStream(stream);
+  TQENDescStats loaded;
+  loaded.LoadFromStream(stream);
+  expectSame(loaded);
+  TQENDescStats set;
+  set.SetItems(stats.Items());
+  expectSame(set);
+  stats.Loaded();
+  expectSame(stats);
 }
 
 TEST(DescStatsStreamTest, FailedLoadLeavesTheComponentAsItWas) {

@@ -309,6 +309,18 @@ TEST(FDistTest, AgainstReference) {
   EXPECT_TRUE(Near(FDistBetween(1, 3.5L, 5, 10), FDistLess(3.5L, 5, 10) - FDistLess(1, 5, 10), 0));
 }
 
+TEST(FDistTest, DensityOverWideDegreesOfFreedom) {
+  // A few units in the last place, plus the rounding of the logarithms that make up ln f,
+  // which carries over to f as a relative error of a few ulps of |ln f|.
+  for (const auto& [x, d1, d2, density] : kFDistDensityRef) {
+    const Extended got = FDistPDF(x, DF(d1), DF(d2));
+    const Extended bound = 4 * kEps + 2 * kEps * std::fabs(std::log(density));
+    EXPECT_TRUE(RelNear(got, density, bound))
+        << "x=" << static_cast<double>(x) << " " << d1 << "," << d2 << " rel error "
+        << static_cast<double>((got - density) / density);
+  }
+}
+
 TEST(FDistTest, InverseAgainstReference) {
   for (const auto& [p, d1, d2, x, density] : kInvFDistRef) {
     SCOPED_TRACE(::testing::Message() << "p=" << static_cast<double>(p) << " " << d1 << "," << d2);

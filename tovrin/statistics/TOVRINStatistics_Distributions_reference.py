@@ -144,6 +144,24 @@ for x, d1, d2 in [("0.5", 1, 1), ("1", 2, 3), ("3.5", 5, 10), ("0.05", 10, 4), (
     rows.append((x, d1, d2, f_cdf(x, d1, d2), f_pdf(x, d1, d2)))
 table("kFDistRef", ["x", "df1", "df2", "P", "density"], rows, "F distribution and density")
 
+def f_log_pdf(x, d1, d2):
+    with workprec(400):
+        d1, d2, x = mpf(d1), mpf(d2), mpf(x)
+        return (d1 * log(d1 * x) + d2 * log(d2) - (d1 + d2) * log(d1 * x + d2)) / 2 - log(x) \
+            - (loggamma(d1 / 2) + loggamma(d2 / 2) - loggamma((d1 + d2) / 2))
+
+
+rows = []
+for d1 in [1, 2, 5, 1000, 10 ** 6, 10 ** 9]:
+    for d2 in [1, 4, 10 ** 6, 10 ** 9]:
+        for x in ["1e-12", "1e-6", "0.5", "1", "2", "1e6", "1e12"]:
+            x = ext(x)
+            lf = f_log_pdf(x, d1, d2)
+            if lf > -11355:  # above the smallest normal 80-bit value
+                rows.append((x, d1, d2, exp(lf)))
+table("kFDistDensityRef", ["x", "df1", "df2", "density"], rows,
+      "F density over wide degrees of freedom and arguments")
+
 rows = []
 for p, d1, d2 in [("0.5", 1, 1), ("0.95", 2, 3), ("0.05", 5, 10), ("0.99", 10, 4), ("0.5", 30, 60),
                   ("0.001", 3, 7), ("0.999", 1, 5), ("0.25", 100, 100)]:

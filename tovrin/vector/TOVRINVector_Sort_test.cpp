@@ -121,6 +121,52 @@ TEST(SortTest, InsertionFinishGivesThePlainResultBitForBit) {
   }
 }
 
+TEST(SortTest, ExtendedKeysGiveThePlainResultBitForBit) {
+  // Extended elements are compared through integer keys made from their bytes unless an
+  // encoding the keys cannot order (NaN, pseudo-denormal, unnormal) is present.
+  const auto packed = [](std::uint64_t mantissa, std::uint16_t signExponent) {
+    unsigned char bytes[10];
+    std::memcpy(bytes, &mantissa, 8);
+    std::memcpy(bytes + 8, &signExponent, 2);
+    PackedExtended x;
+    std::memcpy(&x, bytes, 10);
+    return x;
+  };
+  const PackedExtended odd[] = {
+      Extended(std::numeric_limits<Extended>::quiet_NaN()),
+      packed(0x8000000000000001ULL, 0x0000),  // pseudo-denormal, equal to a normal
+      packed(0x4000000000000000ULL, 0x3FFF),  // unnormal
+  };
+  std::mt19937_64 rng(12);
+  for (int size : {2, 17, 100, 1000, 5000}) {
+    for (int variant = 0; variant <= 3; ++variant) {
+      TQENFloatVector v(size);
+      for (int k = 0; k < size; ++k) {
+        switch (rng() % 6) {
+          case 0:
+            v[k] = rng() % 2 ? 0.0L : -0.0L;
+            break;
+          case 1:
+            v[k] = 0x1p-16440L * static_cast<Extended>(rng() % 4) * (rng() % 2 ? 1 : -1);
+            break;
+          case 2:
+            v[k] = rng() % 2 ? std::numeric_limits<Extended>::infinity()
+                             : -std::numeric_limits<Extended>::infinity();
+            break;
+          case 3:
+            v[k] = static_cast<Extended>(rng() % 5) - 2;
+            break;
+          default:
+            v[k] = std::ldexp(static_cast<Extended>(rng()), static_cast<int>(rng() % 64) - 90) *
+                   (rng() % 2 ? 1 : -1);
+        }
+      }
+      if (variant > 0) v[static_cast<std::size_t>(size / 2)] = odd[variant - 1];
+      ExpectSameBitsAsPlainSort(v);
+    }
+  }
+}
+
 TEST(SortTest, AdversarialShapesStayWithinTheStack) {
   const LongInt n = 200000;
   const LongInt organN = 3000;

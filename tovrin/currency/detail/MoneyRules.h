@@ -4,9 +4,10 @@
 //
 // Stored integers add and subtract with wrap-around at their own width (32 bits for
 // TQENCurrency, 64 for the others), done in unsigned arithmetic. Products by an Extended
-// constant are rounded half to even with unreported overflow (detail::RoundWrapping). The
-// linear transform of TQENCurrency and TQENLongCurrency goes through the conversion services,
-// which raise rsInvalidValue out of range; the Currency transform works on the stored integer.
+// constant, the linear transforms and the conversions from floats round the Extended result
+// half to even with unreported overflow (detail::RoundWrapping): one rule for all three types.
+// The linear transform of TQENCurrency and TQENLongCurrency goes through the conversion
+// services; the Currency transform works on the stored integer.
 #pragma once
 
 #include <cstdint>
@@ -27,7 +28,6 @@ struct MoneyRules<TQENCurrency> {
   static T Add(T a, T b) { return FromBits(U(a) + U(b)); }
   static T Sub(T a, T b) { return FromBits(U(a) - U(b)); }
   static T Mul(Extended K, T x) { return WrapToCurr(RoundWrapping(K * StoredOf(x))); }
-  static constexpr bool kLinearMayRaise = true;
   static T Linear(T x, Extended A, Extended B) {
     return Float2QENCurrency(Currency2Float(x) * A + B);
   }
@@ -50,7 +50,6 @@ struct MoneyRules<TQENLongCurrency> {
   static T Add(T a, T b) { return FromBits(U(a) + U(b)); }
   static T Sub(T a, T b) { return FromBits(U(a) - U(b)); }
   static T Mul(Extended K, T x) { return T(RoundWrapping(K * StoredOf(x))); }
-  static constexpr bool kLinearMayRaise = true;
   static T Linear(T x, Extended A, Extended B) {
     return Float2QENLongCurrency(Currency2Float(x) * A + B);
   }
@@ -71,7 +70,6 @@ struct MoneyRules<Currency> {
   static T Sub(T a, T b) { return FromBits(U(a) - U(b)); }
   static T Mul(Extended K, T x) { return T(RoundWrapping(K * StoredOf(x))); }
   // stored x A + B x 10000: B is an amount, not a stored unit.
-  static constexpr bool kLinearMayRaise = false;
   static T Linear(T x, Extended A, Extended B) {
     return T(RoundWrapping(StoredOf(x) * A + B * kMoneyScale<Currency>));
   }
