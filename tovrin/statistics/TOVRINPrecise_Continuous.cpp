@@ -512,15 +512,21 @@ Extended ExponentialLess(Extended Mean, Extended X) {
   return less + q.lo * (1.0L - less);
 }
 
-Extended ExponentialGreater(Extended Mean, Extended X) {
-  const Pair q = ExponentialRate(Mean, X);
+namespace {
+// e^-q for q = hi + lo >= 0.
+Extended ExpMinus(const Pair& q) {
+  if (!(q.hi < 12000.0L)) return std::isnan(q.hi) ? kNaN : 0.0L;
   return std::exp(-q.hi) * (1.0L - q.lo);
+}
+}  // namespace
+
+Extended ExponentialGreater(Extended Mean, Extended X) {
+  return ExpMinus(ExponentialRate(Mean, X));
 }
 
 Extended ExponentialPDF(Extended X, Extended Mean) {
   if (!(Mean > 0) || X < 0) RaiseMathError(rsExpDistInvalid);
-  const Pair q = detail::Quotient(Pair{X}, Pair{Mean});
-  return std::exp(-q.hi) * (1.0L - q.lo) / Mean;
+  return ExpMinus(detail::Quotient(Pair{X}, Pair{Mean})) / Mean;
 }
 
 // === Beta =======================================================================================
