@@ -373,8 +373,8 @@ int RunEval(std::span<const std::string> Words) {
     return kExitOk;
   }
   if (Words[0].starts_with("-")) throw UsageError("unknown option " + Words[0]);
-  const auto call = BindByName(table, precise ? "precise function" : "function", Words[0],
-                               Words.subspan(1));
+  const auto call =
+      BindByName(table, precise ? "precise function" : "function", Words[0], Words.subspan(1));
   const std::string result = call();
   WriteOut((digits ? WithDigits(result, *digits) : result) + "\n");
   return kExitOk;

@@ -322,6 +322,18 @@ assert lima["StdDev"] is None and lima["Kurtosis"] is None
 PY
 run 0 describe -t , -H -f temp,rain --json --stats Sum,Missing,Range "$WORK/cities.csv"
 expect_out '{"temp": {"Sum": 65, "Missing": 0, "Range": 17}, "rain": {"Sum": 1510, "Missing": 3, "Range": 790}}'
+# One chosen field: JSON names it; without -f, field 1 and one object.
+run 0 describe -t , -H -f rain --json "$WORK/cities.csv"
+checks=$((checks + 1))
+python3 - "$WORK/out" <<'PY' || fail "describe -f rain --json"
+import json, sys
+d = json.load(open(sys.argv[1]))
+assert list(d) == ["rain"] and d["rain"]["NoOfValues"] == 3 and d["rain"]["Missing"] == 3, d
+assert d["rain"]["Sum"] == 1510 and d["rain"]["Mode"] is None and d["rain"]["Kurtosis"] is None
+PY
+printf 'n\n1\n\n3\nNA\n' >"$WORK/col.csv"
+run 0 describe -t , -H --json --stats NoOfValues,Missing,Mean,Variance,Skew "$WORK/col.csv"
+expect_out '{"NoOfValues": 2, "Missing": 1, "Mean": 2, "Variance": 2, "Skew": null}'
 # An all-missing field: the empty-list report and its missing count.
 printf 'a;b\n1;NA\n2;\n' >"$WORK/semi.csv"
 run 0 describe -t ';' -H -f b "$WORK/semi.csv"
@@ -369,6 +381,17 @@ expect_line "k1, \"q\"${TAB}14286"
 printf 'z,x\n' >>"$WORK/big.csv"
 run 1 describe -t , -H -f v "$WORK/big.csv"
 expect_err "big.csv:450003: field 'v': not a number: 'x'"
+# The long option names and the escape \t; a column of a table gives the same report (and the
+# same JSON) as the plain stream of its numbers.
+grep -v '^#' "$DATA" | tr -s ' ,\t' '\n' | grep . | awk '{ print "m\t" $1 }' >"$WORK/michelson.tsv"
+run 0 describe "$DATA"
+cp "$WORK/out" "$WORK/plain"
+run 0 describe --delimiter '\t' --field 2 "$WORK/michelson.tsv"
+checks=$((checks + 1))
+cmp -s "$WORK/out" "$WORK/plain" || fail "a table's column and the plain numbers differ"
+run 0 describe --whitespace --group 1 --field 2 --stats NoOfValues,Mean,Median "$WORK/michelson.tsv"
+expect_out "group${TAB}NoOfValues${TAB}Mean${TAB}Median
+m${TAB}100${TAB}299852.4${TAB}299850"
 # Bad values: nothing on stdout, the file, line, field and text on stderr.
 run 1 describe -t , -H -f 4 "$WORK/cities.csv"
 expect_no_out

@@ -782,32 +782,17 @@ Extended ShapeTimesOffsetPhi(Extended a, const ExactPair& t) {
   return a * (XMinusLog1p(t.hi) + t.lo * (t.hi / (1.0L + t.hi)));
 }
 
-Extended GammaFactor(Extended a, Extended x) {
-  if (x == 0.0L || std::isinf(x)) return 0.0L;
-  if (a < kStirlingStart) {
-    const Extended power = std::pow(x, a);
-    const Extended decay = std::exp(-x);
-    const Extended r = power / GammaFinite(a) * decay;
-    if (std::isnormal(power) && std::isnormal(decay) && std::isnormal(r)) return r;
-    return std::exp(a * std::log(x) - x - LnGammaFinite(a));
-  }
-  // r = (x / a)^a e^(a - x) sqrt(a / (2 pi)) e^-Delta(a). While the two powers stay in range
-  // they come from bases carried to twice the working precision, so r carries only the
-  // rounding of pow and exp; beyond, the exponent -a phi(t) is formed in one piece.
-  const Extended scale = std::sqrt(a) * kInvSqrt2Pi * std::exp(-StirlingSeries(a));
+// e^-(a phi(t)) = (x / a)^a e^(a - x) for a >= 12 and finite x > 0, t = (x - a) / a. Formed in
+// one piece, the exponent E = a phi(t) carries a relative error of the working precision, so
+// the result carries E times that. Instead the two factors come from bases carried to twice the
+// working precision, as ((x / a)^(a / k) e^((a - x) / k))^k with k = 2^m the smallest that
+// keeps the factors in range, raised by squaring: about k units of rounding instead of E. The
+// exponent form stays where it is the better (E below k).
+Extended ExpMinusShapePhi(Extended a, Extended x) {
   const Extended q = x / a;
   const ExactPair qa = TwoProduct(q, a);
   const Extended q_lo = ((x - qa.hi) - qa.lo) / a;
   const ExactPair d = TwoSum(a, -x);
-  // The power is taken as the square of its half, which reaches twice as far.
-  const Extended half = std::pow(q, 0.5L * a);
-  const Extended decay = std::exp(d.hi);
-  const Extended product = half * decay * scale;
-  const Extended r = product * half;
-  if (q > 0.0L && std::isnormal(half) && std::isnormal(decay) && std::isnormal(product) &&
-      std::isnormal(r)) {
-    return r * (1.0L + a * (q_lo / q)) * (1.0L + d.lo);
-  }
   const ExactPair t = RelativeOffset(a, x);
   Extended exponent;
   if (t.hi < -0.5L) {
@@ -817,7 +802,34 @@ Extended GammaFactor(Extended a, Extended x) {
   } else {
     exponent = ShapeTimesOffsetPhi(a, t);
   }
-  return std::exp(-exponent) * scale;
+  if (q > 0.0L && std::isfinite(q) && exponent > 4.0L && exponent < 12000.0L) {
+    const Extended size = std::fmax(a * std::fabs(std::log(q)), std::fabs(d.hi));
+    int m = 0;
+    Extended k = 1.0L;
+    while (size / k > 11000.0L && k < exponent) {
+      k *= 2.0L;
+      ++m;
+    }
+    Extended h = std::pow(q, a / k) * std::exp(d.hi / k);
+    if (k < exponent && std::isnormal(h)) {
+      for (int i = 0; i < m; ++i) h *= h;
+      if (std::isnormal(h)) return h * (1.0L + a * (q_lo / q)) * (1.0L + d.lo);
+    }
+  }
+  return std::exp(-exponent);
+}
+
+Extended GammaFactor(Extended a, Extended x) {
+  if (x == 0.0L || std::isinf(x)) return 0.0L;
+  if (a < kStirlingStart) {
+    const Extended power = std::pow(x, a);
+    const Extended decay = std::exp(-x);
+    const Extended r = power / GammaFinite(a) * decay;
+    if (std::isnormal(power) && std::isnormal(decay) && std::isnormal(r)) return r;
+    return std::exp(a * std::log(x) - x - LnGammaFinite(a));
+  }
+  // r = (x / a)^a e^(a - x) sqrt(a / (2 pi)) e^-Delta(a).
+  return ExpMinusShapePhi(a, x) * (std::sqrt(a) * kInvSqrt2Pi * std::exp(-StirlingSeries(a)));
 }
 
 // 1 + x/(a+1) + x^2/((a+1)(a+2)) + ..., so that P(a, x) = r / a times it.
@@ -861,11 +873,33 @@ Extended ErfcOfSqrt(Extended x) {
   const ExactPair ss = TwoProduct(s, s);
   const Extended s_lo = ((x - ss.hi) - ss.lo) / (2.0L * s);
   Extended e = std::erfc(s);
-  if (s_lo != 0.0L && x < 12000.0L) e -= s_lo * 1.12837916709551257389615890312154517L * std::exp(-x);
+  if (s_lo != 0.0L && x < 12000.0L)
+    e -= s_lo * 1.12837916709551257389615890312154517L * std::exp(-x);
   return e;
 }
 
-detail::Tails TemmeGammaTails(Extended a, const ExactPair& t) {
+// erfc(u) e^(u^2) for u >= 0, with u^2 carried exactly; the asymptotic series from u = 100
+// on, where erfc itself leaves the range.
+Extended ScaledErfc(Extended u) {
+  if (u < 100.0L) {
+    const ExactPair uu = TwoProduct(u, u);
+    return std::erfc(u) * std::exp(uu.hi) * (1.0L + uu.lo);
+  }
+  constexpr Extended kInvSqrtPi = 0.564189583547756286948079451560772586L;
+  const Extended v = 1.0L / (2.0L * u * u);
+  Extended term = 1.0L;
+  Extended sum = 1.0L;
+  for (int k = 1; k < 12; ++k) {
+    term *= -(2 * k - 1) * v;
+    sum += term;
+  }
+  return kInvSqrtPi / u * sum;
+}
+
+// Temme's expansion, Q = erfc(s) / 2 + e^-E / sqrt(2 pi a) sum_k C_k(eta) a^-k with
+// s = eta sqrt(a / 2) and E = s^2 = a phi(t). The factor e^-E is taken once, from the powers
+// (ExpMinusShapePhi), and erfc(s) as e^-E times the scaled erfc, which varies slowly with s.
+detail::Tails TemmeGammaTails(Extended a, Extended x, const ExactPair& t) {
   const Extended phi = XMinusLog1p(t.hi) + t.lo * (t.hi / (1.0L + t.hi));
   const Extended eta = std::copysign(std::sqrt(2.0L * phi), t.hi);
   const Extended s = eta * std::sqrt(0.5L * a);
@@ -876,12 +910,14 @@ detail::Tails TemmeGammaTails(Extended a, const ExactPair& t) {
     for (int n = kTemmeDegree[k] - 1; n >= 0; --n) ck = ck * eta + kTemmeCoef[k][n];
     sum = sum * inv_a + ck;
   }
-  const Extended r = std::exp(-a * phi) * kInvSqrt2Pi / std::sqrt(a) * sum;
+  const Extended decay = ExpMinusShapePhi(a, x);
+  const Extended half_erfc = 0.5L * decay * ScaledErfc(std::fabs(s));
+  const Extended r = decay * kInvSqrt2Pi / std::sqrt(a) * sum;
   if (eta >= 0.0L) {
-    const Extended q = 0.5L * std::erfc(s) + r;
+    const Extended q = half_erfc + r;
     return {1.0L - q, q};
   }
-  const Extended p = 0.5L * std::erfc(-s) - r;
+  const Extended p = half_erfc - r;
   return {p, 1.0L - p};
 }
 
@@ -900,12 +936,14 @@ Tails IncompleteGammaTails(Extended A, Extended X) {
   if (std::isinf(X)) return {1.0L, 0.0L};
   if (A >= kTemmeMinShape) {
     const ExactPair t = RelativeOffset(A, X);
-    if (std::fabs(t.hi) <= kTemmeMaxOffset) return TemmeGammaTails(A, t);
+    if (std::fabs(t.hi) <= kTemmeMaxOffset) return TemmeGammaTails(A, X, t);
   }
   if (A <= 1.0L && X < 1.1L) {
-    const Extended p = GammaFactor(A, X) / A * LowerGammaSeries(A, X);
-    if (A == 0.5L) return {p, ErfcOfSqrt(X)};
-    return {p, ScaledUpperGamma(A, X, 0.0L)};
+    // Both tails directly; where Q is the smaller, P is its complement (for a shape near the
+    // bottom of the range, r / a would lose its digits to the subnormals).
+    const Extended q = A == 0.5L ? ErfcOfSqrt(X) : ScaledUpperGamma(A, X, 0.0L);
+    if (q <= 0.5L) return {1.0L - q, q};
+    return {GammaFactor(A, X) / A * LowerGammaSeries(A, X), q};
   }
   if (A == 0.5L) {
     const Extended q = ErfcOfSqrt(X);
@@ -946,8 +984,7 @@ Tails IncompleteBetaTails(Extended X, Extended XLo, Extended Y, Extended YLo, Ex
   if (std::fmin(A, B) <= kHugeShape) {
     const bool lower_derived = BetaLambda(p, A, B) < 0.0L;
     Extended direct;
-    if (lower_derived && v.lower < kDirectBelow &&
-        LowerTailSmallB(p, A, B, v.factor, direct)) {
+    if (lower_derived && v.lower < kDirectBelow && LowerTailSmallB(p, A, B, v.factor, direct)) {
       v.lower = direct;
     } else if (!lower_derived && v.upper < kDirectBelow &&
                LowerTailSmallB(Swapped(p), B, A, v.factor, direct)) {

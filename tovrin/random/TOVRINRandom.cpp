@@ -186,9 +186,16 @@ Extended TruncExtended(Extended x) {
 }
 
 // Below 2^53 the whole number converts to double exactly, and from there to Int64 in one step.
+// The step toward zero is taken without a branch: whether rounding went up or down is
+// random in the generators.
 [[gnu::always_inline]] inline bool SmallTruncInt64(Extended x, Int64& result) {
   if (!(std::fabs(x) < 0x1p53L)) return false;
-  result = static_cast<Int64>(static_cast<double>(NearTrunc(x)));
+  constexpr Extended kShift = 0x1.8p63L;
+  const Extended nearest = (x + kShift) - kShift;
+  const auto whole = static_cast<Int64>(static_cast<double>(nearest));
+  const int overshoot = static_cast<int>(x >= 0) & static_cast<int>(nearest > x);
+  const int undershoot = static_cast<int>(x < 0) & static_cast<int>(nearest < x);
+  result = whole - overshoot + undershoot;
   return true;
 }
 
@@ -307,6 +314,34 @@ Extended ExponentialVariate(Gen& gen) {
 // ---------------------------------------------------------------------------------------------
 // Gamma and its relatives
 
+// Comparisons with a logarithm on one side are first settled from the logarithm in double:
+// only where the two sides lie within the bound below does the Extended logarithm decide.
+//
+// ln x in double for a positive x in the normal double range, with a bound on its distance
+// from std::log(x) in Extended: rounding x to double moves ln x by 1.2e-16, the double log is
+// within an ulp (2.3e-16 |ln x|) and so is the Extended one; 5e-16 (1 + |ln x|) covers all.
+struct BoundedLog {
+  double value;
+  double bound;
+};
+inline bool DoubleLog(Extended x, BoundedLog& out) {
+  const auto xd = static_cast<double>(x);
+  if (!(xd > 0x1p-1000 && xd < 0x1p1000)) return false;
+  const double value = std::log(xd);
+  out = {value, 5e-16 * (1 + std::fabs(value))};
+  return true;
+}
+
+enum class Settled { kNo, kYes, kUnsure };
+
+// a < b for values known within a +- ea and b +- eb (and the rounding of this test itself).
+inline Settled SettleLess(Extended a, Extended ea, Extended b, Extended eb) {
+  const Extended slack = ea + eb + 0x1p-61L * (std::fabs(a) + std::fabs(b));
+  if (a + slack < b) return Settled::kYes;
+  if (a - slack > b) return Settled::kNo;
+  return Settled::kUnsure;
+}
+
 // Marsaglia and Tsang, for Shape > 1.
 template <typename Gen>
 Extended GammaLargeShape(Extended shape, Gen& gen) {
@@ -322,6 +357,19 @@ Extended GammaLargeShape(Extended shape, Gen& gen) {
     const Extended u = gen();
     const Extended x2 = x * x;
     if (u < 1 - 0.0331L * x2 * x2) return d * t;
+    // ln u < x^2 / 2 + d (1 - t + ln t), the logarithms first in double: the right side then
+    // differs from its Extended value by d times the bound of ln t and its roundings.
+    BoundedLog logU;
+    BoundedLog logT;
+    if (DoubleLog(u, logU) && DoubleLog(t, logT)) {
+      const Extended lnT = logT.value;
+      const Extended right = 0.5L * x2 + d * (1 - t + lnT);
+      const Extended rightError =
+          d * Extended(logT.bound) * 1.01L + 0x1p-60L * (0.5L * x2 + d * (1 + t + std::fabs(lnT)));
+      const Settled settled = SettleLess(logU.value, logU.bound, right, rightError);
+      if (settled == Settled::kYes) return d * t;
+      if (settled == Settled::kNo) continue;
+    }
     if (std::log(u) < 0.5L * x2 + d * (1 - t + std::log(t))) return d * t;
   }
 }
@@ -345,14 +393,20 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
     const Extended u = gen();
     if (u >= 1) continue;
     Extended x;
-    Extended w;
-    if (u > p) {
-      if (!haveTLnT) {
-        tLnT = t * std::log(t);
-        haveTLnT = true;
-      }
+    Extended w = 0;        // in the tail, an estimate of t ln x - t ln t within wError
+    Extended wError = -1;  // -1: w is not known yet
+    const bool tail = u > p;
+    if (tail) {
       x = t - std::log((1 - u) / (1 - p));
-      w = t * std::log(x) - tLnT;
+      BoundedLog logX;
+      BoundedLog logT;
+      if (DoubleLog(x, logX) && DoubleLog(t, logT)) {
+        const Extended lnX = logX.value;
+        const Extended lnT = logT.value;
+        w = t * lnX - t * lnT;
+        wError = t * Extended(logX.bound + logT.bound) * 1.01L +
+                 0x1p-60L * t * (std::fabs(lnX) + std::fabs(lnT));
+      }
     } else {
       if (u <= floorBound && !haveW0) {
         w0 = p * XtoY(kTiny / t, shape);
@@ -361,8 +415,33 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
       if (u <= floorBound && u <= w0) return 0;
       x = t * Power(u / p, 1 / shape);
       w = x;
+      wError = 0;
     }
     const Extended u2 = gen();
+    // Accept if w < 1 - u2, or u2 <= 0, or u2 (1 + w) < 1 and w < -ln u2: first from the
+    // estimates, then, where they cannot tell, from the exact w and logarithm.
+    if (wError >= 0) {
+      const Settled below = SettleLess(w, wError, 1 - u2, 0);
+      if (below == Settled::kYes) return x;
+      if (below == Settled::kNo) {
+        if (u2 <= 0) return x;
+        const Settled product = SettleLess(u2 * (1 + w), u2 * wError, 1, 0);
+        if (product == Settled::kNo) continue;
+        BoundedLog logU2;
+        if (product == Settled::kYes && DoubleLog(u2, logU2)) {
+          const Settled beyond = SettleLess(w, wError, -logU2.value, logU2.bound);
+          if (beyond == Settled::kYes) return x;
+          if (beyond == Settled::kNo) continue;
+        }
+      }
+    }
+    if (tail) {
+      if (!haveTLnT) {
+        tLnT = t * std::log(t);
+        haveTLnT = true;
+      }
+      w = t * std::log(x) - tLnT;
+    }
     if (w < 1 - u2) return x;
     if (u2 <= 0) return x;
     if (u2 * (1 + w) < 1 && w < -std::log(u2)) return x;
@@ -666,27 +745,35 @@ inline bool BtpeRecursionAccepts(Extended v, Int64 mode, Int64 y, Extended g, Ex
   return v <= f;
 }
 
-// BTPE's first attempt, where most draws end: u = U1 p4 <= p1 gives y = Trunc(xm - p1 v + u)
-// without the other regions' constants. p4 depends on all of the set-up, which in Extended
-// costs more than the rest of such a draw, so the set-up is first run in double: p1 exactly
-// (unless 2.195 sqrt(npq) - 4.6 q lies within 1e-12 of a whole number), and p4 with a
-// relative error below
-//   eps = 2 (6 fm / (p1 - 1/2) + 40) (2^-53 + 2^-64),
-// against the Extended p4: each quantity's rounding (about 40 roundings and constants in all)
-// is bounded by its operands' relative errors, and the only cancellations are fm - xl and
-// xr - fm, both at least p1 - 1/2 apart while fm is their scale. Both the region test and
-// Trunc are settled when u and xm - p1 v + u lie farther than their error bounds from p1 and
-// from a whole number; otherwise (or for N at or above 2^52) the Extended set-up decides.
-inline bool BtpeFirstAttemptInDouble(Int64 n, Extended p, Extended q, Extended np, Int64 mode,
-                                     Extended first, Extended second, Int64& y) {
-  if (n >= (Int64{1} << 52)) return false;
+// BTPE's attempts in double.
+//
+// Every draw starts with the set-up, which in Extended costs more than the rest of a typical
+// draw; the attempts are mostly settled from the set-up run in double: p1 exactly (unless
+// 2.195 sqrt(npq) - 4.6 q lies within 1e-12 of a whole number), xm, xl, xr exactly, and c,
+// lambdaL, lambdaR, p2, p3, p4 each with a relative error below
+//   eps = 2 (6 fm / (p1 - 1/2) + 40) (2^-53 + 2^-64)
+// against their Extended values: every quantity's rounding (about 40 roundings and constants
+// in all) is bounded by its operands' relative errors, and the only cancellations are fm - xl
+// and xr - fm, both at least p1 - 1/2 while fm is their scale. Each later quantity of the
+// attempt carries an absolute bound on its distance from the Extended value (its operands'
+// bounds, plus a unit 2^-53 + 2^-64 of each operation for the two roundings); a region, a
+// truncation or a test is taken from the double values only when the bounds settle it.
+// Otherwise (and for N at or above 2^52) the attempt is left to the Extended set-up, on the
+// same two uniforms. An attempt settled as a redraw is followed by the next one in double.
+enum class FirstAttempt { kAccept, kRedraw, kUnsure };  // of one attempt
+
+inline FirstAttempt BtpeAttemptInDouble(Int64 n, Extended p, Extended q, Extended np, Int64 mode,
+                                        Extended first, Extended second, Int64& y) {
+  constexpr auto kUnsure = FirstAttempt::kUnsure;
+  if (n >= (Int64{1} << 52)) return kUnsure;
   constexpr double kUnit = 0x1p-53 + 0x1p-64;
   const double pd = static_cast<double>(p);
   const double qd = static_cast<double>(q);
   const double npd = static_cast<double>(np);
-  const double spread = 2.195 * std::sqrt(npd * qd) - 4.6 * qd;
+  const double npq = npd * qd;
+  const double spread = 2.195 * std::sqrt(npq) - 4.6 * qd;
   const double whole = std::floor(spread);
-  if (!(spread - whole > 1e-12 * spread && whole + 1 - spread > 1e-12 * spread)) return false;
+  if (!(spread - whole > 1e-12 * spread && whole + 1 - spread > 1e-12 * spread)) return kUnsure;
   const double p1 = whole + 0.5;
   const double modeD = static_cast<double>(mode);
   const double fm = npd + pd;
@@ -698,17 +785,141 @@ inline bool BtpeFirstAttemptInDouble(Int64 n, Extended p, Extended q, Extended n
   const double lambdaL = a * (1 + 0.5 * a);
   a = (xr - fm) / (xr * qd);
   const double lambdaR = a * (1 + 0.5 * a);
-  const double p4 = p1 * (1 + 2 * c) + c / lambdaL + c / lambdaR;
+  const double p2 = p1 * (1 + 2 * c);
+  const double p3 = p2 + c / lambdaL;
+  const double p4 = p3 + c / lambdaR;
   const double eps = 2 * (6 * fm / (p1 - 0.5) + 40) * kUnit;
   const double u = static_cast<double>(first) * p4;
-  if (!(u + u * (eps + 3 * kUnit) < p1)) return false;
-  const double v = static_cast<double>(second);
-  const double z = xm - p1 * v + u;
-  const double error = (eps + 8 * kUnit) * (xm + p1 + u + z);
-  const double low = std::floor(z - error);
-  if (!(z - error >= 0) || low != std::floor(z + error)) return false;
-  y = static_cast<Int64>(low);
-  return true;
+  const double uError = u * (eps + 3 * kUnit);
+  const double v0 = static_cast<double>(second);
+  // Trunc(z) for z within zError of the Extended value, when that settles it (z >= 0).
+  const auto truncate = [](double z, double zError, Int64& whole) {
+    const double low = std::floor(z - zError);
+    if (!(z - zError >= 0) || low != std::floor(z + zError)) return false;
+    whole = static_cast<Int64>(low);
+    return true;
+  };
+
+  if (u + uError < p1) {
+    const double z = xm - p1 * v0 + u;
+    const double zError = uError + 8 * kUnit * (xm + p1 + u + z);
+    return truncate(z, zError, y) ? FirstAttempt::kAccept : kUnsure;
+  }
+  if (!(u - uError > p1)) return kUnsure;
+  double v;       // the v of the final test
+  double vError;  // and its bound
+  if (u + uError < p2 - p2 * eps) {
+    const double offset = (u - p1) / c;
+    const double offsetError = (uError + (u - p1) * kUnit) / c + offset * (eps + kUnit);
+    const double x = xl + offset;
+    const double xError = offsetError + 2 * kUnit * (std::fabs(xl) + std::fabs(x));
+    const double distance = std::fabs(xm - x) / p1;
+    v = v0 * c + 1 - distance;
+    vError = v0 * c * (eps + 3 * kUnit) + (xError + 2 * kUnit * std::fabs(xm - x)) / p1 +
+             4 * kUnit * (v0 * c + 1 + distance);
+    if (v - vError > 1 || v + vError <= 0) return FirstAttempt::kRedraw;
+    if (!(v + vError <= 1 && v - vError > 0)) return kUnsure;
+    if (!truncate(x, xError, y)) return kUnsure;
+  } else {
+    BoundedLog logV;
+    if (!DoubleLog(second, logV)) return kUnsure;
+    if (u - uError > p2 + p2 * eps && u + uError < p3 - p3 * eps) {
+      const double step = logV.value / lambdaL;
+      const double x = xl + step;
+      const double xError = logV.bound / lambdaL + std::fabs(step) * (eps + 2 * kUnit) +
+                            2 * kUnit * (std::fabs(xl) + std::fabs(x));
+      if (x + xError <= -1) return FirstAttempt::kRedraw;  // Trunc(x) < 0
+      if (!truncate(x, xError, y)) return kUnsure;
+      const double width = u - p2;
+      v = v0 * width * lambdaL;
+      vError =
+          v0 * (uError + p2 * eps + width * kUnit) * lambdaL + std::fabs(v) * (eps + 4 * kUnit);
+    } else if (u - uError > p3 + p3 * eps) {
+      const double step = logV.value / lambdaR;
+      const double x = xr - step;
+      const double xError = logV.bound / lambdaR + std::fabs(step) * (eps + 2 * kUnit) +
+                            2 * kUnit * (std::fabs(xr) + std::fabs(x));
+      if (!truncate(x, xError, y)) return kUnsure;
+      if (y > n) return FirstAttempt::kRedraw;
+      const double width = u - p3;
+      v = v0 * width * lambdaR;
+      vError =
+          v0 * (uError + p3 * eps + width * kUnit) * lambdaR + std::fabs(v) * (eps + 4 * kUnit);
+    } else {
+      return kUnsure;
+    }
+  }
+
+  // The test: k = |y - M|, by the recursion for k <= 20 or k >= npq/2 - 1, else the squeeze.
+  const Int64 k = y > mode ? y - mode : mode - y;
+  const double kD = static_cast<double>(k);
+  const double threshold = npq / 2 - 1;
+  const double thresholdError = npq * 4 * kUnit;
+  if (k > 20 && std::fabs(kD - threshold) <= thresholdError) return kUnsure;
+  if (k <= 20 || kD > threshold) {
+    // f = prod (g/i - r) over M < i <= y, or its reciprocal over y < i <= M, with g/i - r at
+    // least (g/i + r)/8 (see BtpeRecursionAccepts); g and r formed in double from p and q
+    // have 4 and 3 units of error, the factor and product two more: under 1e-14 a factor.
+    const Int64 from = mode < y ? mode : y;
+    const Int64 to = mode < y ? y : mode;
+    if (k > 1000 || 9 * static_cast<double>(to) > 7 * (static_cast<double>(n) + 1)) {
+      return kUnsure;
+    }
+    const double r = pd / qd;
+    const double g = (static_cast<double>(n) + 1) * r;
+    double product = 1;
+    for (Int64 i = from + 1; i <= to; ++i) product *= g / static_cast<double>(i) - r;
+    const double f = mode < y ? product : 1 / product;
+    if (!(f > 1e-290 && f < 1e290)) return kUnsure;
+    const double fError = 1e-14 * static_cast<double>(k + 2) * f;
+    if (v + vError < f - fError) return FirstAttempt::kAccept;
+    if (v - vError > f + fError) return FirstAttempt::kRedraw;
+    return kUnsure;
+  }
+  const double rho = (kD / npq) * ((kD * (kD / 3 + 0.625) + 0.1666666666666) / npq + 0.5);
+  const double t = -kD * kD / (2 * npq);
+  const double boundsError = (std::fabs(rho) + std::fabs(t)) * 24 * kUnit;
+  if (!(v - vError > 0)) return kUnsure;
+  BoundedLog logV;
+  if (!DoubleLog(v, logV)) return kUnsure;
+  // ln of the Extended v: within logV's bound of ln of v in double, and vError / (v - vError)
+  // of the first.
+  const double logError = logV.bound + vError / (v - vError) + boundsError;
+  if (logV.value + logError < t - rho) return FirstAttempt::kAccept;
+  if (logV.value - logError > t + rho) return FirstAttempt::kRedraw;
+  // The final comparison, ln v <= xm ln(f1/x1) + (N - M + 1/2) ln(z/w)
+  // + (y - M) ln(w p / (x1 q)) + S(f1) + S(z) + S(x1) + S(w): each logarithm's argument is
+  // formed with at most five roundings, each term and the sum with a few more.
+  const double yD = static_cast<double>(y);
+  const double nD = static_cast<double>(n);
+  const double x1 = yD + 1;
+  const double f1 = modeD + 1;
+  const double z = nD + 1 - modeD;
+  const double w = nD - yD + 1;
+  BoundedLog logA, logB, logC;
+  if (!DoubleLog(f1 / x1, logA) || !DoubleLog(z / w, logB) ||
+      !DoubleLog(w * pd / (x1 * qd), logC)) {
+    return kUnsure;
+  }
+  const double coefficientB = nD - modeD + 0.5;
+  const double coefficientC = yD - modeD;
+  const double termA = xm * logA.value;
+  const double termB = coefficientB * logB.value;
+  const double termC = coefficientC * logC.value;
+  const auto stirling = [](double x) {
+    const double x2 = x * x;
+    return (13860 - (462 - (132 - (99 - 140 / x2) / x2) / x2) / x2) / x / 166320;
+  };
+  const double tails = stirling(f1) + stirling(z) + stirling(x1) + stirling(w);
+  const double right = termA + termB + termC + tails;
+  const double rightError =
+      xm * (logA.bound + 2 * kUnit) + coefficientB * (logB.bound + 2 * kUnit) +
+      std::fabs(coefficientC) * (logC.bound + 6 * kUnit) +
+      12 * kUnit * (std::fabs(termA) + std::fabs(termB) + std::fabs(termC) + std::fabs(tails));
+  const double valueError = vError / (v - vError) + logV.bound;
+  if (logV.value + valueError < right - rightError) return FirstAttempt::kAccept;
+  if (logV.value - valueError > right + rightError) return FirstAttempt::kRedraw;
+  return kUnsure;
 }
 
 // Kachitvichyanukul and Schmeiser's BTPE for N p > 30, p <= 0.5.
@@ -716,11 +927,18 @@ template <typename Gen>
 Int64 BinomialBtpe(Int64 n, Extended p, Extended q, Extended np, Gen& gen) {
   const Extended fm = np + p;
   const Int64 mode = TruncChecked(fm);
-  // The first attempt's uniforms.
-  Extended first = gen();
-  Extended second = gen();
-  Int64 quick;
-  if (BtpeFirstAttemptInDouble(n, p, q, np, mode, first, second, quick)) return quick;
+  // Attempts in double while they settle; the first one that does not is taken up by the
+  // Extended set-up with the same two uniforms.
+  Extended first;
+  Extended second;
+  FirstAttempt outcome;
+  do {
+    first = gen();
+    second = gen();
+    Int64 quick = 0;
+    outcome = BtpeAttemptInDouble(n, p, q, np, mode, first, second, quick);
+    if (outcome == FirstAttempt::kAccept) return quick;
+  } while (outcome == FirstAttempt::kRedraw);
 
   const Extended trials = static_cast<Extended>(n);
   const Extended npq = np * q;
@@ -770,6 +988,16 @@ Int64 BinomialBtpe(Int64 n, Extended p, Extended q, Extended np, Gen& gen) {
     }
     const Extended rho = (k / npq) * ((k * (k / 3 + 0.625L) + 0.1666666666666L) / npq + 0.5L);
     const Extended t = -k * k / (2 * npq);
+    // The squeeze, first from ln v in double.
+    BoundedLog approximateLogV;
+    if (DoubleLog(v, approximateLogV)) {
+      const Settled below = SettleLess(approximateLogV.value, approximateLogV.bound, t - rho, 0);
+      if (below == Settled::kYes) return y;
+      if (below == Settled::kNo &&
+          SettleLess(t + rho, 0, approximateLogV.value, approximateLogV.bound) == Settled::kYes) {
+        continue;
+      }
+    }
     const Extended logV = std::log(v);
     if (logV < t - rho) return y;
     if (logV > t + rho) continue;

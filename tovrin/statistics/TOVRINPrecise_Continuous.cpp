@@ -8,6 +8,7 @@
 #include "tovrin/foundation/TOVRINMath.h"
 #include "tovrin/foundation/detail/SpecialTails.h"
 #include "tovrin/statistics/TOVRINPrecise.h"
+#include "tovrin/statistics/TOVRINStatistics_Continuous.h"
 #include "tovrin/statistics/detail/PairArithmetic.h"
 
 namespace tovrin::precise {
@@ -75,19 +76,14 @@ Pair Standardized(Extended Mean, Extended StdDev, Extended X) {
   return detail::Quotient(detail::ExactSum(X, -Mean), Pair{StdDev});
 }
 
-// The z >= 0 with P(Z > z) = p, for 0 < p <= 1/2: a rational first estimate (Abramowitz and
-// Stegun 26.2.23), then Halley steps on erf near the centre and on the upper tail beyond.
+// The z >= 0 with P(Z > z) = p, for 0 < p <= 1/2: Wichura's AS 241 (the classic InvNormalLess,
+// good to about 1e-16) as the first estimate, then Halley steps on erf near the centre and on
+// the upper tail beyond. Halley's method triples the correct digits, so once a step is below
+// 1e-7 relative the result is exact to the working precision and no further step is needed.
 Extended InverseNormalUpper(Extended p) {
   if (p == 0.5L) return 0.0L;
   const bool central = p > 0.3L;
-  Extended z;
-  if (central) {
-    z = kSqrt2Pi * (0.5L - p);
-  } else {
-    const Extended t = std::sqrt(-2.0L * std::log(p));
-    z = t - (2.515517L + t * (0.802853L + t * 0.010328L)) /
-                (1.0L + t * (1.432788L + t * (0.189269L + t * 0.001308L)));
-  }
+  Extended z = -tovrin::InvNormalLess(p);
   for (int i = 0; i < 20; ++i) {
     const Extended density = kInvSqrt2Pi * ExpMinusHalfSquare(Pair{z});
     // u = f / f' for f increasing in z (0.5 erf(z / sqrt 2) - (0.5 - p), or p - Q(z)).
@@ -95,7 +91,7 @@ Extended InverseNormalUpper(Extended p) {
     const Extended u = f / density;
     const Extended step = u / (1.0L + 0.5L * u * z);
     z -= step;
-    if (!(std::fabs(step) > 2.0L * kEpsilon * std::fabs(z))) break;
+    if (!(std::fabs(step) > 1e-7L * std::fabs(z))) break;
   }
   return z;
 }
@@ -156,7 +152,9 @@ Extended InverseGamma(Extended a, Extended p, Extended q) {
         next = x - step / denom;
       }
     }
-    if (std::fabs(next - x) <= 2.0L * kEpsilon * x) return std::fmin(std::fmax(next, lo), hi);
+    // Newton doubles and Halley triples the correct digits: a step below 1e-10 of x leaves the
+    // next iterate exact to the working precision.
+    if (std::fabs(next - x) <= 1e-10L * x) return std::fmin(std::fmax(next, lo), hi);
     if (!(next > lo && next < hi)) {
       if (std::isinf(hi)) {
         next = x * 16.0L;
@@ -230,39 +228,9 @@ Tails FTails(Extended X, Extended DF1, Extended DF2) {
   return BetaTails(FPoint(X, DF1, DF2), 0.5L * DF1, 0.5L * DF2);
 }
 
-// The root (x, y = 1 - x) of I_x(a, b) = p, 1 - I_x = q: the foundation's inverse, then Newton
-// steps on the smaller member against the tail that is known to full accuracy (on its
-// logarithm when the target is small), until the step falls below the rounding.
+// The root (x, y = 1 - x) of I_x(a, b) = p, 1 - I_x = q, the smaller member computed directly.
 detail::BetaRoot BetaRoot(Extended p, Extended q, Extended a, Extended b) {
-  detail::BetaRoot r = detail::InverseIncompleteBetaTails(p, q, a, b);
-  for (int i = 0; i < 8; ++i) {
-    if (!(r.x > 0.0L && r.y > 0.0L)) return r;
-    // Work on the member that is small, as the lower tail of I_s(sa, sb).
-    const bool flip = r.y < r.x;
-    const Extended s = flip ? r.y : r.x;
-    const Extended sa = flip ? b : a;
-    const Extended sb = flip ? a : b;
-    const Extended sp = flip ? q : p;
-    const Extended sq = flip ? p : q;
-    const Extended other = 1.0L - s;
-    const Extended other_lo = (1.0L - other) - s;
-    const Tails t = detail::IncompleteBetaTails(s, 0.0L, other, other_lo, sa, sb);
-    const Extended density =
-        detail::BetaPowerFactor(s, 0.0L, other, other_lo, sa, sb) / (s * other);
-    if (!(density > 0.0L) || !std::isfinite(density)) return r;
-    Extended next;
-    if (sp <= sq) {
-      if (!(t.lower > 0.0L)) return r;
-      next = s * std::exp(-std::log(t.lower / sp) * t.lower / (s * density));
-    } else {
-      next = s - (sq - t.upper) / density;
-    }
-    if (!(next > 0.0L && next < 1.0L)) return r;
-    const bool done = std::fabs(next - s) <= 2.0L * kEpsilon * s;
-    r = flip ? detail::BetaRoot{1.0L - next, next} : detail::BetaRoot{next, 1.0L - next};
-    if (done) break;
-  }
-  return r;
+  return detail::InverseIncompleteBetaTails(p, q, a, b);
 }
 
 // The root of I_x(a, b) = p as the ratio x / y.
@@ -540,18 +508,25 @@ Pair ExponentialRate(Extended Mean, Extended X) {
 Extended ExponentialLess(Extended Mean, Extended X) {
   const Pair q = ExponentialRate(Mean, X);
   if (std::isinf(q.hi)) return 1;
-  return -std::expm1(-q.hi) + q.lo * std::exp(-q.hi);
+  const Extended less = -std::expm1(-q.hi);
+  return less + q.lo * (1.0L - less);
 }
 
-Extended ExponentialGreater(Extended Mean, Extended X) {
-  const Pair q = ExponentialRate(Mean, X);
+namespace {
+// e^-q for q = hi + lo >= 0.
+Extended ExpMinus(const Pair& q) {
+  if (!(q.hi < 12000.0L)) return std::isnan(q.hi) ? kNaN : 0.0L;
   return std::exp(-q.hi) * (1.0L - q.lo);
+}
+}  // namespace
+
+Extended ExponentialGreater(Extended Mean, Extended X) {
+  return ExpMinus(ExponentialRate(Mean, X));
 }
 
 Extended ExponentialPDF(Extended X, Extended Mean) {
   if (!(Mean > 0) || X < 0) RaiseMathError(rsExpDistInvalid);
-  const Pair q = detail::Quotient(Pair{X}, Pair{Mean});
-  return std::exp(-q.hi) * (1.0L - q.lo) / Mean;
+  return ExpMinus(detail::Quotient(Pair{X}, Pair{Mean})) / Mean;
 }
 
 // === Beta =======================================================================================

@@ -81,7 +81,27 @@ Extended BinomialPoint(Extended x, Extended n, const Pair& np, const Pair& nq) {
   const Extended left = PowerOfRatio(np, x);
   const Extended right = PowerOfRatio(nq, n - x);
   if (AllNormal(left, right, left * right)) return left * right * std::exp(stirling) * root;
-  return std::exp(stirling - Deviance(x, np) - Deviance(n - x, nq)) * root;
+  // The two powers leave the range though their product need not: take the product of their
+  // k-th roots (k = 2^m) and raise it by squaring, about k units of rounding, while that is
+  // fewer than the size of the exponent that the deviances would round.
+  const Extended exponent = Deviance(x, np) + Deviance(n - x, nq);
+  const Pair q1 = detail::Quotient(np, Pair{x});
+  const Pair q2 = detail::Quotient(nq, Pair{n - x});
+  const Extended size =
+      std::fmax(x * std::fabs(std::log(q1.hi)), (n - x) * std::fabs(std::log(q2.hi)));
+  Extended k = 1.0L;
+  int m = 0;
+  while (size / k > 11000.0L && k < exponent) {
+    k *= 2.0L;
+    ++m;
+  }
+  Extended h = std::pow(q1.hi, x / k) * std::pow(q2.hi, (n - x) / k);
+  if (k < exponent && exponent < 12000.0L && std::isnormal(h)) {
+    for (int i = 0; i < m; ++i) h *= h;
+    h *= (1.0L + x * (q1.lo / q1.hi)) * (1.0L + (n - x) * (q2.lo / q2.hi));
+    if (std::isnormal(h)) return h * std::exp(stirling) * root;
+  }
+  return std::exp(stirling - exponent) * root;
 }
 
 // (p, 1 - p) as pairs, each exact to twice the working precision.

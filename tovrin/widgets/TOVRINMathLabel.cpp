@@ -336,6 +336,11 @@ void TQENMathLabel::SetText(const QString& Text) {
   Relayout();
 }
 
+void TQENMathLabel::SetAlignment(Qt::Alignment Value) {
+  alignment_ = Value;
+  update();
+}
+
 bool TQENMathLabel::IsMarkup() const { return layout_->markup; }
 
 int TQENMathLabel::Ascent() const { return static_cast<int>(std::ceil(layout_->laid.ascent)); }
@@ -368,8 +373,15 @@ void TQENMathLabel::paintEvent(QPaintEvent*) {
   const auto& laid = layout_->laid;
   const QRect area = contentsRect();
   const qreal height = std::ceil(laid.ascent) + std::ceil(laid.descent);
-  const QPointF origin(area.left(), area.top() + std::max<qreal>(0, (area.height() - height) / 2) +
-                                        std::ceil(laid.ascent));
+  const qreal width = std::ceil(laid.width);
+  const qreal x = alignment_ & Qt::AlignRight     ? area.right() + 1 - width
+                  : alignment_ & Qt::AlignHCenter ? area.left() + (area.width() - width) / 2
+                                                  : area.left();
+  const qreal top = alignment_ & Qt::AlignTop      ? area.top()
+                    : alignment_ & Qt::AlignBottom ? area.bottom() + 1 - height
+                                                   : area.top() + (area.height() - height) / 2;
+  const QPointF origin(std::max<qreal>(area.left(), x),
+                       std::max<qreal>(area.top(), top) + std::ceil(laid.ascent));
   const QColor ink = palette().color(foregroundRole());
   for (const auto& stroke : laid.strokes) {
     if (!stroke.text.isEmpty()) {

@@ -27,6 +27,7 @@ struct MathLayout;
 class TQENMathLabel : public QWidget {
   Q_OBJECT
   Q_PROPERTY(QString Text READ Text WRITE SetText)
+  Q_PROPERTY(Qt::Alignment Alignment READ Alignment WRITE SetAlignment)
 
  public:
   explicit TQENMathLabel(QWidget* parent = nullptr);
@@ -35,6 +36,10 @@ class TQENMathLabel : public QWidget {
 
   QString Text() const { return text_; }
   void SetText(const QString& Text);
+  // Where the laid-out text sits in the contents rectangle (as QLabel::alignment); default
+  // left and vertically centred.
+  Qt::Alignment Alignment() const { return alignment_; }
+  void SetAlignment(Qt::Alignment Value);
   // False when the text is malformed markup and is drawn literally.
   bool IsMarkup() const;
   // The laid-out height above the baseline (the ascent), in pixels.
@@ -51,6 +56,7 @@ class TQENMathLabel : public QWidget {
   void Relayout();
 
   QString text_;
+  Qt::Alignment alignment_ = Qt::AlignLeft | Qt::AlignVCenter;
   std::unique_ptr<detail::MathLayout> layout_;
 };
 

@@ -158,12 +158,15 @@ TEST(MatrixFractEdit, FractionsAreTypedAndOthersShownAsDecimals) {
     EXPECT_EQ(edit.Matrix()[0][0], c.value);
     EXPECT_EQ(cell.data().toString(), c.shown);
   }
+  // A value shown as rounded decimals opens its editor on every digit.
+  ASSERT_TRUE(edit.model()->setData(cell, "1/7000"));
+  EXPECT_EQ(Str2Float(cell.data(Qt::EditRole).toString().toStdString()), 1.0L / 7000);
   for (const char* bad : {"1/0", "2//3", "a/3", "1/2/3", "/3"}) {
     SCOPED_TRACE(bad);
     EXPECT_FALSE(edit.model()->setData(cell, bad));
     EXPECT_EQ(errors.last()[1].toInt(), -1);
   }
-  EXPECT_EQ(edit.Matrix()[0][0], -0.25L);
+  EXPECT_EQ(edit.Matrix()[0][0], 1.0L / 7000);
   edit.SetMaxDenominator(3);
   EXPECT_TRUE(edit.model()->setData(cell, "0.1"));
   EXPECT_EQ(cell.data().toString(), "0.1000");

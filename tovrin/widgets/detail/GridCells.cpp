@@ -98,16 +98,19 @@ std::optional<Fraction> BestFraction(Extended X, Int64 MaxDenominator) {
 
 namespace tovrin::detail {
 
+std::optional<QString> ExactFractionText(Extended Value, Int64 MaxDenominator) {
+  const auto f = BestFraction(Value, MaxDenominator);
+  if (!f) return std::nullopt;
+  const Extended approximation =
+      static_cast<Extended>(f->Numerator) / static_cast<Extended>(f->Denominator);
+  if (!FloatIsZero(Value - approximation)) return std::nullopt;
+  if (f->Denominator == 1) return QString::number(f->Numerator);
+  return QStringLiteral("%1/%2").arg(f->Numerator).arg(f->Denominator);
+}
+
 QString FractionCellText(Extended Value, bool IsNull, int Decimals, Int64 MaxDenominator) {
   if (!IsNull) {
-    if (const auto f = BestFraction(Value, MaxDenominator)) {
-      const Extended approximation =
-          static_cast<Extended>(f->Numerator) / static_cast<Extended>(f->Denominator);
-      if (FloatIsZero(Value - approximation)) {
-        if (f->Denominator == 1) return QString::number(f->Numerator);
-        return QStringLiteral("%1/%2").arg(f->Numerator).arg(f->Denominator);
-      }
-    }
+    if (auto text = ExactFractionText(Value, MaxDenominator)) return *std::move(text);
   }
   return CellText(Value, IsNull, Decimals);
 }
@@ -141,8 +144,10 @@ QVariant GridModel::data(const QModelIndex& index, int role) const {
     case Qt::AccessibleTextRole:
       return DisplayText(index);
     case Qt::EditRole:
-      // A fraction grid opens its editor on the fraction it shows.
-      if (maxDenominator_ > 0 && !CellIsNull(index)) return DisplayText(index);
+      // A fraction grid opens its editor on the fraction it shows, if it shows one.
+      if (maxDenominator_ > 0 && !CellIsNull(index)) {
+        if (auto text = ExactFractionText(CellValue(index), maxDenominator_)) return *text;
+      }
       return CellEditText(CellValue(index), CellIsNull(index));
     case Qt::TextAlignmentRole:
       return QVariant::fromValue(Qt::AlignRight | Qt::AlignVCenter);

@@ -47,8 +47,11 @@ struct Fraction {
 };
 std::optional<Fraction> BestFraction(Extended X, Int64 MaxDenominator);
 
-// A cell's displayed text in a fraction grid: "p/q" or "p" when a fraction with a denominator
-// up to MaxDenominator lies within QENTolerance of Value, else CellText.
+// "p/q", or "p" for a whole number, when the best fraction with a denominator up to
+// MaxDenominator lies within QENTolerance of Value; otherwise nothing.
+std::optional<QString> ExactFractionText(Extended Value, Int64 MaxDenominator);
+
+// A cell's displayed text in a fraction grid: ExactFractionText, else CellText.
 QString FractionCellText(Extended Value, bool IsNull, int Decimals, Int64 MaxDenominator);
 
 // The part of a grid's model that concerns one value cell: how it is shown, edited and
