@@ -195,9 +195,9 @@ TEST(QuickSortPositions, ExchangesAsTracedByHand) {
   EXPECT_EQ(sortTagged({{3, 'a'}, {1, 'b'}, {2, 'c'}}, true), "bca");
   EXPECT_EQ(sortTagged({{5, 'a'}, {5, 'b'}, {5, 'c'}}, true), "cba");
   EXPECT_EQ(sortTagged({{1, 'a'}, {3, 'b'}, {2, 'c'}}, false), "bca");
-  // Even length: the pivot is position 2 of 1..4 (key 2, tag b); b and d exchange, then the
-  // part 1..3 (pivot d) exchanges b and c, then 1..2 exchanges a and c.
-  EXPECT_EQ(sortTagged({{1, 'a'}, {2, 'b'}, {1, 'c'}, {2, 'd'}}, true), "cadb");
+  // Even length: the pivot is position 2 of 1..4 (key 0, tag b); a and d exchange, b with
+  // itself; then the part 3..4 (pivot a) exchanges a and c. The upper middle would give "bdca".
+  EXPECT_EQ(sortTagged({{1, 'a'}, {0, 'b'}, {1, 'c'}, {0, 'd'}}, true), "dbac");
 }
 
 template <typename T>
