@@ -332,6 +332,85 @@ struct Column {
   std::size_t missing = 0;
 };
 
+// The summaries of a table's chosen fields: one per field, or one per group and field with
+// the groups in order of first appearance. The table is read once; each column's values go to
+// the component and are freed before the next column's are summarised.
+struct TableSummaries {
+  std::vector<Summary> summaries;
+  bool grouped = false;
+  bool by_field = false;       // several fields
+  bool json_by_field = false;  // JSON names the fields: several, or chosen with -f
+};
+
+TableSummaries SummarizeTable(const Arguments& Args, const TableOptions& Table, bool Population,
+                              Byte Decimals, bool WantLines) {
+  const MissingTexts missing_texts(Args.Value("--na").value_or("NA,NaN,"));
+  std::vector<TableField> fields;
+  std::optional<TableField> group_field;
+  std::vector<std::string> groups;
+  std::unordered_map<std::string, std::size_t, StringHash, std::equal_to<>> group_index;
+  std::vector<Column> columns;
+  std::string_view last_key;
+  std::size_t last_group = 0;
+  bool have_last = false;
+  ScanTable(
+      Args.Operands(), Table,
+      [&](const std::vector<std::string>& names, std::size_t count) {
+        fields = ResolveFields(Table.fields, "-f/--field", names, count, Table.header);
+        if (Table.group) {
+          const std::vector<TableField> g =
+              ResolveFields(*Table.group, "-g/--group", names, count, Table.header);
+          if (g.size() != 1)
+            throw UsageError("-g/--group takes one field, not '" + *Table.group + "'");
+          group_field = g.front();
+        } else {
+          columns.resize(fields.size());
+        }
+      },
+      [&](const RecordReader& reader) {
+        std::size_t base = 0;
+        if (group_field) {
+          const std::string_view key = FieldOf(reader, *group_field);
+          if (!have_last || key != last_key) {
+            auto found = group_index.find(key);
+            if (found == group_index.end()) {
+              found = group_index.emplace(std::string(key), groups.size()).first;
+              groups.emplace_back(key);
+              columns.resize(columns.size() + fields.size());
+            }
+            last_key = found->first;
+            last_group = found->second;
+            have_last = true;
+          }
+          base = last_group * fields.size();
+        }
+        for (std::size_t f = 0; f < fields.size(); ++f) {
+          const std::optional<Extended> value =
+              FieldValue(reader, fields[f], FieldOf(reader, fields[f]), missing_texts);
+          Column& column = columns[base + f];
+          if (value) {
+            column.values.push_back(*value);
+          } else {
+            ++column.missing;
+          }
+        }
+      });
+  TableSummaries result;
+  result.grouped = group_field.has_value();
+  result.by_field = fields.size() > 1;
+  result.json_by_field = result.by_field || (!result.grouped && Table.fields_given);
+  for (std::size_t c = 0; c < columns.size(); ++c) {
+    Summary s = Summarize(std::move(columns[c].values), Population, Decimals,
+                          WantLines && !result.grouped && fields.size() == 1);
+    TQENFloatVector().swap(columns[c].values);
+    s.missing = columns[c].missing;
+    s.field = fields[c % fields.size()].name;
+    if (result.grouped) s.group = groups[c / fields.size()];
+    result.summaries.push_back(std::move(s));
+  }
+  return result;
+}
+
 }  // namespace
 
 int RunDescribe(std::span<const std::string> Words) {
@@ -352,7 +431,6 @@ int RunDescribe(std::span<const std::string> Words) {
     if (args.Value("--decimals")) output.stats_decimals = output.decimals;
   }
   const bool population = args.Has("--population");
-  const std::optional<std::string> na_list = args.Value("--na");
   const std::optional<TableOptions> table = ReadTableOptions(args, "1");
   const bool want_lines = !output.json && !output.stats;
 
@@ -361,6 +439,7 @@ int RunDescribe(std::span<const std::string> Words) {
   bool grouped = false, by_field = false, json_by_field = false;
   if (!table) {
     // The plain stream of numbers: one sample.
+    const std::optional<std::string> na_list = args.Value("--na");
     const MissingTexts missing_texts(na_list.value_or(""));
     std::size_t missing = 0;
     TQENFloatVector numbers =
@@ -374,69 +453,11 @@ int RunDescribe(std::span<const std::string> Words) {
     summaries.back().missing = missing;
   } else {
     output.with_missing = true;
-    const MissingTexts missing_texts(na_list.value_or("NA,NaN,"));
-    std::vector<TableField> fields;
-    std::optional<TableField> group_field;
-    std::vector<std::string> groups;
-    std::unordered_map<std::string, std::size_t, StringHash, std::equal_to<>> group_index;
-    std::vector<Column> columns;
-    std::string_view last_key;
-    std::size_t last_group = 0;
-    bool have_last = false;
-    ScanTable(
-        args.Operands(), *table,
-        [&](const std::vector<std::string>& names, std::size_t count) {
-          fields = ResolveFields(table->fields, "-f/--field", names, count);
-          if (table->group) {
-            const std::vector<TableField> g =
-                ResolveFields(*table->group, "-g/--group", names, count);
-            if (g.size() != 1)
-              throw UsageError("-g/--group takes one field, not '" + *table->group + "'");
-            group_field = g.front();
-          } else {
-            columns.resize(fields.size());
-          }
-        },
-        [&](const RecordReader& reader) {
-          std::size_t base = 0;
-          if (group_field) {
-            const std::string_view key = FieldOf(reader, *group_field);
-            if (!have_last || key != last_key) {
-              auto found = group_index.find(key);
-              if (found == group_index.end()) {
-                found = group_index.emplace(std::string(key), groups.size()).first;
-                groups.emplace_back(key);
-                columns.resize(columns.size() + fields.size());
-              }
-              last_key = found->first;
-              last_group = found->second;
-              have_last = true;
-            }
-            base = last_group * fields.size();
-          }
-          for (std::size_t f = 0; f < fields.size(); ++f) {
-            const std::optional<Extended> value =
-                FieldValue(reader, fields[f], FieldOf(reader, fields[f]), missing_texts);
-            Column& column = columns[base + f];
-            if (value) {
-              column.values.push_back(*value);
-            } else {
-              ++column.missing;
-            }
-          }
-        });
-    grouped = group_field.has_value();
-    by_field = fields.size() > 1;
-    json_by_field = by_field || (!grouped && table->fields_given);
-    for (std::size_t c = 0; c < columns.size(); ++c) {
-      Summary s = Summarize(std::move(columns[c].values), population, output.decimals,
-                            want_lines && !grouped && fields.size() == 1);
-      TQENFloatVector().swap(columns[c].values);
-      s.missing = columns[c].missing;
-      s.field = fields[c % fields.size()].name;
-      if (grouped) s.group = groups[c / fields.size()];
-      summaries.push_back(std::move(s));
-    }
+    TableSummaries result = SummarizeTable(args, *table, population, output.decimals, want_lines);
+    summaries = std::move(result.summaries);
+    grouped = result.grouped;
+    by_field = result.by_field;
+    json_by_field = result.json_by_field;
   }
 
   std::string text;

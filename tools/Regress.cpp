@@ -69,7 +69,7 @@ int RunRegress(std::span<const std::string> Words) {
     ScanTable(
         args.Operands(), *table,
         [&](const std::vector<std::string>& names, std::size_t count) {
-          fields = ResolveFields(table->fields, "-f/--field", names, count);
+          fields = ResolveFields(table->fields, "-f/--field", names, count, table->header);
           if (fields.size() != 2) {
             throw UsageError("-f/--field: regress takes two fields, x and y, not '" +
                              table->fields + "'");

@@ -87,7 +87,8 @@ void ScanTable(const std::vector<std::string>& Sources, const TableOptions& Opti
 }
 
 std::vector<TableField> ResolveFields(std::string_view List, std::string_view Option,
-                                      const std::vector<std::string>& Names, std::size_t Count) {
+                                      const std::vector<std::string>& Names, std::size_t Count,
+                                      bool Header) {
   std::vector<TableField> fields;
   const auto add = [&](std::size_t Number, std::string_view Item) {
     if (Count != 0 && Number > Count) {
@@ -117,7 +118,8 @@ std::vector<TableField> ResolveFields(std::string_view List, std::string_view Op
         if (Names.empty() && FieldNumber(item) == 0 && dash == std::string_view::npos &&
             !item.empty()) {
           throw UsageError(std::string(Option) + ": no field named '" + std::string(item) +
-                           "' (fields are named by the header line, with -H/--header)");
+                           (Header ? "' (the input has no header line)"
+                                   : "' (fields are named by the header line, with -H/--header)"));
         }
         throw UsageError(std::string(Option) + ": no field '" + std::string(item) +
                          "' (give numbers from 1, ranges such as 2-4, or names of the header)");

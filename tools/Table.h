@@ -70,8 +70,10 @@ void ScanTable(const std::vector<std::string>& Sources, const TableOptions& Opti
 
 // The fields named by LIST: 1-based numbers, ranges "a-b" and header names, separated by
 // commas. Raises UsageError naming a field that does not exist (Count 0: any number exists).
+// Header tells whether names were asked for (an empty input has none).
 std::vector<TableField> ResolveFields(std::string_view List, std::string_view Option,
-                                      const std::vector<std::string>& Names, std::size_t Count);
+                                      const std::vector<std::string>& Names, std::size_t Count,
+                                      bool Header);
 
 // The field of a record, or InputError naming the file, the line and the field when the
 // record is too short.

@@ -381,6 +381,17 @@ expect_line "k1, \"q\"${TAB}14286"
 printf 'z,x\n' >>"$WORK/big.csv"
 run 1 describe -t , -H -f v "$WORK/big.csv"
 expect_err "big.csv:450003: field 'v': not a number: 'x'"
+# The long option names and the escape \t; a column of a table gives the same report (and the
+# same JSON) as the plain stream of its numbers.
+grep -v '^#' "$DATA" | tr -s ' ,\t' '\n' | grep . | awk '{ print "m\t" $1 }' >"$WORK/michelson.tsv"
+run 0 describe "$DATA"
+cp "$WORK/out" "$WORK/plain"
+run 0 describe --delimiter '\t' --field 2 "$WORK/michelson.tsv"
+checks=$((checks + 1))
+cmp -s "$WORK/out" "$WORK/plain" || fail "a table's column and the plain numbers differ"
+run 0 describe --whitespace --group 1 --field 2 --stats NoOfValues,Mean,Median "$WORK/michelson.tsv"
+expect_out "group${TAB}NoOfValues${TAB}Mean${TAB}Median
+m${TAB}100${TAB}299852.4${TAB}299850"
 # Bad values: nothing on stdout, the file, line, field and text on stderr.
 run 1 describe -t , -H -f 4 "$WORK/cities.csv"
 expect_no_out

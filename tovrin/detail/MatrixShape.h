@@ -8,13 +8,11 @@
 #include <cstddef>
 #include <vector>
 
+#include "tovrin/foundation/TOVRINElementTypes.h"
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINGlobals.h"
 
 namespace tovrin::detail {
-
-template <typename T>
-using MatrixOf = std::vector<std::vector<T>>;
 
 // Rows, Cols and the rectangular flag as MatrixDimensions reports them. With the shape switch
 // off, the shape is taken from row 0 alone and every matrix counts as rectangular. With it on,

@@ -11,6 +11,7 @@
 
 #include <concepts>
 #include <type_traits>
+#include <vector>
 
 #include "tovrin/foundation/TOVRINGlobals.h"
 
@@ -75,5 +76,13 @@ inline constexpr bool kIsFloatElement =
 // The type of a sum of elements: Extended for the floats, a wrapping Int64 for the integers.
 template <typename T>
 using SumOf = std::conditional_t<kIsFloatElement<T>, Extended, Int64>;
+
+// The constant of the matrix scaling: Extended for the floats, the element type otherwise.
+template <typename T>
+using ScalarOf = std::conditional_t<kIsFloatElement<T>, Extended, T>;
+
+// A matrix of element type T: a vector of rows that may differ in length.
+template <typename T>
+using MatrixOf = std::vector<std::vector<T>>;
 
 }  // namespace tovrin::detail

@@ -9,6 +9,9 @@
 // Floating-point work is done in Extended and rounded to the element type on store.
 #pragma once
 
+#include <vector>
+
+#include "tovrin/foundation/TOVRINElementTypes.h"
 #include "tovrin/foundation/TOVRINFoundation.h"
 
 namespace tovrin {
@@ -43,95 +46,39 @@ TQENSIntMatrix CreateSIntIdentityMatrix(LongWord N);
 // === Shape queries ==========================================================================
 
 // The number of rows.
-LongInt MatrixRows(const TQENFloatMatrix& M);
-LongInt MatrixRows(const TQENDoubleMatrix& M);
-LongInt MatrixRows(const TQENSingleMatrix& M);
-LongInt MatrixRows(const TQENInt64Matrix& M);
-LongInt MatrixRows(const TQENLWordMatrix& M);
-LongInt MatrixRows(const TQENLIntMatrix& M);
-LongInt MatrixRows(const TQENWordMatrix& M);
-LongInt MatrixRows(const TQENSmallIntMatrix& M);
-LongInt MatrixRows(const TQENByteMatrix& M);
-LongInt MatrixRows(const TQENSIntMatrix& M);
+template <detail::AnyElement T>
+LongInt MatrixRows(const detail::MatrixOf<T>& M);
 
 // The length of row 0 (0 for a matrix with no rows); other rows are not looked at.
-LongInt MatrixCols(const TQENFloatMatrix& M);
-LongInt MatrixCols(const TQENDoubleMatrix& M);
-LongInt MatrixCols(const TQENSingleMatrix& M);
-LongInt MatrixCols(const TQENInt64Matrix& M);
-LongInt MatrixCols(const TQENLWordMatrix& M);
-LongInt MatrixCols(const TQENLIntMatrix& M);
-LongInt MatrixCols(const TQENWordMatrix& M);
-LongInt MatrixCols(const TQENSmallIntMatrix& M);
-LongInt MatrixCols(const TQENByteMatrix& M);
-LongInt MatrixCols(const TQENSIntMatrix& M);
+template <detail::AnyElement T>
+LongInt MatrixCols(const detail::MatrixOf<T>& M);
 
 // True when there is at least one row and every row has the length of row 0. Ignores
 // QENMatrixRectangularCheck.
-bool MatrixIsRectangular(const TQENFloatMatrix& M);
-bool MatrixIsRectangular(const TQENDoubleMatrix& M);
-bool MatrixIsRectangular(const TQENSingleMatrix& M);
-bool MatrixIsRectangular(const TQENInt64Matrix& M);
-bool MatrixIsRectangular(const TQENLWordMatrix& M);
-bool MatrixIsRectangular(const TQENLIntMatrix& M);
-bool MatrixIsRectangular(const TQENWordMatrix& M);
-bool MatrixIsRectangular(const TQENSmallIntMatrix& M);
-bool MatrixIsRectangular(const TQENByteMatrix& M);
-bool MatrixIsRectangular(const TQENSIntMatrix& M);
+template <detail::AnyElement T>
+bool MatrixIsRectangular(const detail::MatrixOf<T>& M);
 
 // Rows is the row count and Cols the length of row 0 (0 without rows). With
 // QENMatrixRectangularCheck off, Rectangular is always True and the shape is row 0's. With it on,
 // an empty matrix or an empty row 0 gives Rectangular False; a row of another length gives
 // Cols 0 and Rectangular False.
-void MatrixDimensions(const TQENFloatMatrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular);
-void MatrixDimensions(const TQENDoubleMatrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular);
-void MatrixDimensions(const TQENSingleMatrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular);
-void MatrixDimensions(const TQENInt64Matrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular);
-void MatrixDimensions(const TQENLWordMatrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular);
-void MatrixDimensions(const TQENLIntMatrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular);
-void MatrixDimensions(const TQENWordMatrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular);
-void MatrixDimensions(const TQENSmallIntMatrix& M, LongWord& Rows, LongWord& Cols,
+template <detail::AnyElement T>
+void MatrixDimensions(const detail::MatrixOf<T>& M, LongWord& Rows, LongWord& Cols,
                       bool& Rectangular);
-void MatrixDimensions(const TQENByteMatrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular);
-void MatrixDimensions(const TQENSIntMatrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular);
 
 // Rectangular (as MatrixDimensions reports it) with Rows = Cols.
-bool MatrixIsSquare(const TQENFloatMatrix& M);
-bool MatrixIsSquare(const TQENDoubleMatrix& M);
-bool MatrixIsSquare(const TQENSingleMatrix& M);
-bool MatrixIsSquare(const TQENInt64Matrix& M);
-bool MatrixIsSquare(const TQENLWordMatrix& M);
-bool MatrixIsSquare(const TQENLIntMatrix& M);
-bool MatrixIsSquare(const TQENWordMatrix& M);
-bool MatrixIsSquare(const TQENSmallIntMatrix& M);
-bool MatrixIsSquare(const TQENByteMatrix& M);
-bool MatrixIsSquare(const TQENSIntMatrix& M);
+template <detail::AnyElement T>
+bool MatrixIsSquare(const detail::MatrixOf<T>& M);
 
 // Both rectangular (as MatrixDimensions reports it) with equal row and column counts.
-bool MatricesSameDimensions(const TQENFloatMatrix& M1, const TQENFloatMatrix& M2);
-bool MatricesSameDimensions(const TQENDoubleMatrix& M1, const TQENDoubleMatrix& M2);
-bool MatricesSameDimensions(const TQENSingleMatrix& M1, const TQENSingleMatrix& M2);
-bool MatricesSameDimensions(const TQENInt64Matrix& M1, const TQENInt64Matrix& M2);
-bool MatricesSameDimensions(const TQENLWordMatrix& M1, const TQENLWordMatrix& M2);
-bool MatricesSameDimensions(const TQENLIntMatrix& M1, const TQENLIntMatrix& M2);
-bool MatricesSameDimensions(const TQENWordMatrix& M1, const TQENWordMatrix& M2);
-bool MatricesSameDimensions(const TQENSmallIntMatrix& M1, const TQENSmallIntMatrix& M2);
-bool MatricesSameDimensions(const TQENByteMatrix& M1, const TQENByteMatrix& M2);
-bool MatricesSameDimensions(const TQENSIntMatrix& M1, const TQENSIntMatrix& M2);
+template <detail::AnyElement T>
+bool MatricesSameDimensions(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2);
 
 // === Conversion =============================================================================
 
 // A TQENFloatMatrix of the same (possibly ragged) shape holding every element exactly.
-TQENFloatMatrix Matrix2FloatMatrix(const TQENFloatMatrix& M);
-TQENFloatMatrix Matrix2FloatMatrix(const TQENDoubleMatrix& M);
-TQENFloatMatrix Matrix2FloatMatrix(const TQENSingleMatrix& M);
-TQENFloatMatrix Matrix2FloatMatrix(const TQENInt64Matrix& M);
-TQENFloatMatrix Matrix2FloatMatrix(const TQENLWordMatrix& M);
-TQENFloatMatrix Matrix2FloatMatrix(const TQENLIntMatrix& M);
-TQENFloatMatrix Matrix2FloatMatrix(const TQENWordMatrix& M);
-TQENFloatMatrix Matrix2FloatMatrix(const TQENSmallIntMatrix& M);
-TQENFloatMatrix Matrix2FloatMatrix(const TQENByteMatrix& M);
-TQENFloatMatrix Matrix2FloatMatrix(const TQENSIntMatrix& M);
+template <detail::AnyElement T>
+TQENFloatMatrix Matrix2FloatMatrix(const detail::MatrixOf<T>& M);
 
 // === Two-matrix arithmetic ==================================================================
 
@@ -141,57 +88,32 @@ TQENFloatMatrix Matrix2FloatMatrix(const TQENSIntMatrix& M);
 // QENMatrixRectangularCheck, raise rsSameDimensions; with the switch off, a row of either
 // operand shorter than the column count raises rsMatrixRect. Integer elements wrap. The Double
 // and Single members compute in Extended and round once on store.
-TQENFloatMatrix AddMatrices(const TQENFloatMatrix& M1, const TQENFloatMatrix& M2);
-TQENDoubleMatrix AddMatrices(const TQENDoubleMatrix& M1, const TQENDoubleMatrix& M2);
-TQENSingleMatrix AddMatrices(const TQENSingleMatrix& M1, const TQENSingleMatrix& M2);
-TQENInt64Matrix AddMatrices(const TQENInt64Matrix& M1, const TQENInt64Matrix& M2);
-TQENLIntMatrix AddMatrices(const TQENLIntMatrix& M1, const TQENLIntMatrix& M2);
-
-//
-TQENFloatMatrix SubtractMatrices(const TQENFloatMatrix& M1, const TQENFloatMatrix& M2);
-TQENDoubleMatrix SubtractMatrices(const TQENDoubleMatrix& M1, const TQENDoubleMatrix& M2);
-TQENSingleMatrix SubtractMatrices(const TQENSingleMatrix& M1, const TQENSingleMatrix& M2);
-TQENInt64Matrix SubtractMatrices(const TQENInt64Matrix& M1, const TQENInt64Matrix& M2);
-TQENLIntMatrix SubtractMatrices(const TQENLIntMatrix& M1, const TQENLIntMatrix& M2);
+template <detail::ArithmeticElement T>
+detail::MatrixOf<T> AddMatrices(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2);
+template <detail::ArithmeticElement T>
+detail::MatrixOf<T> SubtractMatrices(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2);
 
 // In place into M1, with the same checks.
-void AddToMatrix(TQENFloatMatrix& M1, const TQENFloatMatrix& M2);
-void AddToMatrix(TQENDoubleMatrix& M1, const TQENDoubleMatrix& M2);
-void AddToMatrix(TQENSingleMatrix& M1, const TQENSingleMatrix& M2);
-void AddToMatrix(TQENInt64Matrix& M1, const TQENInt64Matrix& M2);
-void AddToMatrix(TQENLIntMatrix& M1, const TQENLIntMatrix& M2);
-
-//
-void SubtractFromMatrix(TQENFloatMatrix& M1, const TQENFloatMatrix& M2);
-void SubtractFromMatrix(TQENDoubleMatrix& M1, const TQENDoubleMatrix& M2);
-void SubtractFromMatrix(TQENSingleMatrix& M1, const TQENSingleMatrix& M2);
-void SubtractFromMatrix(TQENInt64Matrix& M1, const TQENInt64Matrix& M2);
-void SubtractFromMatrix(TQENLIntMatrix& M1, const TQENLIntMatrix& M2);
+template <detail::ArithmeticElement T>
+void AddToMatrix(detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2);
+template <detail::ArithmeticElement T>
+void SubtractFromMatrix(detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2);
 
 // === Scalar arithmetic ======================================================================
 
 // K x element for every element of every row, each row at its own length (ragged matrices
 // are fine). rsMatrixIsEmpty for a matrix with no rows. Float members compute in Extended; the
 // Int64 member multiplies in 64 bits and the LInt member in 32 bits, wrapping.
-TQENFloatMatrix MultiplyMatrixByConst(const TQENFloatMatrix& M, Extended K);
-TQENDoubleMatrix MultiplyMatrixByConst(const TQENDoubleMatrix& M, Extended K);
-TQENSingleMatrix MultiplyMatrixByConst(const TQENSingleMatrix& M, Extended K);
-TQENInt64Matrix MultiplyMatrixByConst(const TQENInt64Matrix& M, Int64 K);
-TQENLIntMatrix MultiplyMatrixByConst(const TQENLIntMatrix& M, LongInt K);
+template <detail::ArithmeticElement T>
+detail::MatrixOf<T> MultiplyMatrixByConst(const detail::MatrixOf<T>& M, detail::ScalarOf<T> K);
 
 // The same, in place.
-void MultiplyMatrixByConst2(TQENFloatMatrix& M, Extended K);
-void MultiplyMatrixByConst2(TQENDoubleMatrix& M, Extended K);
-void MultiplyMatrixByConst2(TQENSingleMatrix& M, Extended K);
-void MultiplyMatrixByConst2(TQENInt64Matrix& M, Int64 K);
-void MultiplyMatrixByConst2(TQENLIntMatrix& M, LongInt K);
+template <detail::ArithmeticElement T>
+void MultiplyMatrixByConst2(detail::MatrixOf<T>& M, detail::ScalarOf<T> K);
 
 // Element := element x A + B in place, with the same rules.
-void LinearTransformMatrix(TQENFloatMatrix& M, Extended A, Extended B);
-void LinearTransformMatrix(TQENDoubleMatrix& M, Extended A, Extended B);
-void LinearTransformMatrix(TQENSingleMatrix& M, Extended A, Extended B);
-void LinearTransformMatrix(TQENInt64Matrix& M, Int64 A, Int64 B);
-void LinearTransformMatrix(TQENLIntMatrix& M, LongInt A, LongInt B);
+template <detail::ArithmeticElement T>
+void LinearTransformMatrix(detail::MatrixOf<T>& M, detail::ScalarOf<T> A, detail::ScalarOf<T> B);
 
 // === Element-wise functions =================================================================
 
@@ -200,39 +122,23 @@ void LinearTransformMatrix(TQENLIntMatrix& M, LongInt A, LongInt B);
 // is replaced (exact comparisons): SqrtMatrix raises rsMatrixNeg for an element < 0, InvMatrix
 // rsMatrixZero for an element = 0, LnMatrix and Log10Matrix rsMatrixNotPos for an element <= 0.
 // There is no roll-back: elements visited before the failing one keep their new values.
-void SquareMatrix(TQENFloatMatrix& M);
-void SquareMatrix(TQENDoubleMatrix& M);
-void SquareMatrix(TQENSingleMatrix& M);
-
-//
-void SqrtMatrix(TQENFloatMatrix& M);
-void SqrtMatrix(TQENDoubleMatrix& M);
-void SqrtMatrix(TQENSingleMatrix& M);
-
-//
-void InvMatrix(TQENFloatMatrix& M);
-void InvMatrix(TQENDoubleMatrix& M);
-void InvMatrix(TQENSingleMatrix& M);
-
-//
-void LnMatrix(TQENFloatMatrix& M);
-void LnMatrix(TQENDoubleMatrix& M);
-void LnMatrix(TQENSingleMatrix& M);
-
-//
-void Log10Matrix(TQENFloatMatrix& M);
-void Log10Matrix(TQENDoubleMatrix& M);
-void Log10Matrix(TQENSingleMatrix& M);
+template <detail::FloatElement T>
+void SquareMatrix(detail::MatrixOf<T>& M);
+template <detail::FloatElement T>
+void SqrtMatrix(detail::MatrixOf<T>& M);
+template <detail::FloatElement T>
+void InvMatrix(detail::MatrixOf<T>& M);
+template <detail::FloatElement T>
+void LnMatrix(detail::MatrixOf<T>& M);
+template <detail::FloatElement T>
+void Log10Matrix(detail::MatrixOf<T>& M);
 
 // === Aggregate ==============================================================================
 
 // The mean of every element of every row, summed in Extended; N receives the element count.
 // rsMatrixIsEmpty for a matrix with no rows or with only empty rows.
-Extended GrandMean(const TQENFloatMatrix& M, LongWord& N);
-Extended GrandMean(const TQENDoubleMatrix& M, LongWord& N);
-Extended GrandMean(const TQENSingleMatrix& M, LongWord& N);
-Extended GrandMean(const TQENInt64Matrix& M, LongWord& N);
-Extended GrandMean(const TQENLIntMatrix& M, LongWord& N);
+template <detail::ArithmeticElement T>
+Extended GrandMean(const detail::MatrixOf<T>& M, LongWord& N);
 
 // === Row and column operations ==============================================================
 
@@ -245,58 +151,24 @@ Extended GrandMean(const TQENLIntMatrix& M, LongWord& N);
 //
 // Swaps: equal indices return at once, without any check. Rows are exchanged element by element
 // over the column count (the row storage stays where it is).
-void SwapMatrixRows(TQENFloatMatrix& M, LongWord Row1, LongWord Row2);
-void SwapMatrixRows(TQENDoubleMatrix& M, LongWord Row1, LongWord Row2);
-void SwapMatrixRows(TQENSingleMatrix& M, LongWord Row1, LongWord Row2);
-void SwapMatrixRows(TQENInt64Matrix& M, LongWord Row1, LongWord Row2);
-void SwapMatrixRows(TQENLWordMatrix& M, LongWord Row1, LongWord Row2);
-void SwapMatrixRows(TQENLIntMatrix& M, LongWord Row1, LongWord Row2);
-void SwapMatrixRows(TQENWordMatrix& M, LongWord Row1, LongWord Row2);
-void SwapMatrixRows(TQENSmallIntMatrix& M, LongWord Row1, LongWord Row2);
-void SwapMatrixRows(TQENByteMatrix& M, LongWord Row1, LongWord Row2);
-void SwapMatrixRows(TQENSIntMatrix& M, LongWord Row1, LongWord Row2);
-
-//
-void SwapMatrixCols(TQENFloatMatrix& M, LongWord Col1, LongWord Col2);
-void SwapMatrixCols(TQENDoubleMatrix& M, LongWord Col1, LongWord Col2);
-void SwapMatrixCols(TQENSingleMatrix& M, LongWord Col1, LongWord Col2);
-void SwapMatrixCols(TQENInt64Matrix& M, LongWord Col1, LongWord Col2);
-void SwapMatrixCols(TQENLWordMatrix& M, LongWord Col1, LongWord Col2);
-void SwapMatrixCols(TQENLIntMatrix& M, LongWord Col1, LongWord Col2);
-void SwapMatrixCols(TQENWordMatrix& M, LongWord Col1, LongWord Col2);
-void SwapMatrixCols(TQENSmallIntMatrix& M, LongWord Col1, LongWord Col2);
-void SwapMatrixCols(TQENByteMatrix& M, LongWord Col1, LongWord Col2);
-void SwapMatrixCols(TQENSIntMatrix& M, LongWord Col1, LongWord Col2);
+template <detail::AnyElement T>
+void SwapMatrixRows(detail::MatrixOf<T>& M, LongWord Row1, LongWord Row2);
+template <detail::AnyElement T>
+void SwapMatrixCols(detail::MatrixOf<T>& M, LongWord Col1, LongWord Col2);
 
 // Element := K x element along a row or a column. K exactly 1 returns at once, without any
 // check. Int64 multiplies in 64 bits and LInt in 32 bits, wrapping.
-void ScaleMatrixRow(TQENFloatMatrix& M, LongWord Row, Extended K);
-void ScaleMatrixRow(TQENDoubleMatrix& M, LongWord Row, Extended K);
-void ScaleMatrixRow(TQENSingleMatrix& M, LongWord Row, Extended K);
-void ScaleMatrixRow(TQENInt64Matrix& M, LongWord Row, Int64 K);
-void ScaleMatrixRow(TQENLIntMatrix& M, LongWord Row, LongInt K);
-
-//
-void ScaleMatrixCol(TQENFloatMatrix& M, LongWord Col, Extended K);
-void ScaleMatrixCol(TQENDoubleMatrix& M, LongWord Col, Extended K);
-void ScaleMatrixCol(TQENSingleMatrix& M, LongWord Col, Extended K);
-void ScaleMatrixCol(TQENInt64Matrix& M, LongWord Col, Int64 K);
-void ScaleMatrixCol(TQENLIntMatrix& M, LongWord Col, LongInt K);
+template <detail::ArithmeticElement T>
+void ScaleMatrixRow(detail::MatrixOf<T>& M, LongWord Row, detail::ScalarOf<T> K);
+template <detail::ArithmeticElement T>
+void ScaleMatrixCol(detail::MatrixOf<T>& M, LongWord Col, detail::ScalarOf<T> K);
 
 // M[Row1][j] := M[Row1][j] + K x M[Row2][j] for every column (AddMatrixCols likewise down the
 // columns). No shortcut: K = 0 still checks and rewrites.
-void AddMatrixRows(TQENFloatMatrix& M, LongWord Row1, LongWord Row2, Extended K);
-void AddMatrixRows(TQENDoubleMatrix& M, LongWord Row1, LongWord Row2, Extended K);
-void AddMatrixRows(TQENSingleMatrix& M, LongWord Row1, LongWord Row2, Extended K);
-void AddMatrixRows(TQENInt64Matrix& M, LongWord Row1, LongWord Row2, Int64 K);
-void AddMatrixRows(TQENLIntMatrix& M, LongWord Row1, LongWord Row2, LongInt K);
-
-//
-void AddMatrixCols(TQENFloatMatrix& M, LongWord Col1, LongWord Col2, Extended K);
-void AddMatrixCols(TQENDoubleMatrix& M, LongWord Col1, LongWord Col2, Extended K);
-void AddMatrixCols(TQENSingleMatrix& M, LongWord Col1, LongWord Col2, Extended K);
-void AddMatrixCols(TQENInt64Matrix& M, LongWord Col1, LongWord Col2, Int64 K);
-void AddMatrixCols(TQENLIntMatrix& M, LongWord Col1, LongWord Col2, LongInt K);
+template <detail::ArithmeticElement T>
+void AddMatrixRows(detail::MatrixOf<T>& M, LongWord Row1, LongWord Row2, detail::ScalarOf<T> K);
+template <detail::ArithmeticElement T>
+void AddMatrixCols(detail::MatrixOf<T>& M, LongWord Col1, LongWord Col2, detail::ScalarOf<T> K);
 
 // Whole rows ordered by their element in column Col (QSortMatrixColsOnRow: whole columns by
 // their element in row Row), by the explicit-stack quick sort, exact comparisons, not stable.
@@ -304,139 +176,52 @@ void AddMatrixCols(TQENLIntMatrix& M, LongWord Col1, LongWord Col2, LongInt K);
 // the switch a ragged matrix has none) nothing is checked or changed. Then rsMatrixRect, then
 // rsInvalidCol (rsInvalidRow); with the switch off a row shorter than the column count raises
 // rsMatrixRect.
-void QSortMatrixRowsOnCol(TQENFloatMatrix& M, LongWord Col, bool Ascending);
-void QSortMatrixRowsOnCol(TQENDoubleMatrix& M, LongWord Col, bool Ascending);
-void QSortMatrixRowsOnCol(TQENSingleMatrix& M, LongWord Col, bool Ascending);
-void QSortMatrixRowsOnCol(TQENInt64Matrix& M, LongWord Col, bool Ascending);
-void QSortMatrixRowsOnCol(TQENLWordMatrix& M, LongWord Col, bool Ascending);
-void QSortMatrixRowsOnCol(TQENLIntMatrix& M, LongWord Col, bool Ascending);
-void QSortMatrixRowsOnCol(TQENWordMatrix& M, LongWord Col, bool Ascending);
-void QSortMatrixRowsOnCol(TQENSmallIntMatrix& M, LongWord Col, bool Ascending);
-void QSortMatrixRowsOnCol(TQENByteMatrix& M, LongWord Col, bool Ascending);
-void QSortMatrixRowsOnCol(TQENSIntMatrix& M, LongWord Col, bool Ascending);
-
-//
-void QSortMatrixColsOnRow(TQENFloatMatrix& M, LongWord Row, bool Ascending);
-void QSortMatrixColsOnRow(TQENDoubleMatrix& M, LongWord Row, bool Ascending);
-void QSortMatrixColsOnRow(TQENSingleMatrix& M, LongWord Row, bool Ascending);
-void QSortMatrixColsOnRow(TQENInt64Matrix& M, LongWord Row, bool Ascending);
-void QSortMatrixColsOnRow(TQENLWordMatrix& M, LongWord Row, bool Ascending);
-void QSortMatrixColsOnRow(TQENLIntMatrix& M, LongWord Row, bool Ascending);
-void QSortMatrixColsOnRow(TQENWordMatrix& M, LongWord Row, bool Ascending);
-void QSortMatrixColsOnRow(TQENSmallIntMatrix& M, LongWord Row, bool Ascending);
-void QSortMatrixColsOnRow(TQENByteMatrix& M, LongWord Row, bool Ascending);
-void QSortMatrixColsOnRow(TQENSIntMatrix& M, LongWord Row, bool Ascending);
+template <detail::AnyElement T>
+void QSortMatrixRowsOnCol(detail::MatrixOf<T>& M, LongWord Col, bool Ascending);
+template <detail::AnyElement T>
+void QSortMatrixColsOnRow(detail::MatrixOf<T>& M, LongWord Row, bool Ascending);
 
 // A copy of row Row (Cols elements) or column Col (Rows elements). An empty matrix, or one
 // with no columns, gives an empty vector without error; otherwise rsInvalidRow / rsInvalidCol.
 // The rectangular flag is not tested (under the switch a ragged matrix reports no columns).
-TQENFloatVector ExtractMatrixRow(const TQENFloatMatrix& M, LongWord Row);
-TQENDoubleVector ExtractMatrixRow(const TQENDoubleMatrix& M, LongWord Row);
-TQENSingleVector ExtractMatrixRow(const TQENSingleMatrix& M, LongWord Row);
-TQENInt64Vector ExtractMatrixRow(const TQENInt64Matrix& M, LongWord Row);
-TQENLWordVector ExtractMatrixRow(const TQENLWordMatrix& M, LongWord Row);
-TQENLIntVector ExtractMatrixRow(const TQENLIntMatrix& M, LongWord Row);
-TQENWordVector ExtractMatrixRow(const TQENWordMatrix& M, LongWord Row);
-TQENSmallIntVector ExtractMatrixRow(const TQENSmallIntMatrix& M, LongWord Row);
-TQENByteVector ExtractMatrixRow(const TQENByteMatrix& M, LongWord Row);
-TQENSIntVector ExtractMatrixRow(const TQENSIntMatrix& M, LongWord Row);
-
-//
-TQENFloatVector ExtractMatrixCol(const TQENFloatMatrix& M, LongWord Col);
-TQENDoubleVector ExtractMatrixCol(const TQENDoubleMatrix& M, LongWord Col);
-TQENSingleVector ExtractMatrixCol(const TQENSingleMatrix& M, LongWord Col);
-TQENInt64Vector ExtractMatrixCol(const TQENInt64Matrix& M, LongWord Col);
-TQENLWordVector ExtractMatrixCol(const TQENLWordMatrix& M, LongWord Col);
-TQENLIntVector ExtractMatrixCol(const TQENLIntMatrix& M, LongWord Col);
-TQENWordVector ExtractMatrixCol(const TQENWordMatrix& M, LongWord Col);
-TQENSmallIntVector ExtractMatrixCol(const TQENSmallIntMatrix& M, LongWord Col);
-TQENByteVector ExtractMatrixCol(const TQENByteMatrix& M, LongWord Col);
-TQENSIntVector ExtractMatrixCol(const TQENSIntMatrix& M, LongWord Col);
+template <detail::AnyElement T>
+std::vector<T> ExtractMatrixRow(const detail::MatrixOf<T>& M, LongWord Row);
+template <detail::AnyElement T>
+std::vector<T> ExtractMatrixCol(const detail::MatrixOf<T>& M, LongWord Col);
 
 // Row Row (column Col) becomes V, cut to the column (row) count or padded with Fill. Nothing
 // happens for a matrix with no rows or no columns; otherwise rsInvalidRow / rsInvalidCol.
-void OverwriteMatrixRow(TQENFloatMatrix& M, LongWord Row, const TQENFloatVector& V, Extended Fill);
-void OverwriteMatrixRow(TQENDoubleMatrix& M, LongWord Row, const TQENDoubleVector& V, Double Fill);
-void OverwriteMatrixRow(TQENSingleMatrix& M, LongWord Row, const TQENSingleVector& V, Single Fill);
-void OverwriteMatrixRow(TQENInt64Matrix& M, LongWord Row, const TQENInt64Vector& V, Int64 Fill);
-void OverwriteMatrixRow(TQENLWordMatrix& M, LongWord Row, const TQENLWordVector& V, LongWord Fill);
-void OverwriteMatrixRow(TQENLIntMatrix& M, LongWord Row, const TQENLIntVector& V, LongInt Fill);
-void OverwriteMatrixRow(TQENWordMatrix& M, LongWord Row, const TQENWordVector& V, Word Fill);
-void OverwriteMatrixRow(TQENSmallIntMatrix& M, LongWord Row, const TQENSmallIntVector& V,
-                        SmallInt Fill);
-void OverwriteMatrixRow(TQENByteMatrix& M, LongWord Row, const TQENByteVector& V, Byte Fill);
-void OverwriteMatrixRow(TQENSIntMatrix& M, LongWord Row, const TQENSIntVector& V, ShortInt Fill);
-
-//
-void OverwriteMatrixCol(TQENFloatMatrix& M, LongWord Col, const TQENFloatVector& V, Extended Fill);
-void OverwriteMatrixCol(TQENDoubleMatrix& M, LongWord Col, const TQENDoubleVector& V, Double Fill);
-void OverwriteMatrixCol(TQENSingleMatrix& M, LongWord Col, const TQENSingleVector& V, Single Fill);
-void OverwriteMatrixCol(TQENInt64Matrix& M, LongWord Col, const TQENInt64Vector& V, Int64 Fill);
-void OverwriteMatrixCol(TQENLWordMatrix& M, LongWord Col, const TQENLWordVector& V, LongWord Fill);
-void OverwriteMatrixCol(TQENLIntMatrix& M, LongWord Col, const TQENLIntVector& V, LongInt Fill);
-void OverwriteMatrixCol(TQENWordMatrix& M, LongWord Col, const TQENWordVector& V, Word Fill);
-void OverwriteMatrixCol(TQENSmallIntMatrix& M, LongWord Col, const TQENSmallIntVector& V,
-                        SmallInt Fill);
-void OverwriteMatrixCol(TQENByteMatrix& M, LongWord Col, const TQENByteVector& V, Byte Fill);
-void OverwriteMatrixCol(TQENSIntMatrix& M, LongWord Col, const TQENSIntVector& V, ShortInt Fill);
+template <detail::AnyElement T>
+void OverwriteMatrixRow(detail::MatrixOf<T>& M, LongWord Row, const std::vector<T>& V,
+                        detail::ValueOf<T> Fill);
+template <detail::AnyElement T>
+void OverwriteMatrixCol(detail::MatrixOf<T>& M, LongWord Col, const std::vector<T>& V,
+                        detail::ValueOf<T> Fill);
 
 // A deep copy keeping every row's length; never raises.
-TQENFloatMatrix CopyMatrix(const TQENFloatMatrix& M);
-TQENDoubleMatrix CopyMatrix(const TQENDoubleMatrix& M);
-TQENSingleMatrix CopyMatrix(const TQENSingleMatrix& M);
-TQENInt64Matrix CopyMatrix(const TQENInt64Matrix& M);
-TQENLWordMatrix CopyMatrix(const TQENLWordMatrix& M);
-TQENLIntMatrix CopyMatrix(const TQENLIntMatrix& M);
-TQENWordMatrix CopyMatrix(const TQENWordMatrix& M);
-TQENSmallIntMatrix CopyMatrix(const TQENSmallIntMatrix& M);
-TQENByteMatrix CopyMatrix(const TQENByteMatrix& M);
-TQENSIntMatrix CopyMatrix(const TQENSIntMatrix& M);
+template <detail::AnyElement T>
+detail::MatrixOf<T> CopyMatrix(const detail::MatrixOf<T>& M);
 
 // Cols x Rows with r[j][i] = M[i][j]. rsMatrixRect when M is not rectangular (under the switch
 // an empty matrix is not); an empty matrix gives an empty result when the switch is off.
-TQENFloatMatrix TransposeMatrix(const TQENFloatMatrix& M);
-TQENDoubleMatrix TransposeMatrix(const TQENDoubleMatrix& M);
-TQENSingleMatrix TransposeMatrix(const TQENSingleMatrix& M);
-TQENInt64Matrix TransposeMatrix(const TQENInt64Matrix& M);
-TQENLWordMatrix TransposeMatrix(const TQENLWordMatrix& M);
-TQENLIntMatrix TransposeMatrix(const TQENLIntMatrix& M);
-TQENWordMatrix TransposeMatrix(const TQENWordMatrix& M);
-TQENSmallIntMatrix TransposeMatrix(const TQENSmallIntMatrix& M);
-TQENByteMatrix TransposeMatrix(const TQENByteMatrix& M);
-TQENSIntMatrix TransposeMatrix(const TQENSIntMatrix& M);
+template <detail::AnyElement T>
+detail::MatrixOf<T> TransposeMatrix(const detail::MatrixOf<T>& M);
 
 // The matrix product. Checks, in order: either operand not rectangular (rsMatrixRect); either
 // with no rows (rsMatrixIsEmpty); M1's column count differs from M2's row count (rsMatrixMult).
 // Each element is accumulated over k ascending as r := r + M2[k][j] x M1[i][k] in Extended; the
 // Double and Single members round every partial sum to the element type, so their results are
 // bit for bit those of that order.
-TQENFloatMatrix MultiplyMatrices(const TQENFloatMatrix& M1, const TQENFloatMatrix& M2);
-TQENDoubleMatrix MultiplyMatrices(const TQENDoubleMatrix& M1, const TQENDoubleMatrix& M2);
-TQENSingleMatrix MultiplyMatrices(const TQENSingleMatrix& M1, const TQENSingleMatrix& M2);
+template <detail::FloatElement T>
+detail::MatrixOf<T> MultiplyMatrices(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2);
 
 // The sum of the Cols elements of a row (of the Rows elements of a column), from index 0 up,
 // in Extended for the float types and in a wrapping 64-bit accumulator for the integer types.
 // Checks as the in-place operations. There is deliberately no LInt overload.
-Extended SumMatrixRow(const TQENFloatMatrix& M, LongWord Row);
-Extended SumMatrixRow(const TQENDoubleMatrix& M, LongWord Row);
-Extended SumMatrixRow(const TQENSingleMatrix& M, LongWord Row);
-Int64 SumMatrixRow(const TQENInt64Matrix& M, LongWord Row);
-Int64 SumMatrixRow(const TQENLWordMatrix& M, LongWord Row);
-Int64 SumMatrixRow(const TQENSmallIntMatrix& M, LongWord Row);
-Int64 SumMatrixRow(const TQENWordMatrix& M, LongWord Row);
-Int64 SumMatrixRow(const TQENSIntMatrix& M, LongWord Row);
-Int64 SumMatrixRow(const TQENByteMatrix& M, LongWord Row);
-
-//
-Extended SumMatrixCol(const TQENFloatMatrix& M, LongWord Col);
-Extended SumMatrixCol(const TQENDoubleMatrix& M, LongWord Col);
-Extended SumMatrixCol(const TQENSingleMatrix& M, LongWord Col);
-Int64 SumMatrixCol(const TQENInt64Matrix& M, LongWord Col);
-Int64 SumMatrixCol(const TQENLWordMatrix& M, LongWord Col);
-Int64 SumMatrixCol(const TQENSmallIntMatrix& M, LongWord Col);
-Int64 SumMatrixCol(const TQENWordMatrix& M, LongWord Col);
-Int64 SumMatrixCol(const TQENSIntMatrix& M, LongWord Col);
-Int64 SumMatrixCol(const TQENByteMatrix& M, LongWord Col);
+template <detail::RowSumElement T>
+detail::SumOf<T> SumMatrixRow(const detail::MatrixOf<T>& M, LongWord Row);
+template <detail::RowSumElement T>
+detail::SumOf<T> SumMatrixCol(const detail::MatrixOf<T>& M, LongWord Col);
 
 // === Row reduction ==========================================================================
 
@@ -448,41 +233,35 @@ Int64 SumMatrixCol(const TQENByteMatrix& M, LongWord Col);
 // ragged matrix under QENMatrixRectangularCheck), then rsMatrixRect (not rectangular). With the
 // switch off, a row shorter than the column count raises rsMatrixRect. The switch itself is
 // never written, so other threads never see it change.
-void RowEchelonForm(TQENFloatMatrix& M);
-void RowEchelonForm(TQENDoubleMatrix& M);
-void RowEchelonForm(TQENSingleMatrix& M);
+template <detail::FloatElement T>
+void RowEchelonForm(detail::MatrixOf<T>& M);
 
 // The same; Rank receives Rows - MatrixZeroRows of the reduced matrix.
-void RowEchelonFormRank(TQENFloatMatrix& M, LongWord& Rank);
-void RowEchelonFormRank(TQENDoubleMatrix& M, LongWord& Rank);
-void RowEchelonFormRank(TQENSingleMatrix& M, LongWord& Rank);
+template <detail::FloatElement T>
+void RowEchelonFormRank(detail::MatrixOf<T>& M, LongWord& Rank);
 
 // Gauss-Jordan inversion: Inverse starts as the identity and follows every row operation of
 // the elimination; then the entries above the pivots are cleared. Returns False for a singular
 // matrix (a zero row after the elimination), leaving M and Inverse partly reduced. Checks:
 // rsMatrixIsEmpty, then rsMatrixSqr (not rectangular or not square). M is overwritten.
-bool MatrixInverse(TQENFloatMatrix& M, TQENFloatMatrix& Inverse);
-bool MatrixInverse(TQENDoubleMatrix& M, TQENDoubleMatrix& Inverse);
-bool MatrixInverse(TQENSingleMatrix& M, TQENSingleMatrix& Inverse);
+template <detail::FloatElement T>
+bool MatrixInverse(detail::MatrixOf<T>& M, detail::MatrixOf<T>& Inverse);
 
 // The determinant by elimination (sign flips for swaps, pivot products for scalings, then the
 // diagonal). A singular matrix gives 0 or a value of the order of the tolerance. Checks as
 // MatrixInverse. M is overwritten by its row echelon form.
-Extended MatrixDeterminant(TQENFloatMatrix& M);
-Extended MatrixDeterminant(TQENDoubleMatrix& M);
-Extended MatrixDeterminant(TQENSingleMatrix& M);
+template <detail::FloatElement T>
+Extended MatrixDeterminant(detail::MatrixOf<T>& M);
 
 // The number of rows whose elements are all zero (VectorZero, each row at its own length).
 // Checks: rsMatrixIsEmpty, then rsMatrixRect; with the switch off an empty row makes VectorZero
 // raise rsVectorIsEmpty.
-LongWord MatrixZeroRows(const TQENFloatMatrix& M);
-LongWord MatrixZeroRows(const TQENDoubleMatrix& M);
-LongWord MatrixZeroRows(const TQENSingleMatrix& M);
+template <detail::FloatElement T>
+LongWord MatrixZeroRows(const detail::MatrixOf<T>& M);
 
 // True unless a diagonal element is not within tolerance of 1 or an off-diagonal element not
 // within tolerance of 0. Checks: rsMatrixIsEmpty, then rsMatrixSqr.
-bool MatrixIsIdentity(const TQENFloatMatrix& M);
-bool MatrixIsIdentity(const TQENDoubleMatrix& M);
-bool MatrixIsIdentity(const TQENSingleMatrix& M);
+template <detail::FloatElement T>
+bool MatrixIsIdentity(const detail::MatrixOf<T>& M);
 
 }  // namespace tovrin

@@ -200,223 +200,133 @@ TQENSIntMatrix CreateSIntIdentityMatrix(LongWord N) {
 }
 
 // --- Shape queries ---
-LongInt MatrixRows(const TQENFloatMatrix& M) { return RowsOf(M); }
-LongInt MatrixRows(const TQENDoubleMatrix& M) { return RowsOf(M); }
-LongInt MatrixRows(const TQENSingleMatrix& M) { return RowsOf(M); }
-LongInt MatrixRows(const TQENInt64Matrix& M) { return RowsOf(M); }
-LongInt MatrixRows(const TQENLWordMatrix& M) { return RowsOf(M); }
-LongInt MatrixRows(const TQENLIntMatrix& M) { return RowsOf(M); }
-LongInt MatrixRows(const TQENWordMatrix& M) { return RowsOf(M); }
-LongInt MatrixRows(const TQENSmallIntMatrix& M) { return RowsOf(M); }
-LongInt MatrixRows(const TQENByteMatrix& M) { return RowsOf(M); }
-LongInt MatrixRows(const TQENSIntMatrix& M) { return RowsOf(M); }
-LongInt MatrixCols(const TQENFloatMatrix& M) { return ColsOf(M); }
-LongInt MatrixCols(const TQENDoubleMatrix& M) { return ColsOf(M); }
-LongInt MatrixCols(const TQENSingleMatrix& M) { return ColsOf(M); }
-LongInt MatrixCols(const TQENInt64Matrix& M) { return ColsOf(M); }
-LongInt MatrixCols(const TQENLWordMatrix& M) { return ColsOf(M); }
-LongInt MatrixCols(const TQENLIntMatrix& M) { return ColsOf(M); }
-LongInt MatrixCols(const TQENWordMatrix& M) { return ColsOf(M); }
-LongInt MatrixCols(const TQENSmallIntMatrix& M) { return ColsOf(M); }
-LongInt MatrixCols(const TQENByteMatrix& M) { return ColsOf(M); }
-LongInt MatrixCols(const TQENSIntMatrix& M) { return ColsOf(M); }
-bool MatrixIsRectangular(const TQENFloatMatrix& M) { return detail::IsRectangularOf(M); }
-bool MatrixIsRectangular(const TQENDoubleMatrix& M) { return detail::IsRectangularOf(M); }
-bool MatrixIsRectangular(const TQENSingleMatrix& M) { return detail::IsRectangularOf(M); }
-bool MatrixIsRectangular(const TQENInt64Matrix& M) { return detail::IsRectangularOf(M); }
-bool MatrixIsRectangular(const TQENLWordMatrix& M) { return detail::IsRectangularOf(M); }
-bool MatrixIsRectangular(const TQENLIntMatrix& M) { return detail::IsRectangularOf(M); }
-bool MatrixIsRectangular(const TQENWordMatrix& M) { return detail::IsRectangularOf(M); }
-bool MatrixIsRectangular(const TQENSmallIntMatrix& M) { return detail::IsRectangularOf(M); }
-bool MatrixIsRectangular(const TQENByteMatrix& M) { return detail::IsRectangularOf(M); }
-bool MatrixIsRectangular(const TQENSIntMatrix& M) { return detail::IsRectangularOf(M); }
-void MatrixDimensions(const TQENFloatMatrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular) {
-  DimensionsOf(M, Rows, Cols, Rectangular);
+template <detail::AnyElement T>
+LongInt MatrixRows(const detail::MatrixOf<T>& M) {
+  return RowsOf(M);
 }
-void MatrixDimensions(const TQENDoubleMatrix& M, LongWord& Rows, LongWord& Cols,
+template <detail::AnyElement T>
+LongInt MatrixCols(const detail::MatrixOf<T>& M) {
+  return ColsOf(M);
+}
+template <detail::AnyElement T>
+bool MatrixIsRectangular(const detail::MatrixOf<T>& M) {
+  return detail::IsRectangularOf(M);
+}
+template <detail::AnyElement T>
+void MatrixDimensions(const detail::MatrixOf<T>& M, LongWord& Rows, LongWord& Cols,
                       bool& Rectangular) {
   DimensionsOf(M, Rows, Cols, Rectangular);
 }
-void MatrixDimensions(const TQENSingleMatrix& M, LongWord& Rows, LongWord& Cols,
-                      bool& Rectangular) {
-  DimensionsOf(M, Rows, Cols, Rectangular);
+template <detail::AnyElement T>
+bool MatrixIsSquare(const detail::MatrixOf<T>& M) {
+  return detail::IsSquareOf(M);
 }
-void MatrixDimensions(const TQENInt64Matrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular) {
-  DimensionsOf(M, Rows, Cols, Rectangular);
-}
-void MatrixDimensions(const TQENLWordMatrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular) {
-  DimensionsOf(M, Rows, Cols, Rectangular);
-}
-void MatrixDimensions(const TQENLIntMatrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular) {
-  DimensionsOf(M, Rows, Cols, Rectangular);
-}
-void MatrixDimensions(const TQENWordMatrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular) {
-  DimensionsOf(M, Rows, Cols, Rectangular);
-}
-void MatrixDimensions(const TQENSmallIntMatrix& M, LongWord& Rows, LongWord& Cols,
-                      bool& Rectangular) {
-  DimensionsOf(M, Rows, Cols, Rectangular);
-}
-void MatrixDimensions(const TQENByteMatrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular) {
-  DimensionsOf(M, Rows, Cols, Rectangular);
-}
-void MatrixDimensions(const TQENSIntMatrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular) {
-  DimensionsOf(M, Rows, Cols, Rectangular);
-}
-bool MatrixIsSquare(const TQENFloatMatrix& M) { return detail::IsSquareOf(M); }
-bool MatrixIsSquare(const TQENDoubleMatrix& M) { return detail::IsSquareOf(M); }
-bool MatrixIsSquare(const TQENSingleMatrix& M) { return detail::IsSquareOf(M); }
-bool MatrixIsSquare(const TQENInt64Matrix& M) { return detail::IsSquareOf(M); }
-bool MatrixIsSquare(const TQENLWordMatrix& M) { return detail::IsSquareOf(M); }
-bool MatrixIsSquare(const TQENLIntMatrix& M) { return detail::IsSquareOf(M); }
-bool MatrixIsSquare(const TQENWordMatrix& M) { return detail::IsSquareOf(M); }
-bool MatrixIsSquare(const TQENSmallIntMatrix& M) { return detail::IsSquareOf(M); }
-bool MatrixIsSquare(const TQENByteMatrix& M) { return detail::IsSquareOf(M); }
-bool MatrixIsSquare(const TQENSIntMatrix& M) { return detail::IsSquareOf(M); }
-bool MatricesSameDimensions(const TQENFloatMatrix& M1, const TQENFloatMatrix& M2) {
-  return detail::SameDimensionsOf(M1, M2);
-}
-bool MatricesSameDimensions(const TQENDoubleMatrix& M1, const TQENDoubleMatrix& M2) {
-  return detail::SameDimensionsOf(M1, M2);
-}
-bool MatricesSameDimensions(const TQENSingleMatrix& M1, const TQENSingleMatrix& M2) {
-  return detail::SameDimensionsOf(M1, M2);
-}
-bool MatricesSameDimensions(const TQENInt64Matrix& M1, const TQENInt64Matrix& M2) {
-  return detail::SameDimensionsOf(M1, M2);
-}
-bool MatricesSameDimensions(const TQENLWordMatrix& M1, const TQENLWordMatrix& M2) {
-  return detail::SameDimensionsOf(M1, M2);
-}
-bool MatricesSameDimensions(const TQENLIntMatrix& M1, const TQENLIntMatrix& M2) {
-  return detail::SameDimensionsOf(M1, M2);
-}
-bool MatricesSameDimensions(const TQENWordMatrix& M1, const TQENWordMatrix& M2) {
-  return detail::SameDimensionsOf(M1, M2);
-}
-bool MatricesSameDimensions(const TQENSmallIntMatrix& M1, const TQENSmallIntMatrix& M2) {
-  return detail::SameDimensionsOf(M1, M2);
-}
-bool MatricesSameDimensions(const TQENByteMatrix& M1, const TQENByteMatrix& M2) {
-  return detail::SameDimensionsOf(M1, M2);
-}
-bool MatricesSameDimensions(const TQENSIntMatrix& M1, const TQENSIntMatrix& M2) {
+template <detail::AnyElement T>
+bool MatricesSameDimensions(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
   return detail::SameDimensionsOf(M1, M2);
 }
 
 // --- Conversion ---
-TQENFloatMatrix Matrix2FloatMatrix(const TQENFloatMatrix& M) { return ToFloatMatrix(M); }
-TQENFloatMatrix Matrix2FloatMatrix(const TQENDoubleMatrix& M) { return ToFloatMatrix(M); }
-TQENFloatMatrix Matrix2FloatMatrix(const TQENSingleMatrix& M) { return ToFloatMatrix(M); }
-TQENFloatMatrix Matrix2FloatMatrix(const TQENInt64Matrix& M) { return ToFloatMatrix(M); }
-TQENFloatMatrix Matrix2FloatMatrix(const TQENLWordMatrix& M) { return ToFloatMatrix(M); }
-TQENFloatMatrix Matrix2FloatMatrix(const TQENLIntMatrix& M) { return ToFloatMatrix(M); }
-TQENFloatMatrix Matrix2FloatMatrix(const TQENWordMatrix& M) { return ToFloatMatrix(M); }
-TQENFloatMatrix Matrix2FloatMatrix(const TQENSmallIntMatrix& M) { return ToFloatMatrix(M); }
-TQENFloatMatrix Matrix2FloatMatrix(const TQENByteMatrix& M) { return ToFloatMatrix(M); }
-TQENFloatMatrix Matrix2FloatMatrix(const TQENSIntMatrix& M) { return ToFloatMatrix(M); }
+template <detail::AnyElement T>
+TQENFloatMatrix Matrix2FloatMatrix(const detail::MatrixOf<T>& M) {
+  return ToFloatMatrix(M);
+}
 
 // --- Two-matrix arithmetic ---
-TQENFloatMatrix AddMatrices(const TQENFloatMatrix& M1, const TQENFloatMatrix& M2) {
+template <detail::ArithmeticElement T>
+detail::MatrixOf<T> AddMatrices(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
   return AddOf(M1, M2);
 }
-TQENDoubleMatrix AddMatrices(const TQENDoubleMatrix& M1, const TQENDoubleMatrix& M2) {
-  return AddOf(M1, M2);
-}
-TQENSingleMatrix AddMatrices(const TQENSingleMatrix& M1, const TQENSingleMatrix& M2) {
-  return AddOf(M1, M2);
-}
-TQENInt64Matrix AddMatrices(const TQENInt64Matrix& M1, const TQENInt64Matrix& M2) {
-  return AddOf(M1, M2);
-}
-TQENLIntMatrix AddMatrices(const TQENLIntMatrix& M1, const TQENLIntMatrix& M2) {
-  return AddOf(M1, M2);
-}
-TQENFloatMatrix SubtractMatrices(const TQENFloatMatrix& M1, const TQENFloatMatrix& M2) {
+template <detail::ArithmeticElement T>
+detail::MatrixOf<T> SubtractMatrices(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
   return SubtractOf(M1, M2);
 }
-TQENDoubleMatrix SubtractMatrices(const TQENDoubleMatrix& M1, const TQENDoubleMatrix& M2) {
-  return SubtractOf(M1, M2);
+template <detail::ArithmeticElement T>
+void AddToMatrix(detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
+  AddToOf(M1, M2);
 }
-TQENSingleMatrix SubtractMatrices(const TQENSingleMatrix& M1, const TQENSingleMatrix& M2) {
-  return SubtractOf(M1, M2);
-}
-TQENInt64Matrix SubtractMatrices(const TQENInt64Matrix& M1, const TQENInt64Matrix& M2) {
-  return SubtractOf(M1, M2);
-}
-TQENLIntMatrix SubtractMatrices(const TQENLIntMatrix& M1, const TQENLIntMatrix& M2) {
-  return SubtractOf(M1, M2);
-}
-void AddToMatrix(TQENFloatMatrix& M1, const TQENFloatMatrix& M2) { AddToOf(M1, M2); }
-void AddToMatrix(TQENDoubleMatrix& M1, const TQENDoubleMatrix& M2) { AddToOf(M1, M2); }
-void AddToMatrix(TQENSingleMatrix& M1, const TQENSingleMatrix& M2) { AddToOf(M1, M2); }
-void AddToMatrix(TQENInt64Matrix& M1, const TQENInt64Matrix& M2) { AddToOf(M1, M2); }
-void AddToMatrix(TQENLIntMatrix& M1, const TQENLIntMatrix& M2) { AddToOf(M1, M2); }
-void SubtractFromMatrix(TQENFloatMatrix& M1, const TQENFloatMatrix& M2) { SubtractFromOf(M1, M2); }
-void SubtractFromMatrix(TQENDoubleMatrix& M1, const TQENDoubleMatrix& M2) {
+template <detail::ArithmeticElement T>
+void SubtractFromMatrix(detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
   SubtractFromOf(M1, M2);
 }
-void SubtractFromMatrix(TQENSingleMatrix& M1, const TQENSingleMatrix& M2) {
-  SubtractFromOf(M1, M2);
-}
-void SubtractFromMatrix(TQENInt64Matrix& M1, const TQENInt64Matrix& M2) { SubtractFromOf(M1, M2); }
-void SubtractFromMatrix(TQENLIntMatrix& M1, const TQENLIntMatrix& M2) { SubtractFromOf(M1, M2); }
 
 // --- Scalar arithmetic ---
-TQENFloatMatrix MultiplyMatrixByConst(const TQENFloatMatrix& M, Extended K) {
+template <detail::ArithmeticElement T>
+detail::MatrixOf<T> MultiplyMatrixByConst(const detail::MatrixOf<T>& M, detail::ScalarOf<T> K) {
   return MultiplyByConstOf(M, K);
 }
-TQENDoubleMatrix MultiplyMatrixByConst(const TQENDoubleMatrix& M, Extended K) {
-  return MultiplyByConstOf(M, K);
+template <detail::ArithmeticElement T>
+void MultiplyMatrixByConst2(detail::MatrixOf<T>& M, detail::ScalarOf<T> K) {
+  MultiplyByConstInPlaceOf(M, K);
 }
-TQENSingleMatrix MultiplyMatrixByConst(const TQENSingleMatrix& M, Extended K) {
-  return MultiplyByConstOf(M, K);
-}
-TQENInt64Matrix MultiplyMatrixByConst(const TQENInt64Matrix& M, Int64 K) {
-  return MultiplyByConstOf(M, K);
-}
-TQENLIntMatrix MultiplyMatrixByConst(const TQENLIntMatrix& M, LongInt K) {
-  return MultiplyByConstOf(M, K);
-}
-void MultiplyMatrixByConst2(TQENFloatMatrix& M, Extended K) { MultiplyByConstInPlaceOf(M, K); }
-void MultiplyMatrixByConst2(TQENDoubleMatrix& M, Extended K) { MultiplyByConstInPlaceOf(M, K); }
-void MultiplyMatrixByConst2(TQENSingleMatrix& M, Extended K) { MultiplyByConstInPlaceOf(M, K); }
-void MultiplyMatrixByConst2(TQENInt64Matrix& M, Int64 K) { MultiplyByConstInPlaceOf(M, K); }
-void MultiplyMatrixByConst2(TQENLIntMatrix& M, LongInt K) { MultiplyByConstInPlaceOf(M, K); }
-void LinearTransformMatrix(TQENFloatMatrix& M, Extended A, Extended B) {
+template <detail::ArithmeticElement T>
+void LinearTransformMatrix(detail::MatrixOf<T>& M, detail::ScalarOf<T> A, detail::ScalarOf<T> B) {
   LinearTransformOf(M, A, B);
 }
-void LinearTransformMatrix(TQENDoubleMatrix& M, Extended A, Extended B) {
-  LinearTransformOf(M, A, B);
-}
-void LinearTransformMatrix(TQENSingleMatrix& M, Extended A, Extended B) {
-  LinearTransformOf(M, A, B);
-}
-void LinearTransformMatrix(TQENInt64Matrix& M, Int64 A, Int64 B) { LinearTransformOf(M, A, B); }
-void LinearTransformMatrix(TQENLIntMatrix& M, LongInt A, LongInt B) { LinearTransformOf(M, A, B); }
 
 // --- Element-wise functions ---
-void SquareMatrix(TQENFloatMatrix& M) { SquareOf(M); }
-void SquareMatrix(TQENDoubleMatrix& M) { SquareOf(M); }
-void SquareMatrix(TQENSingleMatrix& M) { SquareOf(M); }
-void SqrtMatrix(TQENFloatMatrix& M) { SqrtOf(M); }
-void SqrtMatrix(TQENDoubleMatrix& M) { SqrtOf(M); }
-void SqrtMatrix(TQENSingleMatrix& M) { SqrtOf(M); }
-void InvMatrix(TQENFloatMatrix& M) { InvOf(M); }
-void InvMatrix(TQENDoubleMatrix& M) { InvOf(M); }
-void InvMatrix(TQENSingleMatrix& M) { InvOf(M); }
-void LnMatrix(TQENFloatMatrix& M) { LnOf(M); }
-void LnMatrix(TQENDoubleMatrix& M) { LnOf(M); }
-void LnMatrix(TQENSingleMatrix& M) { LnOf(M); }
-void Log10Matrix(TQENFloatMatrix& M) { Log10Of(M); }
-void Log10Matrix(TQENDoubleMatrix& M) { Log10Of(M); }
-void Log10Matrix(TQENSingleMatrix& M) { Log10Of(M); }
+template <detail::FloatElement T>
+void SquareMatrix(detail::MatrixOf<T>& M) {
+  SquareOf(M);
+}
+template <detail::FloatElement T>
+void SqrtMatrix(detail::MatrixOf<T>& M) {
+  SqrtOf(M);
+}
+template <detail::FloatElement T>
+void InvMatrix(detail::MatrixOf<T>& M) {
+  InvOf(M);
+}
+template <detail::FloatElement T>
+void LnMatrix(detail::MatrixOf<T>& M) {
+  LnOf(M);
+}
+template <detail::FloatElement T>
+void Log10Matrix(detail::MatrixOf<T>& M) {
+  Log10Of(M);
+}
 
 // --- Aggregate ---
-Extended GrandMean(const TQENFloatMatrix& M, LongWord& N) { return GrandMeanOf(M, N); }
-Extended GrandMean(const TQENDoubleMatrix& M, LongWord& N) { return GrandMeanOf(M, N); }
-Extended GrandMean(const TQENSingleMatrix& M, LongWord& N) { return GrandMeanOf(M, N); }
-Extended GrandMean(const TQENInt64Matrix& M, LongWord& N) { return GrandMeanOf(M, N); }
-Extended GrandMean(const TQENLIntMatrix& M, LongWord& N) { return GrandMeanOf(M, N); }
+template <detail::ArithmeticElement T>
+Extended GrandMean(const detail::MatrixOf<T>& M, LongWord& N) {
+  return GrandMeanOf(M, N);
+}
+
+using detail::MatrixOf;
+using detail::ScalarOf;
+using detail::SumOf;
+using detail::ValueOf;
+
+#define TOVRIN_INSTANTIATE(T)                                                      \
+  template LongInt MatrixRows(const MatrixOf<T>&);                                 \
+  template LongInt MatrixCols(const MatrixOf<T>&);                                 \
+  template bool MatrixIsRectangular(const MatrixOf<T>&);                           \
+  template void MatrixDimensions(const MatrixOf<T>&, LongWord&, LongWord&, bool&); \
+  template bool MatrixIsSquare(const MatrixOf<T>&);                                \
+  template bool MatricesSameDimensions(const MatrixOf<T>&, const MatrixOf<T>&);    \
+  template TQENFloatMatrix Matrix2FloatMatrix(const MatrixOf<T>&);
+TOVRIN_ALL_ELEMENTS(TOVRIN_INSTANTIATE)
+#undef TOVRIN_INSTANTIATE
+
+#define TOVRIN_INSTANTIATE(T)                                                    \
+  template MatrixOf<T> AddMatrices(const MatrixOf<T>&, const MatrixOf<T>&);      \
+  template MatrixOf<T> SubtractMatrices(const MatrixOf<T>&, const MatrixOf<T>&); \
+  template void AddToMatrix(MatrixOf<T>&, const MatrixOf<T>&);                   \
+  template void SubtractFromMatrix(MatrixOf<T>&, const MatrixOf<T>&);            \
+  template MatrixOf<T> MultiplyMatrixByConst(const MatrixOf<T>&, ScalarOf<T>);   \
+  template void MultiplyMatrixByConst2(MatrixOf<T>&, ScalarOf<T>);               \
+  template void LinearTransformMatrix(MatrixOf<T>&, ScalarOf<T>, ScalarOf<T>);   \
+  template Extended GrandMean(const MatrixOf<T>&, LongWord&);
+TOVRIN_ARITHMETIC_ELEMENTS(TOVRIN_INSTANTIATE)
+#undef TOVRIN_INSTANTIATE
+
+#define TOVRIN_INSTANTIATE(T)               \
+  template void SquareMatrix(MatrixOf<T>&); \
+  template void SqrtMatrix(MatrixOf<T>&);   \
+  template void InvMatrix(MatrixOf<T>&);    \
+  template void LnMatrix(MatrixOf<T>&);     \
+  template void Log10Matrix(MatrixOf<T>&);
+TOVRIN_FLOAT_ELEMENTS(TOVRIN_INSTANTIATE)
+#undef TOVRIN_INSTANTIATE
 
 }  // namespace tovrin

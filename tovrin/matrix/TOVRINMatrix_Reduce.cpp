@@ -10,9 +10,9 @@
 #include <vector>
 
 #include "tovrin/detail/ElementRules.h"
-#include "tovrin/matrix/TOVRINMatrix.h"
 #include "tovrin/detail/MatrixRowCol.h"
 #include "tovrin/detail/MatrixShape.h"
+#include "tovrin/matrix/TOVRINMatrix.h"
 #include "tovrin/vector/TOVRINVector.h"
 
 namespace tovrin {
@@ -265,23 +265,44 @@ bool IsIdentityOf(const MatrixOf<T>& M) {
 
 }  // namespace
 
-void RowEchelonForm(TQENFloatMatrix& M) { RowEchelonFormOf(M); }
-void RowEchelonForm(TQENDoubleMatrix& M) { RowEchelonFormOf(M); }
-void RowEchelonForm(TQENSingleMatrix& M) { RowEchelonFormOf(M); }
-void RowEchelonFormRank(TQENFloatMatrix& M, LongWord& Rank) { RowEchelonFormRankOf(M, Rank); }
-void RowEchelonFormRank(TQENDoubleMatrix& M, LongWord& Rank) { RowEchelonFormRankOf(M, Rank); }
-void RowEchelonFormRank(TQENSingleMatrix& M, LongWord& Rank) { RowEchelonFormRankOf(M, Rank); }
-bool MatrixInverse(TQENFloatMatrix& M, TQENFloatMatrix& Inverse) { return InverseOf(M, Inverse); }
-bool MatrixInverse(TQENDoubleMatrix& M, TQENDoubleMatrix& Inverse) { return InverseOf(M, Inverse); }
-bool MatrixInverse(TQENSingleMatrix& M, TQENSingleMatrix& Inverse) { return InverseOf(M, Inverse); }
-Extended MatrixDeterminant(TQENFloatMatrix& M) { return DeterminantOf(M); }
-Extended MatrixDeterminant(TQENDoubleMatrix& M) { return DeterminantOf(M); }
-Extended MatrixDeterminant(TQENSingleMatrix& M) { return DeterminantOf(M); }
-LongWord MatrixZeroRows(const TQENFloatMatrix& M) { return ZeroRowsOf(M); }
-LongWord MatrixZeroRows(const TQENDoubleMatrix& M) { return ZeroRowsOf(M); }
-LongWord MatrixZeroRows(const TQENSingleMatrix& M) { return ZeroRowsOf(M); }
-bool MatrixIsIdentity(const TQENFloatMatrix& M) { return IsIdentityOf(M); }
-bool MatrixIsIdentity(const TQENDoubleMatrix& M) { return IsIdentityOf(M); }
-bool MatrixIsIdentity(const TQENSingleMatrix& M) { return IsIdentityOf(M); }
+template <detail::FloatElement T>
+void RowEchelonForm(detail::MatrixOf<T>& M) {
+  RowEchelonFormOf(M);
+}
+template <detail::FloatElement T>
+void RowEchelonFormRank(detail::MatrixOf<T>& M, LongWord& Rank) {
+  RowEchelonFormRankOf(M, Rank);
+}
+template <detail::FloatElement T>
+bool MatrixInverse(detail::MatrixOf<T>& M, detail::MatrixOf<T>& Inverse) {
+  return InverseOf(M, Inverse);
+}
+template <detail::FloatElement T>
+Extended MatrixDeterminant(detail::MatrixOf<T>& M) {
+  return DeterminantOf(M);
+}
+template <detail::FloatElement T>
+LongWord MatrixZeroRows(const detail::MatrixOf<T>& M) {
+  return ZeroRowsOf(M);
+}
+template <detail::FloatElement T>
+bool MatrixIsIdentity(const detail::MatrixOf<T>& M) {
+  return IsIdentityOf(M);
+}
+
+using detail::MatrixOf;
+using detail::ScalarOf;
+using detail::SumOf;
+using detail::ValueOf;
+
+#define TOVRIN_INSTANTIATE(T)                                \
+  template void RowEchelonForm(MatrixOf<T>&);                \
+  template void RowEchelonFormRank(MatrixOf<T>&, LongWord&); \
+  template bool MatrixInverse(MatrixOf<T>&, MatrixOf<T>&);   \
+  template Extended MatrixDeterminant(MatrixOf<T>&);         \
+  template LongWord MatrixZeroRows(const MatrixOf<T>&);      \
+  template bool MatrixIsIdentity(const MatrixOf<T>&);
+TOVRIN_FLOAT_ELEMENTS(TOVRIN_INSTANTIATE)
+#undef TOVRIN_INSTANTIATE
 
 }  // namespace tovrin

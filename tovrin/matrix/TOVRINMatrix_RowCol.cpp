@@ -2,7 +2,6 @@
 // overwriting, copying, transposition, the matrix product and row and column sums.
 #include <algorithm>
 #include <cstddef>
-#include <type_traits>
 #include <vector>
 
 #include "tovrin/detail/ElementRules.h"
@@ -55,18 +54,14 @@ void AddColsOf(MatrixOf<T>& M, LongWord Col1, LongWord Col2, K k) {
   for (auto& row : M) row[Col1] = Rules<T>::AddScaled(row[Col1], k, row[Col2]);
 }
 
-// The sum type of an element: Extended for floats, Int64 (sign- or zero-extended, wrapping)
-// for integers.
+// Elements summed as SumVector sums them: in Extended for floats, in a wrapping Int64 (each
+// element sign- or zero-extended) for integers.
 template <typename T>
-using SumType = std::conditional_t<detail::kIsFloatElement<T>, Extended, Int64>;
+using SumType = detail::SumOf<T>;
 
 template <typename T>
 SumType<T> Accumulate(SumType<T> sum, T x) {
-  if constexpr (detail::kIsFloatElement<T>) {
-    return sum + static_cast<Extended>(x);
-  } else {
-    return detail::WrappingAdd64(sum, static_cast<Int64>(x));
-  }
+  return Rules<T>::SumAdd(sum, Rules<T>::SumTerm(x));
 }
 
 template <typename T>
@@ -93,8 +88,8 @@ SumType<T> SumColOf(const MatrixOf<T>& M, LongWord Col) {
 // that rows of M2 and of the result are read in memory order; the sequence of operations on
 // any one element is unchanged, so every bit of the result is that of the i, j, k order.
 template <typename T>
-void MultiplyRoundingEachStep(const MatrixOf<T>& M1, const MatrixOf<T>& M2, MatrixOf<T>& r,
-                              std::size_t Inner, std::size_t Cols) {
+void MultiplyInto(const MatrixOf<T>& M1, const MatrixOf<T>& M2, MatrixOf<T>& r, std::size_t Inner,
+                  std::size_t Cols) {
   for (std::size_t i = 0; i < r.size(); ++i) {
     T* out = r[i].data();
     const T* a = M1[i].data();
@@ -115,12 +110,13 @@ Extended DotInOrder(const Extended* A, const Extended* B, std::size_t Inner) {
   return c;
 }
 
-// The Extended member: no rounding between steps, so an element can be accumulated in a
-// register from start to end. M1's rows and M2's columns are first unpacked into native
-// Extended arrays (M2 transposed, so that a column is contiguous), then 2 x 2 blocks of the
-// result are formed together, which loads each operand value once for two products.
-void MultiplyExtended(const TQENFloatMatrix& M1, const TQENFloatMatrix& M2, TQENFloatMatrix& r,
-                      std::size_t Inner, std::size_t Cols) {
+// The Extended member (chosen over the template by overload resolution): no rounding between steps,
+// so an element can be accumulated in a register from start to end. M1's rows and M2's columns are
+// first unpacked into native Extended arrays (M2 transposed, so that a column is contiguous), then
+// 2 x 2 blocks of the result are formed together, which loads each operand value once for two
+// products.
+void MultiplyInto(const TQENFloatMatrix& M1, const TQENFloatMatrix& M2, TQENFloatMatrix& r,
+                  std::size_t Inner, std::size_t Cols) {
   const std::size_t rows = r.size();
   std::vector<Extended> columns(Cols * Inner);  // column j of M2 at [j * Inner]
   for (std::size_t k = 0; k < Inner; ++k) {
@@ -181,355 +177,130 @@ MatrixOf<T> MultiplyOf(const MatrixOf<T>& M1, const MatrixOf<T>& M2) {
   detail::RequireRowsReach(M1, s1.Cols);
   detail::RequireRowsReach(M2, s2.Cols);
   MatrixOf<T> r(s1.Rows, std::vector<T>(s2.Cols));
-  if constexpr (std::is_same_v<T, PackedExtended>) {
-    MultiplyExtended(M1, M2, r, s1.Cols, s2.Cols);
-  } else {
-    MultiplyRoundingEachStep(M1, M2, r, s1.Cols, s2.Cols);
-  }
+  MultiplyInto(M1, M2, r, s1.Cols, s2.Cols);
   return r;
 }
 
 }  // namespace
 
 // --- Swaps ---
-void SwapMatrixRows(TQENFloatMatrix& M, LongWord Row1, LongWord Row2) {
+template <detail::AnyElement T>
+void SwapMatrixRows(detail::MatrixOf<T>& M, LongWord Row1, LongWord Row2) {
   detail::SwapRowsOf(M, Row1, Row2);
 }
-void SwapMatrixRows(TQENDoubleMatrix& M, LongWord Row1, LongWord Row2) {
-  detail::SwapRowsOf(M, Row1, Row2);
-}
-void SwapMatrixRows(TQENSingleMatrix& M, LongWord Row1, LongWord Row2) {
-  detail::SwapRowsOf(M, Row1, Row2);
-}
-void SwapMatrixRows(TQENInt64Matrix& M, LongWord Row1, LongWord Row2) {
-  detail::SwapRowsOf(M, Row1, Row2);
-}
-void SwapMatrixRows(TQENLWordMatrix& M, LongWord Row1, LongWord Row2) {
-  detail::SwapRowsOf(M, Row1, Row2);
-}
-void SwapMatrixRows(TQENLIntMatrix& M, LongWord Row1, LongWord Row2) {
-  detail::SwapRowsOf(M, Row1, Row2);
-}
-void SwapMatrixRows(TQENWordMatrix& M, LongWord Row1, LongWord Row2) {
-  detail::SwapRowsOf(M, Row1, Row2);
-}
-void SwapMatrixRows(TQENSmallIntMatrix& M, LongWord Row1, LongWord Row2) {
-  detail::SwapRowsOf(M, Row1, Row2);
-}
-void SwapMatrixRows(TQENByteMatrix& M, LongWord Row1, LongWord Row2) {
-  detail::SwapRowsOf(M, Row1, Row2);
-}
-void SwapMatrixRows(TQENSIntMatrix& M, LongWord Row1, LongWord Row2) {
-  detail::SwapRowsOf(M, Row1, Row2);
-}
-void SwapMatrixCols(TQENFloatMatrix& M, LongWord Col1, LongWord Col2) {
-  detail::SwapColsOf(M, Col1, Col2);
-}
-void SwapMatrixCols(TQENDoubleMatrix& M, LongWord Col1, LongWord Col2) {
-  detail::SwapColsOf(M, Col1, Col2);
-}
-void SwapMatrixCols(TQENSingleMatrix& M, LongWord Col1, LongWord Col2) {
-  detail::SwapColsOf(M, Col1, Col2);
-}
-void SwapMatrixCols(TQENInt64Matrix& M, LongWord Col1, LongWord Col2) {
-  detail::SwapColsOf(M, Col1, Col2);
-}
-void SwapMatrixCols(TQENLWordMatrix& M, LongWord Col1, LongWord Col2) {
-  detail::SwapColsOf(M, Col1, Col2);
-}
-void SwapMatrixCols(TQENLIntMatrix& M, LongWord Col1, LongWord Col2) {
-  detail::SwapColsOf(M, Col1, Col2);
-}
-void SwapMatrixCols(TQENWordMatrix& M, LongWord Col1, LongWord Col2) {
-  detail::SwapColsOf(M, Col1, Col2);
-}
-void SwapMatrixCols(TQENSmallIntMatrix& M, LongWord Col1, LongWord Col2) {
-  detail::SwapColsOf(M, Col1, Col2);
-}
-void SwapMatrixCols(TQENByteMatrix& M, LongWord Col1, LongWord Col2) {
-  detail::SwapColsOf(M, Col1, Col2);
-}
-void SwapMatrixCols(TQENSIntMatrix& M, LongWord Col1, LongWord Col2) {
+template <detail::AnyElement T>
+void SwapMatrixCols(detail::MatrixOf<T>& M, LongWord Col1, LongWord Col2) {
   detail::SwapColsOf(M, Col1, Col2);
 }
 
 // --- Scaling and adding multiples ---
-void ScaleMatrixRow(TQENFloatMatrix& M, LongWord Row, Extended K) { ScaleRowOf(M, Row, K); }
-void ScaleMatrixRow(TQENDoubleMatrix& M, LongWord Row, Extended K) { ScaleRowOf(M, Row, K); }
-void ScaleMatrixRow(TQENSingleMatrix& M, LongWord Row, Extended K) { ScaleRowOf(M, Row, K); }
-void ScaleMatrixRow(TQENInt64Matrix& M, LongWord Row, Int64 K) { ScaleRowOf(M, Row, K); }
-void ScaleMatrixRow(TQENLIntMatrix& M, LongWord Row, LongInt K) { ScaleRowOf(M, Row, K); }
-void ScaleMatrixCol(TQENFloatMatrix& M, LongWord Col, Extended K) { ScaleColOf(M, Col, K); }
-void ScaleMatrixCol(TQENDoubleMatrix& M, LongWord Col, Extended K) { ScaleColOf(M, Col, K); }
-void ScaleMatrixCol(TQENSingleMatrix& M, LongWord Col, Extended K) { ScaleColOf(M, Col, K); }
-void ScaleMatrixCol(TQENInt64Matrix& M, LongWord Col, Int64 K) { ScaleColOf(M, Col, K); }
-void ScaleMatrixCol(TQENLIntMatrix& M, LongWord Col, LongInt K) { ScaleColOf(M, Col, K); }
-void AddMatrixRows(TQENFloatMatrix& M, LongWord Row1, LongWord Row2, Extended K) {
+template <detail::ArithmeticElement T>
+void ScaleMatrixRow(detail::MatrixOf<T>& M, LongWord Row, detail::ScalarOf<T> K) {
+  ScaleRowOf(M, Row, K);
+}
+template <detail::ArithmeticElement T>
+void ScaleMatrixCol(detail::MatrixOf<T>& M, LongWord Col, detail::ScalarOf<T> K) {
+  ScaleColOf(M, Col, K);
+}
+template <detail::ArithmeticElement T>
+void AddMatrixRows(detail::MatrixOf<T>& M, LongWord Row1, LongWord Row2, detail::ScalarOf<T> K) {
   AddRowsOf(M, Row1, Row2, K);
 }
-void AddMatrixRows(TQENDoubleMatrix& M, LongWord Row1, LongWord Row2, Extended K) {
-  AddRowsOf(M, Row1, Row2, K);
-}
-void AddMatrixRows(TQENSingleMatrix& M, LongWord Row1, LongWord Row2, Extended K) {
-  AddRowsOf(M, Row1, Row2, K);
-}
-void AddMatrixRows(TQENInt64Matrix& M, LongWord Row1, LongWord Row2, Int64 K) {
-  AddRowsOf(M, Row1, Row2, K);
-}
-void AddMatrixRows(TQENLIntMatrix& M, LongWord Row1, LongWord Row2, LongInt K) {
-  AddRowsOf(M, Row1, Row2, K);
-}
-void AddMatrixCols(TQENFloatMatrix& M, LongWord Col1, LongWord Col2, Extended K) {
-  AddColsOf(M, Col1, Col2, K);
-}
-void AddMatrixCols(TQENDoubleMatrix& M, LongWord Col1, LongWord Col2, Extended K) {
-  AddColsOf(M, Col1, Col2, K);
-}
-void AddMatrixCols(TQENSingleMatrix& M, LongWord Col1, LongWord Col2, Extended K) {
-  AddColsOf(M, Col1, Col2, K);
-}
-void AddMatrixCols(TQENInt64Matrix& M, LongWord Col1, LongWord Col2, Int64 K) {
-  AddColsOf(M, Col1, Col2, K);
-}
-void AddMatrixCols(TQENLIntMatrix& M, LongWord Col1, LongWord Col2, LongInt K) {
+template <detail::ArithmeticElement T>
+void AddMatrixCols(detail::MatrixOf<T>& M, LongWord Col1, LongWord Col2, detail::ScalarOf<T> K) {
   AddColsOf(M, Col1, Col2, K);
 }
 
 // --- Sorts ---
-void QSortMatrixRowsOnCol(TQENFloatMatrix& M, LongWord Col, bool Ascending) {
+template <detail::AnyElement T>
+void QSortMatrixRowsOnCol(detail::MatrixOf<T>& M, LongWord Col, bool Ascending) {
   detail::QSortRowsOnColOf(M, Col, Ascending);
 }
-void QSortMatrixRowsOnCol(TQENDoubleMatrix& M, LongWord Col, bool Ascending) {
-  detail::QSortRowsOnColOf(M, Col, Ascending);
-}
-void QSortMatrixRowsOnCol(TQENSingleMatrix& M, LongWord Col, bool Ascending) {
-  detail::QSortRowsOnColOf(M, Col, Ascending);
-}
-void QSortMatrixRowsOnCol(TQENInt64Matrix& M, LongWord Col, bool Ascending) {
-  detail::QSortRowsOnColOf(M, Col, Ascending);
-}
-void QSortMatrixRowsOnCol(TQENLWordMatrix& M, LongWord Col, bool Ascending) {
-  detail::QSortRowsOnColOf(M, Col, Ascending);
-}
-void QSortMatrixRowsOnCol(TQENLIntMatrix& M, LongWord Col, bool Ascending) {
-  detail::QSortRowsOnColOf(M, Col, Ascending);
-}
-void QSortMatrixRowsOnCol(TQENWordMatrix& M, LongWord Col, bool Ascending) {
-  detail::QSortRowsOnColOf(M, Col, Ascending);
-}
-void QSortMatrixRowsOnCol(TQENSmallIntMatrix& M, LongWord Col, bool Ascending) {
-  detail::QSortRowsOnColOf(M, Col, Ascending);
-}
-void QSortMatrixRowsOnCol(TQENByteMatrix& M, LongWord Col, bool Ascending) {
-  detail::QSortRowsOnColOf(M, Col, Ascending);
-}
-void QSortMatrixRowsOnCol(TQENSIntMatrix& M, LongWord Col, bool Ascending) {
-  detail::QSortRowsOnColOf(M, Col, Ascending);
-}
-void QSortMatrixColsOnRow(TQENFloatMatrix& M, LongWord Row, bool Ascending) {
-  detail::QSortColsOnRowOf(M, Row, Ascending);
-}
-void QSortMatrixColsOnRow(TQENDoubleMatrix& M, LongWord Row, bool Ascending) {
-  detail::QSortColsOnRowOf(M, Row, Ascending);
-}
-void QSortMatrixColsOnRow(TQENSingleMatrix& M, LongWord Row, bool Ascending) {
-  detail::QSortColsOnRowOf(M, Row, Ascending);
-}
-void QSortMatrixColsOnRow(TQENInt64Matrix& M, LongWord Row, bool Ascending) {
-  detail::QSortColsOnRowOf(M, Row, Ascending);
-}
-void QSortMatrixColsOnRow(TQENLWordMatrix& M, LongWord Row, bool Ascending) {
-  detail::QSortColsOnRowOf(M, Row, Ascending);
-}
-void QSortMatrixColsOnRow(TQENLIntMatrix& M, LongWord Row, bool Ascending) {
-  detail::QSortColsOnRowOf(M, Row, Ascending);
-}
-void QSortMatrixColsOnRow(TQENWordMatrix& M, LongWord Row, bool Ascending) {
-  detail::QSortColsOnRowOf(M, Row, Ascending);
-}
-void QSortMatrixColsOnRow(TQENSmallIntMatrix& M, LongWord Row, bool Ascending) {
-  detail::QSortColsOnRowOf(M, Row, Ascending);
-}
-void QSortMatrixColsOnRow(TQENByteMatrix& M, LongWord Row, bool Ascending) {
-  detail::QSortColsOnRowOf(M, Row, Ascending);
-}
-void QSortMatrixColsOnRow(TQENSIntMatrix& M, LongWord Row, bool Ascending) {
+template <detail::AnyElement T>
+void QSortMatrixColsOnRow(detail::MatrixOf<T>& M, LongWord Row, bool Ascending) {
   detail::QSortColsOnRowOf(M, Row, Ascending);
 }
 
 // --- Extraction and overwriting ---
-TQENFloatVector ExtractMatrixRow(const TQENFloatMatrix& M, LongWord Row) {
+template <detail::AnyElement T>
+std::vector<T> ExtractMatrixRow(const detail::MatrixOf<T>& M, LongWord Row) {
   return detail::ExtractRowOf(M, Row);
 }
-TQENDoubleVector ExtractMatrixRow(const TQENDoubleMatrix& M, LongWord Row) {
-  return detail::ExtractRowOf(M, Row);
-}
-TQENSingleVector ExtractMatrixRow(const TQENSingleMatrix& M, LongWord Row) {
-  return detail::ExtractRowOf(M, Row);
-}
-TQENInt64Vector ExtractMatrixRow(const TQENInt64Matrix& M, LongWord Row) {
-  return detail::ExtractRowOf(M, Row);
-}
-TQENLWordVector ExtractMatrixRow(const TQENLWordMatrix& M, LongWord Row) {
-  return detail::ExtractRowOf(M, Row);
-}
-TQENLIntVector ExtractMatrixRow(const TQENLIntMatrix& M, LongWord Row) {
-  return detail::ExtractRowOf(M, Row);
-}
-TQENWordVector ExtractMatrixRow(const TQENWordMatrix& M, LongWord Row) {
-  return detail::ExtractRowOf(M, Row);
-}
-TQENSmallIntVector ExtractMatrixRow(const TQENSmallIntMatrix& M, LongWord Row) {
-  return detail::ExtractRowOf(M, Row);
-}
-TQENByteVector ExtractMatrixRow(const TQENByteMatrix& M, LongWord Row) {
-  return detail::ExtractRowOf(M, Row);
-}
-TQENSIntVector ExtractMatrixRow(const TQENSIntMatrix& M, LongWord Row) {
-  return detail::ExtractRowOf(M, Row);
-}
-TQENFloatVector ExtractMatrixCol(const TQENFloatMatrix& M, LongWord Col) {
+template <detail::AnyElement T>
+std::vector<T> ExtractMatrixCol(const detail::MatrixOf<T>& M, LongWord Col) {
   return detail::ExtractColOf(M, Col);
 }
-TQENDoubleVector ExtractMatrixCol(const TQENDoubleMatrix& M, LongWord Col) {
-  return detail::ExtractColOf(M, Col);
-}
-TQENSingleVector ExtractMatrixCol(const TQENSingleMatrix& M, LongWord Col) {
-  return detail::ExtractColOf(M, Col);
-}
-TQENInt64Vector ExtractMatrixCol(const TQENInt64Matrix& M, LongWord Col) {
-  return detail::ExtractColOf(M, Col);
-}
-TQENLWordVector ExtractMatrixCol(const TQENLWordMatrix& M, LongWord Col) {
-  return detail::ExtractColOf(M, Col);
-}
-TQENLIntVector ExtractMatrixCol(const TQENLIntMatrix& M, LongWord Col) {
-  return detail::ExtractColOf(M, Col);
-}
-TQENWordVector ExtractMatrixCol(const TQENWordMatrix& M, LongWord Col) {
-  return detail::ExtractColOf(M, Col);
-}
-TQENSmallIntVector ExtractMatrixCol(const TQENSmallIntMatrix& M, LongWord Col) {
-  return detail::ExtractColOf(M, Col);
-}
-TQENByteVector ExtractMatrixCol(const TQENByteMatrix& M, LongWord Col) {
-  return detail::ExtractColOf(M, Col);
-}
-TQENSIntVector ExtractMatrixCol(const TQENSIntMatrix& M, LongWord Col) {
-  return detail::ExtractColOf(M, Col);
-}
-void OverwriteMatrixRow(TQENFloatMatrix& M, LongWord Row, const TQENFloatVector& V, Extended Fill) {
+template <detail::AnyElement T>
+void OverwriteMatrixRow(detail::MatrixOf<T>& M, LongWord Row, const std::vector<T>& V,
+                        detail::ValueOf<T> Fill) {
   detail::OverwriteRowOf(M, Row, V, Fill);
 }
-void OverwriteMatrixRow(TQENDoubleMatrix& M, LongWord Row, const TQENDoubleVector& V, Double Fill) {
-  detail::OverwriteRowOf(M, Row, V, Fill);
-}
-void OverwriteMatrixRow(TQENSingleMatrix& M, LongWord Row, const TQENSingleVector& V, Single Fill) {
-  detail::OverwriteRowOf(M, Row, V, Fill);
-}
-void OverwriteMatrixRow(TQENInt64Matrix& M, LongWord Row, const TQENInt64Vector& V, Int64 Fill) {
-  detail::OverwriteRowOf(M, Row, V, Fill);
-}
-void OverwriteMatrixRow(TQENLWordMatrix& M, LongWord Row, const TQENLWordVector& V, LongWord Fill) {
-  detail::OverwriteRowOf(M, Row, V, Fill);
-}
-void OverwriteMatrixRow(TQENLIntMatrix& M, LongWord Row, const TQENLIntVector& V, LongInt Fill) {
-  detail::OverwriteRowOf(M, Row, V, Fill);
-}
-void OverwriteMatrixRow(TQENWordMatrix& M, LongWord Row, const TQENWordVector& V, Word Fill) {
-  detail::OverwriteRowOf(M, Row, V, Fill);
-}
-void OverwriteMatrixRow(TQENSmallIntMatrix& M, LongWord Row, const TQENSmallIntVector& V,
-                        SmallInt Fill) {
-  detail::OverwriteRowOf(M, Row, V, Fill);
-}
-void OverwriteMatrixRow(TQENByteMatrix& M, LongWord Row, const TQENByteVector& V, Byte Fill) {
-  detail::OverwriteRowOf(M, Row, V, Fill);
-}
-void OverwriteMatrixRow(TQENSIntMatrix& M, LongWord Row, const TQENSIntVector& V, ShortInt Fill) {
-  detail::OverwriteRowOf(M, Row, V, Fill);
-}
-void OverwriteMatrixCol(TQENFloatMatrix& M, LongWord Col, const TQENFloatVector& V, Extended Fill) {
-  detail::OverwriteColOf(M, Col, V, Fill);
-}
-void OverwriteMatrixCol(TQENDoubleMatrix& M, LongWord Col, const TQENDoubleVector& V, Double Fill) {
-  detail::OverwriteColOf(M, Col, V, Fill);
-}
-void OverwriteMatrixCol(TQENSingleMatrix& M, LongWord Col, const TQENSingleVector& V, Single Fill) {
-  detail::OverwriteColOf(M, Col, V, Fill);
-}
-void OverwriteMatrixCol(TQENInt64Matrix& M, LongWord Col, const TQENInt64Vector& V, Int64 Fill) {
-  detail::OverwriteColOf(M, Col, V, Fill);
-}
-void OverwriteMatrixCol(TQENLWordMatrix& M, LongWord Col, const TQENLWordVector& V, LongWord Fill) {
-  detail::OverwriteColOf(M, Col, V, Fill);
-}
-void OverwriteMatrixCol(TQENLIntMatrix& M, LongWord Col, const TQENLIntVector& V, LongInt Fill) {
-  detail::OverwriteColOf(M, Col, V, Fill);
-}
-void OverwriteMatrixCol(TQENWordMatrix& M, LongWord Col, const TQENWordVector& V, Word Fill) {
-  detail::OverwriteColOf(M, Col, V, Fill);
-}
-void OverwriteMatrixCol(TQENSmallIntMatrix& M, LongWord Col, const TQENSmallIntVector& V,
-                        SmallInt Fill) {
-  detail::OverwriteColOf(M, Col, V, Fill);
-}
-void OverwriteMatrixCol(TQENByteMatrix& M, LongWord Col, const TQENByteVector& V, Byte Fill) {
-  detail::OverwriteColOf(M, Col, V, Fill);
-}
-void OverwriteMatrixCol(TQENSIntMatrix& M, LongWord Col, const TQENSIntVector& V, ShortInt Fill) {
+template <detail::AnyElement T>
+void OverwriteMatrixCol(detail::MatrixOf<T>& M, LongWord Col, const std::vector<T>& V,
+                        detail::ValueOf<T> Fill) {
   detail::OverwriteColOf(M, Col, V, Fill);
 }
 
 // --- Copy, transpose, product ---
-TQENFloatMatrix CopyMatrix(const TQENFloatMatrix& M) { return detail::CopyMatrixOf(M); }
-TQENDoubleMatrix CopyMatrix(const TQENDoubleMatrix& M) { return detail::CopyMatrixOf(M); }
-TQENSingleMatrix CopyMatrix(const TQENSingleMatrix& M) { return detail::CopyMatrixOf(M); }
-TQENInt64Matrix CopyMatrix(const TQENInt64Matrix& M) { return detail::CopyMatrixOf(M); }
-TQENLWordMatrix CopyMatrix(const TQENLWordMatrix& M) { return detail::CopyMatrixOf(M); }
-TQENLIntMatrix CopyMatrix(const TQENLIntMatrix& M) { return detail::CopyMatrixOf(M); }
-TQENWordMatrix CopyMatrix(const TQENWordMatrix& M) { return detail::CopyMatrixOf(M); }
-TQENSmallIntMatrix CopyMatrix(const TQENSmallIntMatrix& M) { return detail::CopyMatrixOf(M); }
-TQENByteMatrix CopyMatrix(const TQENByteMatrix& M) { return detail::CopyMatrixOf(M); }
-TQENSIntMatrix CopyMatrix(const TQENSIntMatrix& M) { return detail::CopyMatrixOf(M); }
-TQENFloatMatrix TransposeMatrix(const TQENFloatMatrix& M) { return detail::TransposeOf(M); }
-TQENDoubleMatrix TransposeMatrix(const TQENDoubleMatrix& M) { return detail::TransposeOf(M); }
-TQENSingleMatrix TransposeMatrix(const TQENSingleMatrix& M) { return detail::TransposeOf(M); }
-TQENInt64Matrix TransposeMatrix(const TQENInt64Matrix& M) { return detail::TransposeOf(M); }
-TQENLWordMatrix TransposeMatrix(const TQENLWordMatrix& M) { return detail::TransposeOf(M); }
-TQENLIntMatrix TransposeMatrix(const TQENLIntMatrix& M) { return detail::TransposeOf(M); }
-TQENWordMatrix TransposeMatrix(const TQENWordMatrix& M) { return detail::TransposeOf(M); }
-TQENSmallIntMatrix TransposeMatrix(const TQENSmallIntMatrix& M) { return detail::TransposeOf(M); }
-TQENByteMatrix TransposeMatrix(const TQENByteMatrix& M) { return detail::TransposeOf(M); }
-TQENSIntMatrix TransposeMatrix(const TQENSIntMatrix& M) { return detail::TransposeOf(M); }
-TQENFloatMatrix MultiplyMatrices(const TQENFloatMatrix& M1, const TQENFloatMatrix& M2) {
-  return MultiplyOf(M1, M2);
+template <detail::AnyElement T>
+detail::MatrixOf<T> CopyMatrix(const detail::MatrixOf<T>& M) {
+  return detail::CopyMatrixOf(M);
 }
-TQENDoubleMatrix MultiplyMatrices(const TQENDoubleMatrix& M1, const TQENDoubleMatrix& M2) {
-  return MultiplyOf(M1, M2);
+template <detail::AnyElement T>
+detail::MatrixOf<T> TransposeMatrix(const detail::MatrixOf<T>& M) {
+  return detail::TransposeOf(M);
 }
-TQENSingleMatrix MultiplyMatrices(const TQENSingleMatrix& M1, const TQENSingleMatrix& M2) {
+template <detail::FloatElement T>
+detail::MatrixOf<T> MultiplyMatrices(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
   return MultiplyOf(M1, M2);
 }
 
 // --- Sums ---
-Extended SumMatrixRow(const TQENFloatMatrix& M, LongWord Row) { return SumRowOf(M, Row); }
-Extended SumMatrixRow(const TQENDoubleMatrix& M, LongWord Row) { return SumRowOf(M, Row); }
-Extended SumMatrixRow(const TQENSingleMatrix& M, LongWord Row) { return SumRowOf(M, Row); }
-Int64 SumMatrixRow(const TQENInt64Matrix& M, LongWord Row) { return SumRowOf(M, Row); }
-Int64 SumMatrixRow(const TQENLWordMatrix& M, LongWord Row) { return SumRowOf(M, Row); }
-Int64 SumMatrixRow(const TQENSmallIntMatrix& M, LongWord Row) { return SumRowOf(M, Row); }
-Int64 SumMatrixRow(const TQENWordMatrix& M, LongWord Row) { return SumRowOf(M, Row); }
-Int64 SumMatrixRow(const TQENSIntMatrix& M, LongWord Row) { return SumRowOf(M, Row); }
-Int64 SumMatrixRow(const TQENByteMatrix& M, LongWord Row) { return SumRowOf(M, Row); }
-Extended SumMatrixCol(const TQENFloatMatrix& M, LongWord Col) { return SumColOf(M, Col); }
-Extended SumMatrixCol(const TQENDoubleMatrix& M, LongWord Col) { return SumColOf(M, Col); }
-Extended SumMatrixCol(const TQENSingleMatrix& M, LongWord Col) { return SumColOf(M, Col); }
-Int64 SumMatrixCol(const TQENInt64Matrix& M, LongWord Col) { return SumColOf(M, Col); }
-Int64 SumMatrixCol(const TQENLWordMatrix& M, LongWord Col) { return SumColOf(M, Col); }
-Int64 SumMatrixCol(const TQENSmallIntMatrix& M, LongWord Col) { return SumColOf(M, Col); }
-Int64 SumMatrixCol(const TQENWordMatrix& M, LongWord Col) { return SumColOf(M, Col); }
-Int64 SumMatrixCol(const TQENSIntMatrix& M, LongWord Col) { return SumColOf(M, Col); }
-Int64 SumMatrixCol(const TQENByteMatrix& M, LongWord Col) { return SumColOf(M, Col); }
+template <detail::RowSumElement T>
+detail::SumOf<T> SumMatrixRow(const detail::MatrixOf<T>& M, LongWord Row) {
+  return SumRowOf(M, Row);
+}
+template <detail::RowSumElement T>
+detail::SumOf<T> SumMatrixCol(const detail::MatrixOf<T>& M, LongWord Col) {
+  return SumColOf(M, Col);
+}
+
+using detail::MatrixOf;
+using detail::ScalarOf;
+using detail::SumOf;
+using detail::ValueOf;
+
+#define TOVRIN_INSTANTIATE(T)                                                                  \
+  template void SwapMatrixRows(MatrixOf<T>&, LongWord, LongWord);                              \
+  template void SwapMatrixCols(MatrixOf<T>&, LongWord, LongWord);                              \
+  template void QSortMatrixRowsOnCol(MatrixOf<T>&, LongWord, bool);                            \
+  template void QSortMatrixColsOnRow(MatrixOf<T>&, LongWord, bool);                            \
+  template std::vector<T> ExtractMatrixRow(const MatrixOf<T>&, LongWord);                      \
+  template std::vector<T> ExtractMatrixCol(const MatrixOf<T>&, LongWord);                      \
+  template void OverwriteMatrixRow(MatrixOf<T>&, LongWord, const std::vector<T>&, ValueOf<T>); \
+  template void OverwriteMatrixCol(MatrixOf<T>&, LongWord, const std::vector<T>&, ValueOf<T>); \
+  template MatrixOf<T> CopyMatrix(const MatrixOf<T>&);                                         \
+  template MatrixOf<T> TransposeMatrix(const MatrixOf<T>&);
+TOVRIN_ALL_ELEMENTS(TOVRIN_INSTANTIATE)
+#undef TOVRIN_INSTANTIATE
+
+#define TOVRIN_INSTANTIATE(T)                                                 \
+  template void ScaleMatrixRow(MatrixOf<T>&, LongWord, ScalarOf<T>);          \
+  template void ScaleMatrixCol(MatrixOf<T>&, LongWord, ScalarOf<T>);          \
+  template void AddMatrixRows(MatrixOf<T>&, LongWord, LongWord, ScalarOf<T>); \
+  template void AddMatrixCols(MatrixOf<T>&, LongWord, LongWord, ScalarOf<T>);
+TOVRIN_ARITHMETIC_ELEMENTS(TOVRIN_INSTANTIATE)
+#undef TOVRIN_INSTANTIATE
+
+#define TOVRIN_INSTANTIATE(T) \
+  template MatrixOf<T> MultiplyMatrices(const MatrixOf<T>&, const MatrixOf<T>&);
+TOVRIN_FLOAT_ELEMENTS(TOVRIN_INSTANTIATE)
+#undef TOVRIN_INSTANTIATE
+
+#define TOVRIN_INSTANTIATE(T)                                   \
+  template SumOf<T> SumMatrixRow(const MatrixOf<T>&, LongWord); \
+  template SumOf<T> SumMatrixCol(const MatrixOf<T>&, LongWord);
+TOVRIN_ROW_SUM_ELEMENTS(TOVRIN_INSTANTIATE)
+#undef TOVRIN_INSTANTIATE
 
 }  // namespace tovrin

@@ -3,7 +3,6 @@
 
 #include <cmath>
 #include <cstddef>
-#include <type_traits>
 #include <vector>
 
 #include "tovrin/detail/ElementRules.h"
@@ -34,22 +33,12 @@ Extended MeanOf(const std::vector<T>& X) {
   return static_cast<Extended>(SumVector(X)) / Count(X);
 }
 
-// The centre handed to SumSqDiffVector: Double and Single samples get the mean rounded to
-// their own type, the others the Extended mean.
-template <typename T>
-auto CentreFor(Extended Mean) {
-  if constexpr (std::is_same_v<T, Double> || std::is_same_v<T, Single>) {
-    return static_cast<T>(Mean);
-  } else {
-    return Mean;
-  }
-}
-
 template <typename T>
 Extended TwoPassVariance(const std::vector<T>& X, bool Sample) {
   CheckNotEmpty(X);
   if (Sample && X.size() == 1) RaiseMathError(rsVectorG1);
-  const Extended sum_sq = static_cast<Extended>(SumSqDiffVector(X, CentreFor<T>(MeanOf(X))));
+  const Extended sum_sq =
+      static_cast<Extended>(SumSqDiffVector(X, detail::ElementRules<T>::MeanCentre(MeanOf(X))));
   return sum_sq / (Sample ? Count(X) - 1 : Count(X));
 }
 
@@ -66,31 +55,25 @@ VarianceAndMean OnePassVariance(const std::vector<T>& X, bool Sample) {
   if (Sample && X.size() == 1) RaiseMathError(rsVectorG1);
   const Extended n = Count(X);
   const Extended d = Sample ? n - 1 : n;
-  if constexpr (std::is_same_v<T, Int64>) {
+  using Rules = detail::ElementRules<T>;
+  if constexpr (Rules::kWrappingMoments) {
     // Integer running sums that wrap, and S1^2 wrapping too before it meets Extended.
     Int64 s1 = 0;
     Int64 s2 = 0;
-    for (const Int64 x : X) {
-      s1 = detail::WrappingAdd64(s1, x);
-      s2 = detail::WrappingAdd64(s2, detail::WrappingMul64(x, x));
+    for (const T x : X) {
+      s1 = Rules::SumAdd(s1, x);
+      s2 = Rules::SumAdd(s2, Rules::SquareTerm(x));
     }
-    const Extended s1_sq = static_cast<Extended>(detail::WrappingMul64(s1, s1));
+    const Extended s1_sq = static_cast<Extended>(Rules::SquareTerm(s1));
     return {(static_cast<Extended>(s2) - s1_sq / n) / d, static_cast<Extended>(s1) / n};
   } else {
+    // Each square formed by the element's rule (the low 32 bits for LongWord and LongInt).
     Extended s1 = 0;
     Extended s2 = 0;
     for (const T& element : X) {
-      if constexpr (std::is_same_v<T, LongWord>) {
-        s1 += static_cast<Extended>(element);
-        s2 += static_cast<Extended>(static_cast<LongWord>(element * element));  // low 32 bits
-      } else if constexpr (std::is_same_v<T, LongInt>) {
-        s1 += static_cast<Extended>(element);
-        s2 += static_cast<Extended>(detail::WrappingSquare32(element));  // low 32 bits, signed
-      } else {
-        const Extended x = static_cast<ValueOf<T>>(element);
-        s1 += x;
-        s2 += x * x;
-      }
+      const ValueOf<T> x = element;
+      s1 += static_cast<Extended>(x);
+      s2 += static_cast<Extended>(Rules::SquareTerm(x));
     }
     return {(s2 - s1 * s1 / n) / d, s1 / n};
   }
@@ -119,18 +102,9 @@ Extended MedianOf(const std::vector<T>& X) {
   if (n % 2 == 1) return static_cast<ValueOf<T>>(X[n / 2]);
   const T a = X[n / 2 - 1];
   const T b = X[n / 2];
-  if constexpr (std::is_same_v<T, LongInt>) {
-    const auto sum = static_cast<LongInt>(static_cast<LongWord>(a) + static_cast<LongWord>(b));
-    return static_cast<Extended>(sum) / 2;
-  } else if constexpr (std::is_same_v<T, LongWord>) {
-    return static_cast<Extended>(static_cast<LongWord>(a + b)) / 2;
-  } else if constexpr (std::is_same_v<T, Int64>) {
-    return static_cast<Extended>(detail::WrappingAdd64(a, b)) / 2;
-  } else {
-    return (static_cast<Extended>(static_cast<ValueOf<T>>(a)) +
-            static_cast<Extended>(static_cast<ValueOf<T>>(b))) /
-           2;
-  }
+  // Integer neighbours are summed in their own width, wrapping, before they are halved.
+  return detail::ElementRules<T>::PairSum(static_cast<ValueOf<T>>(a), static_cast<ValueOf<T>>(b)) /
+         2;
 }
 
 // The value at one-based position P of the ascending X (n >= 1), P already rounded to single
@@ -273,159 +247,63 @@ Extended GeometricStdDevOf(const TQENFloatVector& X, Extended GeoMean, bool Samp
 
 // --- Public overloads ---------------------------------------------------------------------
 
-Extended QENMean(const TQENFloatVector& X) { return MeanOf(X); }
-Extended QENMean(const TQENDoubleVector& X) { return MeanOf(X); }
-Extended QENMean(const TQENSingleVector& X) { return MeanOf(X); }
-Extended QENMean(const TQENInt64Vector& X) { return MeanOf(X); }
-Extended QENMean(const TQENLWordVector& X) { return MeanOf(X); }
-Extended QENMean(const TQENLIntVector& X) { return MeanOf(X); }
-
-Extended SampleVariance(const TQENFloatVector& X) { return TwoPassVariance(X, true); }
-Extended SampleVariance(const TQENDoubleVector& X) { return TwoPassVariance(X, true); }
-Extended SampleVariance(const TQENSingleVector& X) { return TwoPassVariance(X, true); }
-Extended SampleVariance(const TQENInt64Vector& X) { return TwoPassVariance(X, true); }
-Extended SampleVariance(const TQENLWordVector& X) { return TwoPassVariance(X, true); }
-Extended SampleVariance(const TQENLIntVector& X) { return TwoPassVariance(X, true); }
-
-Extended PopulationVariance(const TQENFloatVector& X) { return TwoPassVariance(X, false); }
-Extended PopulationVariance(const TQENDoubleVector& X) { return TwoPassVariance(X, false); }
-Extended PopulationVariance(const TQENSingleVector& X) { return TwoPassVariance(X, false); }
-Extended PopulationVariance(const TQENInt64Vector& X) { return TwoPassVariance(X, false); }
-Extended PopulationVariance(const TQENLWordVector& X) { return TwoPassVariance(X, false); }
-Extended PopulationVariance(const TQENLIntVector& X) { return TwoPassVariance(X, false); }
-
-Extended SampleStdDev(const TQENFloatVector& X) { return std::sqrt(SampleVariance(X)); }
-Extended SampleStdDev(const TQENDoubleVector& X) { return std::sqrt(SampleVariance(X)); }
-Extended SampleStdDev(const TQENSingleVector& X) { return std::sqrt(SampleVariance(X)); }
-Extended SampleStdDev(const TQENInt64Vector& X) { return std::sqrt(SampleVariance(X)); }
-Extended SampleStdDev(const TQENLWordVector& X) { return std::sqrt(SampleVariance(X)); }
-Extended SampleStdDev(const TQENLIntVector& X) { return std::sqrt(SampleVariance(X)); }
-
-Extended PopulationStdDev(const TQENFloatVector& X) { return std::sqrt(PopulationVariance(X)); }
-Extended PopulationStdDev(const TQENDoubleVector& X) { return std::sqrt(PopulationVariance(X)); }
-Extended PopulationStdDev(const TQENSingleVector& X) { return std::sqrt(PopulationVariance(X)); }
-Extended PopulationStdDev(const TQENInt64Vector& X) { return std::sqrt(PopulationVariance(X)); }
-Extended PopulationStdDev(const TQENLWordVector& X) { return std::sqrt(PopulationVariance(X)); }
-Extended PopulationStdDev(const TQENLIntVector& X) { return std::sqrt(PopulationVariance(X)); }
-
-void SampleVarianceAndMean(const TQENFloatVector& X, Extended& Variance, Extended& Mean) {
-  VarianceAndMeanInto(X, true, Variance, Mean);
+template <detail::BuildableElement T>
+Extended QENMean(const std::vector<T>& X) {
+  return MeanOf(X);
 }
-void SampleVarianceAndMean(const TQENDoubleVector& X, Extended& Variance, Extended& Mean) {
-  VarianceAndMeanInto(X, true, Variance, Mean);
+
+template <detail::BuildableElement T>
+Extended SampleVariance(const std::vector<T>& X) {
+  return TwoPassVariance(X, true);
 }
-void SampleVarianceAndMean(const TQENSingleVector& X, Extended& Variance, Extended& Mean) {
-  VarianceAndMeanInto(X, true, Variance, Mean);
+
+template <detail::BuildableElement T>
+Extended PopulationVariance(const std::vector<T>& X) {
+  return TwoPassVariance(X, false);
 }
-void SampleVarianceAndMean(const TQENInt64Vector& X, Extended& Variance, Extended& Mean) {
-  VarianceAndMeanInto(X, true, Variance, Mean);
+
+template <detail::BuildableElement T>
+Extended SampleStdDev(const std::vector<T>& X) {
+  return std::sqrt(SampleVariance(X));
 }
-void SampleVarianceAndMean(const TQENLWordVector& X, Extended& Variance, Extended& Mean) {
-  VarianceAndMeanInto(X, true, Variance, Mean);
+
+template <detail::BuildableElement T>
+Extended PopulationStdDev(const std::vector<T>& X) {
+  return std::sqrt(PopulationVariance(X));
 }
-void SampleVarianceAndMean(const TQENLIntVector& X, Extended& Variance, Extended& Mean) {
+
+template <detail::BuildableElement T>
+void SampleVarianceAndMean(const std::vector<T>& X, Extended& Variance, Extended& Mean) {
   VarianceAndMeanInto(X, true, Variance, Mean);
 }
 
-void PopulationVarianceAndMean(const TQENFloatVector& X, Extended& Variance, Extended& Mean) {
-  VarianceAndMeanInto(X, false, Variance, Mean);
-}
-void PopulationVarianceAndMean(const TQENDoubleVector& X, Extended& Variance, Extended& Mean) {
-  VarianceAndMeanInto(X, false, Variance, Mean);
-}
-void PopulationVarianceAndMean(const TQENSingleVector& X, Extended& Variance, Extended& Mean) {
-  VarianceAndMeanInto(X, false, Variance, Mean);
-}
-void PopulationVarianceAndMean(const TQENInt64Vector& X, Extended& Variance, Extended& Mean) {
-  VarianceAndMeanInto(X, false, Variance, Mean);
-}
-void PopulationVarianceAndMean(const TQENLWordVector& X, Extended& Variance, Extended& Mean) {
-  VarianceAndMeanInto(X, false, Variance, Mean);
-}
-void PopulationVarianceAndMean(const TQENLIntVector& X, Extended& Variance, Extended& Mean) {
+template <detail::BuildableElement T>
+void PopulationVarianceAndMean(const std::vector<T>& X, Extended& Variance, Extended& Mean) {
   VarianceAndMeanInto(X, false, Variance, Mean);
 }
 
-void SampleStdDevAndMean(const TQENFloatVector& X, Extended& StdDev, Extended& Mean) {
-  StdDevAndMeanInto(X, true, StdDev, Mean);
-}
-void SampleStdDevAndMean(const TQENDoubleVector& X, Extended& StdDev, Extended& Mean) {
-  StdDevAndMeanInto(X, true, StdDev, Mean);
-}
-void SampleStdDevAndMean(const TQENSingleVector& X, Extended& StdDev, Extended& Mean) {
-  StdDevAndMeanInto(X, true, StdDev, Mean);
-}
-void SampleStdDevAndMean(const TQENInt64Vector& X, Extended& StdDev, Extended& Mean) {
-  StdDevAndMeanInto(X, true, StdDev, Mean);
-}
-void SampleStdDevAndMean(const TQENLWordVector& X, Extended& StdDev, Extended& Mean) {
-  StdDevAndMeanInto(X, true, StdDev, Mean);
-}
-void SampleStdDevAndMean(const TQENLIntVector& X, Extended& StdDev, Extended& Mean) {
+template <detail::BuildableElement T>
+void SampleStdDevAndMean(const std::vector<T>& X, Extended& StdDev, Extended& Mean) {
   StdDevAndMeanInto(X, true, StdDev, Mean);
 }
 
-void PopulationStdDevAndMean(const TQENFloatVector& X, Extended& StdDev, Extended& Mean) {
-  StdDevAndMeanInto(X, false, StdDev, Mean);
-}
-void PopulationStdDevAndMean(const TQENDoubleVector& X, Extended& StdDev, Extended& Mean) {
-  StdDevAndMeanInto(X, false, StdDev, Mean);
-}
-void PopulationStdDevAndMean(const TQENSingleVector& X, Extended& StdDev, Extended& Mean) {
-  StdDevAndMeanInto(X, false, StdDev, Mean);
-}
-void PopulationStdDevAndMean(const TQENInt64Vector& X, Extended& StdDev, Extended& Mean) {
-  StdDevAndMeanInto(X, false, StdDev, Mean);
-}
-void PopulationStdDevAndMean(const TQENLWordVector& X, Extended& StdDev, Extended& Mean) {
-  StdDevAndMeanInto(X, false, StdDev, Mean);
-}
-void PopulationStdDevAndMean(const TQENLIntVector& X, Extended& StdDev, Extended& Mean) {
+template <detail::BuildableElement T>
+void PopulationStdDevAndMean(const std::vector<T>& X, Extended& StdDev, Extended& Mean) {
   StdDevAndMeanInto(X, false, StdDev, Mean);
 }
 
-Extended GetMedian(const TQENFloatVector& X) { return MedianOf(X); }
-Extended GetMedian(const TQENDoubleVector& X) { return MedianOf(X); }
-Extended GetMedian(const TQENSingleVector& X) { return MedianOf(X); }
-Extended GetMedian(const TQENInt64Vector& X) { return MedianOf(X); }
-Extended GetMedian(const TQENLWordVector& X) { return MedianOf(X); }
-Extended GetMedian(const TQENLIntVector& X) { return MedianOf(X); }
+template <detail::BuildableElement T>
+Extended GetMedian(const std::vector<T>& X) {
+  return MedianOf(X);
+}
 
-Extended TrimmedMean(const TQENFloatVector& X, Extended Alpha) {
-  return TrimmedMeanOf(X, Alpha, false);
-}
-Extended TrimmedMean(const TQENDoubleVector& X, Extended Alpha) {
-  return TrimmedMeanOf(X, Alpha, false);
-}
-Extended TrimmedMean(const TQENSingleVector& X, Extended Alpha) {
-  return TrimmedMeanOf(X, Alpha, false);
-}
-Extended TrimmedMean(const TQENInt64Vector& X, Extended Alpha) {
-  return TrimmedMeanOf(X, Alpha, false);
-}
-Extended TrimmedMean(const TQENLWordVector& X, Extended Alpha) {
-  return TrimmedMeanOf(X, Alpha, false);
-}
-Extended TrimmedMean(const TQENLIntVector& X, Extended Alpha) {
+template <detail::BuildableElement T>
+Extended TrimmedMean(const std::vector<T>& X, Extended Alpha) {
   return TrimmedMeanOf(X, Alpha, false);
 }
 
-Extended ExcelTrimmedMean(const TQENFloatVector& X, Extended Alpha) {
-  return TrimmedMeanOf(X, Alpha, true);
-}
-Extended ExcelTrimmedMean(const TQENDoubleVector& X, Extended Alpha) {
-  return TrimmedMeanOf(X, Alpha, true);
-}
-Extended ExcelTrimmedMean(const TQENSingleVector& X, Extended Alpha) {
-  return TrimmedMeanOf(X, Alpha, true);
-}
-Extended ExcelTrimmedMean(const TQENInt64Vector& X, Extended Alpha) {
-  return TrimmedMeanOf(X, Alpha, true);
-}
-Extended ExcelTrimmedMean(const TQENLWordVector& X, Extended Alpha) {
-  return TrimmedMeanOf(X, Alpha, true);
-}
-Extended ExcelTrimmedMean(const TQENLIntVector& X, Extended Alpha) {
+template <detail::BuildableElement T>
+Extended ExcelTrimmedMean(const std::vector<T>& X, Extended Alpha) {
   return TrimmedMeanOf(X, Alpha, true);
 }
 
@@ -608,5 +486,23 @@ Extended HeronianMean(Extended A, Extended B) {
   if (FloatIsNegative(A) || FloatIsNegative(B)) RaiseMathError(rsValueGEZero);
   return (A + std::sqrt(A * B) + B) / 3;
 }
+
+using detail::ValueOf;
+
+#define TOVRIN_INSTANTIATE(T)                                                           \
+  template Extended QENMean(const std::vector<T>&);                                     \
+  template Extended SampleVariance(const std::vector<T>&);                              \
+  template Extended PopulationVariance(const std::vector<T>&);                          \
+  template Extended SampleStdDev(const std::vector<T>&);                                \
+  template Extended PopulationStdDev(const std::vector<T>&);                            \
+  template void SampleVarianceAndMean(const std::vector<T>&, Extended&, Extended&);     \
+  template void PopulationVarianceAndMean(const std::vector<T>&, Extended&, Extended&); \
+  template void SampleStdDevAndMean(const std::vector<T>&, Extended&, Extended&);       \
+  template void PopulationStdDevAndMean(const std::vector<T>&, Extended&, Extended&);   \
+  template Extended GetMedian(const std::vector<T>&);                                   \
+  template Extended TrimmedMean(const std::vector<T>&, Extended);                       \
+  template Extended ExcelTrimmedMean(const std::vector<T>&, Extended);
+TOVRIN_BUILDABLE_ELEMENTS(TOVRIN_INSTANTIATE)
+#undef TOVRIN_INSTANTIATE
 
 }  // namespace tovrin

@@ -9,7 +9,9 @@
 #pragma once
 
 #include <array>
+#include <vector>
 
+#include "tovrin/foundation/TOVRINElementTypes.h"
 #include "tovrin/foundation/TOVRINFoundation.h"
 
 namespace tovrin {
@@ -17,45 +19,25 @@ namespace tovrin {
 // --- Mean ----------------------------------------------------------------------------------
 // SumVector(X) / n. Integer sums are the wrapping Int64 sums of SumVector.
 // Raises rsVectorIsEmpty for an empty X.
-Extended QENMean(const TQENFloatVector& X);
-Extended QENMean(const TQENDoubleVector& X);
-Extended QENMean(const TQENSingleVector& X);
-Extended QENMean(const TQENInt64Vector& X);
-Extended QENMean(const TQENLWordVector& X);
-Extended QENMean(const TQENLIntVector& X);
+template <detail::BuildableElement T>
+Extended QENMean(const std::vector<T>& X);
 
 // --- Variance and standard deviation, two passes --------------------------------------------
 // SumSqDiffVector(X, mean) / (n - 1) for the sample, / n for the population. The Double and
 // Single forms hand the mean over rounded to their element type; the integer forms hand it
 // over as Extended. Raise rsVectorIsEmpty for n = 0; the sample forms rsVectorG1 for n = 1
 // (the population variance of one element is 0). The StdDev forms are the square roots.
-Extended SampleVariance(const TQENFloatVector& X);
-Extended SampleVariance(const TQENDoubleVector& X);
-Extended SampleVariance(const TQENSingleVector& X);
-Extended SampleVariance(const TQENInt64Vector& X);
-Extended SampleVariance(const TQENLWordVector& X);
-Extended SampleVariance(const TQENLIntVector& X);
+template <detail::BuildableElement T>
+Extended SampleVariance(const std::vector<T>& X);
 
-Extended PopulationVariance(const TQENFloatVector& X);
-Extended PopulationVariance(const TQENDoubleVector& X);
-Extended PopulationVariance(const TQENSingleVector& X);
-Extended PopulationVariance(const TQENInt64Vector& X);
-Extended PopulationVariance(const TQENLWordVector& X);
-Extended PopulationVariance(const TQENLIntVector& X);
+template <detail::BuildableElement T>
+Extended PopulationVariance(const std::vector<T>& X);
 
-Extended SampleStdDev(const TQENFloatVector& X);
-Extended SampleStdDev(const TQENDoubleVector& X);
-Extended SampleStdDev(const TQENSingleVector& X);
-Extended SampleStdDev(const TQENInt64Vector& X);
-Extended SampleStdDev(const TQENLWordVector& X);
-Extended SampleStdDev(const TQENLIntVector& X);
+template <detail::BuildableElement T>
+Extended SampleStdDev(const std::vector<T>& X);
 
-Extended PopulationStdDev(const TQENFloatVector& X);
-Extended PopulationStdDev(const TQENDoubleVector& X);
-Extended PopulationStdDev(const TQENSingleVector& X);
-Extended PopulationStdDev(const TQENInt64Vector& X);
-Extended PopulationStdDev(const TQENLWordVector& X);
-Extended PopulationStdDev(const TQENLIntVector& X);
+template <detail::BuildableElement T>
+Extended PopulationStdDev(const std::vector<T>& X);
 
 // --- Variance (or standard deviation) and mean, one pass ------------------------------------
 // Running sums S1 = sum x and S2 = sum x^2, then Variance = (S2 - S1^2 / n) / d with d = n - 1
@@ -66,44 +48,24 @@ Extended PopulationStdDev(const TQENLIntVector& X);
 //   LongWord                  S1, S2 in Extended, each square the low 32 bits of x * x, unsigned;
 //   LongInt                   S1, S2 in Extended, each square the low 32 bits of x * x, signed.
 // Raise rsVectorIsEmpty for n = 0; the Sample forms rsVectorG1 for n = 1.
-void SampleVarianceAndMean(const TQENFloatVector& X, Extended& Variance, Extended& Mean);
-void SampleVarianceAndMean(const TQENDoubleVector& X, Extended& Variance, Extended& Mean);
-void SampleVarianceAndMean(const TQENSingleVector& X, Extended& Variance, Extended& Mean);
-void SampleVarianceAndMean(const TQENInt64Vector& X, Extended& Variance, Extended& Mean);
-void SampleVarianceAndMean(const TQENLWordVector& X, Extended& Variance, Extended& Mean);
-void SampleVarianceAndMean(const TQENLIntVector& X, Extended& Variance, Extended& Mean);
+template <detail::BuildableElement T>
+void SampleVarianceAndMean(const std::vector<T>& X, Extended& Variance, Extended& Mean);
 
-void PopulationVarianceAndMean(const TQENFloatVector& X, Extended& Variance, Extended& Mean);
-void PopulationVarianceAndMean(const TQENDoubleVector& X, Extended& Variance, Extended& Mean);
-void PopulationVarianceAndMean(const TQENSingleVector& X, Extended& Variance, Extended& Mean);
-void PopulationVarianceAndMean(const TQENInt64Vector& X, Extended& Variance, Extended& Mean);
-void PopulationVarianceAndMean(const TQENLWordVector& X, Extended& Variance, Extended& Mean);
-void PopulationVarianceAndMean(const TQENLIntVector& X, Extended& Variance, Extended& Mean);
+template <detail::BuildableElement T>
+void PopulationVarianceAndMean(const std::vector<T>& X, Extended& Variance, Extended& Mean);
 
-void SampleStdDevAndMean(const TQENFloatVector& X, Extended& StdDev, Extended& Mean);
-void SampleStdDevAndMean(const TQENDoubleVector& X, Extended& StdDev, Extended& Mean);
-void SampleStdDevAndMean(const TQENSingleVector& X, Extended& StdDev, Extended& Mean);
-void SampleStdDevAndMean(const TQENInt64Vector& X, Extended& StdDev, Extended& Mean);
-void SampleStdDevAndMean(const TQENLWordVector& X, Extended& StdDev, Extended& Mean);
-void SampleStdDevAndMean(const TQENLIntVector& X, Extended& StdDev, Extended& Mean);
+template <detail::BuildableElement T>
+void SampleStdDevAndMean(const std::vector<T>& X, Extended& StdDev, Extended& Mean);
 
-void PopulationStdDevAndMean(const TQENFloatVector& X, Extended& StdDev, Extended& Mean);
-void PopulationStdDevAndMean(const TQENDoubleVector& X, Extended& StdDev, Extended& Mean);
-void PopulationStdDevAndMean(const TQENSingleVector& X, Extended& StdDev, Extended& Mean);
-void PopulationStdDevAndMean(const TQENInt64Vector& X, Extended& StdDev, Extended& Mean);
-void PopulationStdDevAndMean(const TQENLWordVector& X, Extended& StdDev, Extended& Mean);
-void PopulationStdDevAndMean(const TQENLIntVector& X, Extended& StdDev, Extended& Mean);
+template <detail::BuildableElement T>
+void PopulationStdDevAndMean(const std::vector<T>& X, Extended& StdDev, Extended& Mean);
 
 // --- Median --------------------------------------------------------------------------------
 // X sorted ascending. The middle element, or the mean of the two middle ones. The LongInt and
 // LongWord forms add the two middle elements in wrapping 32-bit arithmetic, Int64 in wrapping
 // 64-bit arithmetic, before the sum is halved in Extended. Raises rsVectorIsEmpty.
-Extended GetMedian(const TQENFloatVector& X);
-Extended GetMedian(const TQENDoubleVector& X);
-Extended GetMedian(const TQENSingleVector& X);
-Extended GetMedian(const TQENInt64Vector& X);
-Extended GetMedian(const TQENLWordVector& X);
-Extended GetMedian(const TQENLIntVector& X);
+template <detail::BuildableElement T>
+Extended GetMedian(const std::vector<T>& X);
 
 // --- Trimmed means -------------------------------------------------------------------------
 // X sorted ascending. TrimmedMean drops Trunc(n * Alpha) elements at each end, ExcelTrimmedMean
@@ -111,19 +73,11 @@ Extended GetMedian(const TQENLIntVector& X);
 // QENMean(X); Alpha the same as 0.5 (TrimmedMean) or 1 (ExcelTrimmedMean) returns GetMedian(X);
 // Alpha below 0 or above 0.5 (1), or not a number, raises rsInvalidValue; then an empty X raises
 // rsVectorIsEmpty and one element is returned as it is. Nothing left after trimming gives 0.
-Extended TrimmedMean(const TQENFloatVector& X, Extended Alpha);
-Extended TrimmedMean(const TQENDoubleVector& X, Extended Alpha);
-Extended TrimmedMean(const TQENSingleVector& X, Extended Alpha);
-Extended TrimmedMean(const TQENInt64Vector& X, Extended Alpha);
-Extended TrimmedMean(const TQENLWordVector& X, Extended Alpha);
-Extended TrimmedMean(const TQENLIntVector& X, Extended Alpha);
+template <detail::BuildableElement T>
+Extended TrimmedMean(const std::vector<T>& X, Extended Alpha);
 
-Extended ExcelTrimmedMean(const TQENFloatVector& X, Extended Alpha);
-Extended ExcelTrimmedMean(const TQENDoubleVector& X, Extended Alpha);
-Extended ExcelTrimmedMean(const TQENSingleVector& X, Extended Alpha);
-Extended ExcelTrimmedMean(const TQENInt64Vector& X, Extended Alpha);
-Extended ExcelTrimmedMean(const TQENLWordVector& X, Extended Alpha);
-Extended ExcelTrimmedMean(const TQENLIntVector& X, Extended Alpha);
+template <detail::BuildableElement T>
+Extended ExcelTrimmedMean(const std::vector<T>& X, Extended Alpha);
 
 // --- Mode and most frequent values ---------------------------------------------------------
 // X sorted ascending; runs are neighbours that are SameFloat. GetMode returns true, with Mode

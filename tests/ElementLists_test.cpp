@@ -1,6 +1,6 @@
 // The families exist for exactly the element types of their lists: a call with any other
 // element type does not compile. Checked at compile time, one family per list.
-#include "tovrin/vector/TOVRINVector.h"
+#include "tovrin/tovrin.h"
 
 namespace tovrin {
 namespace {
@@ -39,6 +39,17 @@ static_assert(CanConvertToLInt<TQENWordVector> && !CanConvertToLInt<TQENLWordVec
 // Neither a vector of another element type nor a matrix is an element vector.
 static_assert(CanSort<TQENSIntVector> && !CanSort<std::vector<Int64*>>);
 static_assert(!CanSort<TQENFloatMatrix> && !CanSort<std::vector<long double>>);
+
+template <typename M>
+concept CanInvert = requires(M& m) { MatrixInverse(m, m); };
+template <typename M>
+concept CanSumRow = requires(const M& m) { SumMatrixRow(m, 0); };
+template <typename V>
+concept CanTakeMedian = requires(const V& v) { GetMedian(v); };
+
+static_assert(CanInvert<TQENDoubleMatrix> && !CanInvert<TQENInt64Matrix>);
+static_assert(CanSumRow<TQENLWordMatrix> && !CanSumRow<TQENLIntMatrix>);
+static_assert(CanTakeMedian<TQENLWordVector> && !CanTakeMedian<TQENWordVector>);
 
 }  // namespace
 }  // namespace tovrin
