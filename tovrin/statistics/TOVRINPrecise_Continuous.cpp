@@ -20,12 +20,10 @@ using detail::Tails;
 
 constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
 constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
-constexpr Extended kEpsilon = std::numeric_limits<Extended>::epsilon();
 // 1/sqrt(2) as hi + lo, 1/sqrt(2 pi) and 2/sqrt(pi).
 constexpr Extended kInvSqrt2 = 0.707106781186547524381894036516L;
 constexpr Extended kInvSqrt2Lo = 1.895032558893257079655062e-20L;
 constexpr Extended kInvSqrt2Pi = 0.398942280401432677939946059934381868L;
-constexpr Extended kSqrt2Pi = 2.50662827463100050241576528481104525L;
 constexpr Extended kTwoOverSqrtPi = 1.12837916709551257389615890312154517L;
 
 // --- Checks, as the classic functions make them ---------------------------------------------
