@@ -384,7 +384,14 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
   // gives 0 at once. The power is costly, so w0 (and t ln t, needed by the tail only) are
   // computed on first use. Since Tiny / t <= 1E-304 and p <= 1, w0 <= exp(-699 Shape): a
   // uniform above twice that bound cannot lie under the floor, and w0 is needed only below it.
-  const double floorBound = 2 * std::exp(-699.0 * static_cast<double>(shape));
+  // For Shape >= 0.01 the bound is below 2 e^-6.99 < 2^-9, so it is formed only for a uniform
+  // under 2^-9 (or a smaller shape).
+  double floorBound = -1;  // not formed yet
+  const auto underFloorBound = [&floorBound, shape](Extended u) {
+    if (!(u < 0x1p-9L) && shape >= 0.01L) return false;
+    if (floorBound < 0) floorBound = 2 * std::exp(-699.0 * static_cast<double>(shape));
+    return u <= floorBound;
+  };
   Extended w0 = 0;
   bool haveW0 = false;
   Extended tLnT = 0;
@@ -408,11 +415,12 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
                  0x1p-60L * t * (std::fabs(lnX) + std::fabs(lnT));
       }
     } else {
-      if (u <= floorBound && !haveW0) {
+      const bool underBound = underFloorBound(u);
+      if (underBound && !haveW0) {
         w0 = p * XtoY(kTiny / t, shape);
         haveW0 = true;
       }
-      if (u <= floorBound && u <= w0) return 0;
+      if (underBound && u <= w0) return 0;
       x = t * Power(u / p, 1 / shape);
       w = x;
       wError = 0;
