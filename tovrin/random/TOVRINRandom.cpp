@@ -384,7 +384,14 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
   // gives 0 at once. The power is costly, so w0 (and t ln t, needed by the tail only) are
   // computed on first use. Since Tiny / t <= 1E-304 and p <= 1, w0 <= exp(-699 Shape): a
   // uniform above twice that bound cannot lie under the floor, and w0 is needed only below it.
-  const double floorBound = 2 * std::exp(-699.0 * static_cast<double>(shape));
+  // For Shape >= 0.01 the bound is below 2 e^-6.99 < 2^-9, so it is formed only for a uniform
+  // under 2^-9 (or a smaller shape).
+  double floorBound = -1;  // not formed yet
+  const auto underFloorBound = [&floorBound, shape](Extended u) {
+    if (!(u < 0x1p-9L) && shape >= 0.01L) return false;
+    if (floorBound < 0) floorBound = 2 * std::exp(-699.0 * static_cast<double>(shape));
+    return u <= floorBound;
+  };
   Extended w0 = 0;
   bool haveW0 = false;
   Extended tLnT = 0;
@@ -408,11 +415,12 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
                  0x1p-60L * t * (std::fabs(lnX) + std::fabs(lnT));
       }
     } else {
-      if (u <= floorBound && !haveW0) {
+      const bool underBound = underFloorBound(u);
+      if (underBound && !haveW0) {
         w0 = p * XtoY(kTiny / t, shape);
         haveW0 = true;
       }
-      if (u <= floorBound && u <= w0) return 0;
+      if (underBound && u <= w0) return 0;
       x = t * Power(u / p, 1 / shape);
       w = x;
       wError = 0;
@@ -762,165 +770,182 @@ inline bool BtpeRecursionAccepts(Extended v, Int64 mode, Int64 y, Extended g, Ex
 // same two uniforms. An attempt settled as a redraw is followed by the next one in double.
 enum class FirstAttempt { kAccept, kRedraw, kUnsure };  // of one attempt
 
-inline FirstAttempt BtpeAttemptInDouble(Int64 n, Extended p, Extended q, Extended np, Int64 mode,
-                                        Extended first, Extended second, Int64& y) {
-  constexpr auto kUnsure = FirstAttempt::kUnsure;
-  if (n >= (Int64{1} << 52)) return kUnsure;
-  constexpr double kUnit = 0x1p-53 + 0x1p-64;
-  const double pd = static_cast<double>(p);
-  const double qd = static_cast<double>(q);
-  const double npd = static_cast<double>(np);
-  const double npq = npd * qd;
-  const double spread = 2.195 * std::sqrt(npq) - 4.6 * qd;
-  const double whole = std::floor(spread);
-  if (!(spread - whole > 1e-12 * spread && whole + 1 - spread > 1e-12 * spread)) return kUnsure;
-  const double p1 = whole + 0.5;
-  const double modeD = static_cast<double>(mode);
-  const double fm = npd + pd;
-  const double xm = modeD + 0.5;
-  const double xl = xm - p1;
-  const double xr = xm + p1;
-  const double c = 0.134 + 20.5 / (15.3 + modeD);
-  double a = (fm - xl) / (fm - xl * pd);
-  const double lambdaL = a * (1 + 0.5 * a);
-  a = (xr - fm) / (xr * qd);
-  const double lambdaR = a * (1 + 0.5 * a);
-  const double p2 = p1 * (1 + 2 * c);
-  const double p3 = p2 + c / lambdaL;
-  const double p4 = p3 + c / lambdaR;
-  const double eps = 2 * (6 * fm / (p1 - 0.5) + 40) * kUnit;
-  const double u = static_cast<double>(first) * p4;
-  const double uError = u * (eps + 3 * kUnit);
-  const double v0 = static_cast<double>(second);
-  // Trunc(z) for z within zError of the Extended value, when that settles it (z >= 0).
-  const auto truncate = [](double z, double zError, Int64& whole) {
-    const double low = std::floor(z - zError);
-    if (!(z - zError >= 0) || low != std::floor(z + zError)) return false;
-    whole = static_cast<Int64>(low);
-    return true;
-  };
-
-  if (u + uError < p1) {
-    const double z = xm - p1 * v0 + u;
-    const double zError = uError + 8 * kUnit * (xm + p1 + u + z);
-    return truncate(z, zError, y) ? FirstAttempt::kAccept : kUnsure;
+class BtpeInDouble {
+ public:
+  BtpeInDouble(Int64 n, Extended p, Extended q, Extended np, Int64 mode)
+      : n(n),
+        mode(mode),
+        pd(static_cast<double>(p)),
+        qd(static_cast<double>(q)),
+        npq(static_cast<double>(np) * qd),
+        modeD(static_cast<double>(mode)),
+        xm(modeD + 0.5) {
+    if (n >= (Int64{1} << 52)) return;
+    const double spread = 2.195 * std::sqrt(npq) - 4.6 * qd;
+    const double whole = std::floor(spread);
+    if (!(spread - whole > 1e-12 * spread && whole + 1 - spread > 1e-12 * spread)) return;
+    p1 = whole + 0.5;
+    const double fm = static_cast<double>(np) + pd;
+    xl = xm - p1;
+    xr = xm + p1;
+    c = 0.134 + 20.5 / (15.3 + modeD);
+    double a = (fm - xl) / (fm - xl * pd);
+    lambdaL = a * (1 + 0.5 * a);
+    a = (xr - fm) / (xr * qd);
+    lambdaR = a * (1 + 0.5 * a);
+    p2 = p1 * (1 + 2 * c);
+    p3 = p2 + c / lambdaL;
+    p4 = p3 + c / lambdaR;
+    eps = 2 * (6 * fm / (p1 - 0.5) + 40) * kUnit;
+    valid = true;
   }
-  if (!(u - uError > p1)) return kUnsure;
-  double v;       // the v of the final test
-  double vError;  // and its bound
-  if (u + uError < p2 - p2 * eps) {
-    const double offset = (u - p1) / c;
-    const double offsetError = (uError + (u - p1) * kUnit) / c + offset * (eps + kUnit);
-    const double x = xl + offset;
-    const double xError = offsetError + 2 * kUnit * (std::fabs(xl) + std::fabs(x));
-    const double distance = std::fabs(xm - x) / p1;
-    v = v0 * c + 1 - distance;
-    vError = v0 * c * (eps + 3 * kUnit) + (xError + 2 * kUnit * std::fabs(xm - x)) / p1 +
-             4 * kUnit * (v0 * c + 1 + distance);
-    if (v - vError > 1 || v + vError <= 0) return FirstAttempt::kRedraw;
-    if (!(v + vError <= 1 && v - vError > 0)) return kUnsure;
-    if (!truncate(x, xError, y)) return kUnsure;
-  } else {
-    BoundedLog logV;
-    if (!DoubleLog(second, logV)) return kUnsure;
-    if (u - uError > p2 + p2 * eps && u + uError < p3 - p3 * eps) {
-      const double step = logV.value / lambdaL;
-      const double x = xl + step;
-      const double xError = logV.bound / lambdaL + std::fabs(step) * (eps + 2 * kUnit) +
-                            2 * kUnit * (std::fabs(xl) + std::fabs(x));
-      if (x + xError <= -1) return FirstAttempt::kRedraw;  // Trunc(x) < 0
+
+  FirstAttempt Attempt(Extended first, Extended second, Int64& y) const {
+    constexpr auto kUnsure = FirstAttempt::kUnsure;
+    if (!valid) return kUnsure;
+    const double u = static_cast<double>(first) * p4;
+    const double uError = u * (eps + 3 * kUnit);
+    const double v0 = static_cast<double>(second);
+    // Trunc(z) for z within zError of the Extended value, when that settles it (0 <= z < 2^62).
+    const auto truncate = [](double z, double zError, Int64& whole) {
+      const double low = std::floor(z - zError);
+      if (!(z - zError >= 0 && z + zError < 0x1p62) || low != std::floor(z + zError)) {
+        return false;
+      }
+      whole = static_cast<Int64>(low);
+      return true;
+    };
+
+    if (u + uError < p1) {
+      const double z = xm - p1 * v0 + u;
+      const double zError = uError + 8 * kUnit * (xm + p1 + u + z);
+      return truncate(z, zError, y) ? FirstAttempt::kAccept : kUnsure;
+    }
+    if (!(u - uError > p1)) return kUnsure;
+    double v;       // the v of the final test
+    double vError;  // and its bound
+    if (u + uError < p2 - p2 * eps) {
+      const double offset = (u - p1) / c;
+      const double offsetError = (uError + (u - p1) * kUnit) / c + offset * (eps + kUnit);
+      const double x = xl + offset;
+      const double xError = offsetError + 2 * kUnit * (std::fabs(xl) + std::fabs(x));
+      const double distance = std::fabs(xm - x) / p1;
+      v = v0 * c + 1 - distance;
+      vError = v0 * c * (eps + 3 * kUnit) + (xError + 2 * kUnit * std::fabs(xm - x)) / p1 +
+               4 * kUnit * (v0 * c + 1 + distance);
+      if (v - vError > 1 || v + vError <= 0) return FirstAttempt::kRedraw;
+      if (!(v + vError <= 1 && v - vError > 0)) return kUnsure;
       if (!truncate(x, xError, y)) return kUnsure;
-      const double width = u - p2;
-      v = v0 * width * lambdaL;
-      vError =
-          v0 * (uError + p2 * eps + width * kUnit) * lambdaL + std::fabs(v) * (eps + 4 * kUnit);
-    } else if (u - uError > p3 + p3 * eps) {
-      const double step = logV.value / lambdaR;
-      const double x = xr - step;
-      const double xError = logV.bound / lambdaR + std::fabs(step) * (eps + 2 * kUnit) +
-                            2 * kUnit * (std::fabs(xr) + std::fabs(x));
-      if (!truncate(x, xError, y)) return kUnsure;
-      if (y > n) return FirstAttempt::kRedraw;
-      const double width = u - p3;
-      v = v0 * width * lambdaR;
-      vError =
-          v0 * (uError + p3 * eps + width * kUnit) * lambdaR + std::fabs(v) * (eps + 4 * kUnit);
     } else {
+      BoundedLog logV;
+      if (!DoubleLog(second, logV)) return kUnsure;
+      if (u - uError > p2 + p2 * eps && u + uError < p3 - p3 * eps) {
+        const double step = logV.value / lambdaL;
+        const double x = xl + step;
+        const double xError = logV.bound / lambdaL + std::fabs(step) * (eps + 2 * kUnit) +
+                              2 * kUnit * (std::fabs(xl) + std::fabs(x));
+        if (x + xError <= -1) return FirstAttempt::kRedraw;  // Trunc(x) < 0
+        if (!truncate(x, xError, y)) return kUnsure;
+        const double width = u - p2;
+        v = v0 * width * lambdaL;
+        vError =
+            v0 * (uError + p2 * eps + width * kUnit) * lambdaL + std::fabs(v) * (eps + 4 * kUnit);
+      } else if (u - uError > p3 + p3 * eps) {
+        const double step = logV.value / lambdaR;
+        const double x = xr - step;
+        const double xError = logV.bound / lambdaR + std::fabs(step) * (eps + 2 * kUnit) +
+                              2 * kUnit * (std::fabs(xr) + std::fabs(x));
+        if (!truncate(x, xError, y)) return kUnsure;
+        if (y > n) return FirstAttempt::kRedraw;
+        const double width = u - p3;
+        v = v0 * width * lambdaR;
+        vError =
+            v0 * (uError + p3 * eps + width * kUnit) * lambdaR + std::fabs(v) * (eps + 4 * kUnit);
+      } else {
+        return kUnsure;
+      }
+    }
+
+    // The test: k = |y - M|, by the recursion for k <= 20 or k >= npq/2 - 1, else the squeeze.
+    const Int64 k = y > mode ? y - mode : mode - y;
+    const double kD = static_cast<double>(k);
+    const double threshold = npq / 2 - 1;
+    const double thresholdError = npq * 4 * kUnit;
+    if (k > 20 && std::fabs(kD - threshold) <= thresholdError) return kUnsure;
+    if (k <= 20 || kD > threshold) {
+      // f = prod (g/i - r) over M < i <= y, or its reciprocal over y < i <= M, with g/i - r at
+      // least (g/i + r)/8 (see BtpeRecursionAccepts); g and r formed in double from p and q
+      // have 4 and 3 units of error, the factor and product two more: under 1e-14 a factor.
+      const Int64 from = mode < y ? mode : y;
+      const Int64 to = mode < y ? y : mode;
+      if (k > 1000 || 9 * static_cast<double>(to) > 7 * (static_cast<double>(n) + 1)) {
+        return kUnsure;
+      }
+      const double r = pd / qd;
+      const double g = (static_cast<double>(n) + 1) * r;
+      double product = 1;
+      for (Int64 i = from + 1; i <= to; ++i) product *= g / static_cast<double>(i) - r;
+      const double f = mode < y ? product : 1 / product;
+      if (!(f > 1e-290 && f < 1e290)) return kUnsure;
+      const double fError = 1e-14 * static_cast<double>(k + 2) * f;
+      if (v + vError < f - fError) return FirstAttempt::kAccept;
+      if (v - vError > f + fError) return FirstAttempt::kRedraw;
       return kUnsure;
     }
+    const double rho = (kD / npq) * ((kD * (kD / 3 + 0.625) + 0.1666666666666) / npq + 0.5);
+    const double t = -kD * kD / (2 * npq);
+    const double boundsError = (std::fabs(rho) + std::fabs(t)) * 24 * kUnit;
+    if (!(v - vError > 0)) return kUnsure;
+    BoundedLog logV;
+    if (!DoubleLog(v, logV)) return kUnsure;
+    // ln of the Extended v: within logV's bound of ln of v in double, and vError / (v - vError)
+    // of the first.
+    const double logError = logV.bound + vError / (v - vError) + boundsError;
+    if (logV.value + logError < t - rho) return FirstAttempt::kAccept;
+    if (logV.value - logError > t + rho) return FirstAttempt::kRedraw;
+    // The final comparison, ln v <= xm ln(f1/x1) + (N - M + 1/2) ln(z/w)
+    // + (y - M) ln(w p / (x1 q)) + S(f1) + S(z) + S(x1) + S(w): each logarithm's argument is
+    // formed with at most five roundings, each term and the sum with a few more.
+    const double yD = static_cast<double>(y);
+    const double nD = static_cast<double>(n);
+    const double x1 = yD + 1;
+    const double f1 = modeD + 1;
+    const double z = nD + 1 - modeD;
+    const double w = nD - yD + 1;
+    BoundedLog logA, logB, logC;
+    if (!DoubleLog(f1 / x1, logA) || !DoubleLog(z / w, logB) ||
+        !DoubleLog(w * pd / (x1 * qd), logC)) {
+      return kUnsure;
+    }
+    const double coefficientB = nD - modeD + 0.5;
+    const double coefficientC = yD - modeD;
+    const double termA = xm * logA.value;
+    const double termB = coefficientB * logB.value;
+    const double termC = coefficientC * logC.value;
+    const auto stirling = [](double x) {
+      const double x2 = x * x;
+      return (13860 - (462 - (132 - (99 - 140 / x2) / x2) / x2) / x2) / x / 166320;
+    };
+    const double tails = stirling(f1) + stirling(z) + stirling(x1) + stirling(w);
+    const double right = termA + termB + termC + tails;
+    const double rightError =
+        xm * (logA.bound + 2 * kUnit) + coefficientB * (logB.bound + 2 * kUnit) +
+        std::fabs(coefficientC) * (logC.bound + 6 * kUnit) +
+        12 * kUnit * (std::fabs(termA) + std::fabs(termB) + std::fabs(termC) + std::fabs(tails));
+    const double valueError = vError / (v - vError) + logV.bound;
+    if (logV.value + valueError < right - rightError) return FirstAttempt::kAccept;
+    if (logV.value - valueError > right + rightError) return FirstAttempt::kRedraw;
+    return kUnsure;
   }
 
-  // The test: k = |y - M|, by the recursion for k <= 20 or k >= npq/2 - 1, else the squeeze.
-  const Int64 k = y > mode ? y - mode : mode - y;
-  const double kD = static_cast<double>(k);
-  const double threshold = npq / 2 - 1;
-  const double thresholdError = npq * 4 * kUnit;
-  if (k > 20 && std::fabs(kD - threshold) <= thresholdError) return kUnsure;
-  if (k <= 20 || kD > threshold) {
-    // f = prod (g/i - r) over M < i <= y, or its reciprocal over y < i <= M, with g/i - r at
-    // least (g/i + r)/8 (see BtpeRecursionAccepts); g and r formed in double from p and q
-    // have 4 and 3 units of error, the factor and product two more: under 1e-14 a factor.
-    const Int64 from = mode < y ? mode : y;
-    const Int64 to = mode < y ? y : mode;
-    if (k > 1000 || 9 * static_cast<double>(to) > 7 * (static_cast<double>(n) + 1)) {
-      return kUnsure;
-    }
-    const double r = pd / qd;
-    const double g = (static_cast<double>(n) + 1) * r;
-    double product = 1;
-    for (Int64 i = from + 1; i <= to; ++i) product *= g / static_cast<double>(i) - r;
-    const double f = mode < y ? product : 1 / product;
-    if (!(f > 1e-290 && f < 1e290)) return kUnsure;
-    const double fError = 1e-14 * static_cast<double>(k + 2) * f;
-    if (v + vError < f - fError) return FirstAttempt::kAccept;
-    if (v - vError > f + fError) return FirstAttempt::kRedraw;
-    return kUnsure;
-  }
-  const double rho = (kD / npq) * ((kD * (kD / 3 + 0.625) + 0.1666666666666) / npq + 0.5);
-  const double t = -kD * kD / (2 * npq);
-  const double boundsError = (std::fabs(rho) + std::fabs(t)) * 24 * kUnit;
-  if (!(v - vError > 0)) return kUnsure;
-  BoundedLog logV;
-  if (!DoubleLog(v, logV)) return kUnsure;
-  // ln of the Extended v: within logV's bound of ln of v in double, and vError / (v - vError)
-  // of the first.
-  const double logError = logV.bound + vError / (v - vError) + boundsError;
-  if (logV.value + logError < t - rho) return FirstAttempt::kAccept;
-  if (logV.value - logError > t + rho) return FirstAttempt::kRedraw;
-  // The final comparison, ln v <= xm ln(f1/x1) + (N - M + 1/2) ln(z/w)
-  // + (y - M) ln(w p / (x1 q)) + S(f1) + S(z) + S(x1) + S(w): each logarithm's argument is
-  // formed with at most five roundings, each term and the sum with a few more.
-  const double yD = static_cast<double>(y);
-  const double nD = static_cast<double>(n);
-  const double x1 = yD + 1;
-  const double f1 = modeD + 1;
-  const double z = nD + 1 - modeD;
-  const double w = nD - yD + 1;
-  BoundedLog logA, logB, logC;
-  if (!DoubleLog(f1 / x1, logA) || !DoubleLog(z / w, logB) ||
-      !DoubleLog(w * pd / (x1 * qd), logC)) {
-    return kUnsure;
-  }
-  const double coefficientB = nD - modeD + 0.5;
-  const double coefficientC = yD - modeD;
-  const double termA = xm * logA.value;
-  const double termB = coefficientB * logB.value;
-  const double termC = coefficientC * logC.value;
-  const auto stirling = [](double x) {
-    const double x2 = x * x;
-    return (13860 - (462 - (132 - (99 - 140 / x2) / x2) / x2) / x2) / x / 166320;
-  };
-  const double tails = stirling(f1) + stirling(z) + stirling(x1) + stirling(w);
-  const double right = termA + termB + termC + tails;
-  const double rightError =
-      xm * (logA.bound + 2 * kUnit) + coefficientB * (logB.bound + 2 * kUnit) +
-      std::fabs(coefficientC) * (logC.bound + 6 * kUnit) +
-      12 * kUnit * (std::fabs(termA) + std::fabs(termB) + std::fabs(termC) + std::fabs(tails));
-  const double valueError = vError / (v - vError) + logV.bound;
-  if (logV.value + valueError < right - rightError) return FirstAttempt::kAccept;
-  if (logV.value - valueError > right + rightError) return FirstAttempt::kRedraw;
-  return kUnsure;
-}
+ private:
+  static constexpr double kUnit = 0x1p-53 + 0x1p-64;
+  bool valid = false;
+  Int64 n;
+  Int64 mode;
+  double pd, qd, npq, modeD, xm;
+  double p1 = 0, xl = 0, xr = 0, c = 0, lambdaL = 0, lambdaR = 0, p2 = 0, p3 = 0, p4 = 0, eps = 0;
+};
 
 // Kachitvichyanukul and Schmeiser's BTPE for N p > 30, p <= 0.5.
 template <typename Gen>
@@ -929,6 +954,7 @@ Int64 BinomialBtpe(Int64 n, Extended p, Extended q, Extended np, Gen& gen) {
   const Int64 mode = TruncChecked(fm);
   // Attempts in double while they settle; the first one that does not is taken up by the
   // Extended set-up with the same two uniforms.
+  const BtpeInDouble inDouble(n, p, q, np, mode);
   Extended first;
   Extended second;
   FirstAttempt outcome;
@@ -936,7 +962,7 @@ Int64 BinomialBtpe(Int64 n, Extended p, Extended q, Extended np, Gen& gen) {
     first = gen();
     second = gen();
     Int64 quick = 0;
-    outcome = BtpeAttemptInDouble(n, p, q, np, mode, first, second, quick);
+    outcome = inDouble.Attempt(first, second, quick);
     if (outcome == FirstAttempt::kAccept) return quick;
   } while (outcome == FirstAttempt::kRedraw);
 

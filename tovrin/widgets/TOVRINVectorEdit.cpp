@@ -100,16 +100,20 @@ class VectorEditModel : public GridModel {
   // The values become Work, none null; Order, when given, is the old row of each new row and
   // carries the labels along.
   void Commit(TQENFloatVector Work, const std::vector<std::size_t>& Order = {}) {
+    // Everything is allocated before the views are told, so a failure leaves them consistent.
+    std::vector<bool> null(Work.size(), false);
+    EnsureLabels(Work.size());
+    std::vector<QString> labels;
+    if (!Order.empty()) {
+      labels = labels_;
+      for (std::size_t row = 0; row < Order.size(); ++row) labels[row] = labels_[Order[row]];
+    }
     const bool sameCount = Work.size() == values_.size();
     if (!sameCount) beginResetModel();
     values_ = std::move(Work);
-    null_.assign(values_.size(), false);
+    null_ = std::move(null);
     nullCount_ = 0;
-    EnsureLabels(values_.size());
-    if (!Order.empty()) {
-      std::vector<QString> labels(labels_.begin(), labels_.begin() + std::ssize(Order));
-      for (std::size_t row = 0; row < Order.size(); ++row) labels_[row] = labels[Order[row]];
-    }
+    if (!Order.empty()) labels_ = std::move(labels);
     if (sameCount) {
       AllCellsChanged();
     } else {
