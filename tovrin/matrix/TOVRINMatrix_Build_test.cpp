@@ -379,3 +379,5 @@ TYPED_TEST(MatrixElementWise, FailuresStopWhereTheyAreWithoutRollBack) {
 
 }  // namespace
 }  // namespace tovrin
+
+TEST(ShapeSwitchTest, IsOnAtStartUp) { EXPECT_TRUE(tovrin::QENMatrixRectangularCheck.load()); }
