@@ -1,7 +1,7 @@
 // Gamma, LnGamma, Beta, IncompleteBeta and InverseIncompleteBeta beside Boost.Math at long
 // double, on the argument sets of the reference table that the unit tests use. Before the timed
 // runs the program prints, for each function, the largest relative error of tovrin and of Boost
-// against that table (computed at 256 bits by tovrin/foundation/testdata/gammabeta_reference.py).
+// against that table (computed at 256 bits by tovrin/foundation/TOVRINMath_GammaBeta_reference.py).
 //
 // Boost is only a yardstick here (scripts/setup-bench.sh installs its headers); without it the
 // program times tovrin alone.
@@ -16,12 +16,15 @@
 #include <vector>
 
 #include "tovrin/foundation/TOVRINMath.h"
-#include "tovrin/foundation/testdata/gammabeta_reference.h"
 
 #ifdef TOVRIN_HAVE_BOOST
 #include <boost/math/special_functions/beta.hpp>
 #include <boost/math/special_functions/gamma.hpp>
 #endif
+
+namespace tovrin::testdata {
+#include "tovrin/foundation/TOVRINMath_GammaBeta_reference.inc"
+}  // namespace tovrin::testdata
 
 namespace {
 

@@ -7,6 +7,7 @@ command -v g++ >/dev/null || missing+=(g++)
 command -v pkg-config >/dev/null || missing+=(pkg-config)
 [ -d /usr/include/gtest ] || missing+=(libgtest-dev libgmock-dev)
 [ -d /usr/include/benchmark ] || missing+=(libbenchmark-dev)
+python3 -c 'import mpmath' 2>/dev/null || missing+=(python3 python3-mpmath)
 # Qt 6 Widgets for tovrin::widgets and tovrin-studio (fonts for their offscreen rendering).
 [ -n "$(find /usr/lib -path '*/cmake/Qt6Widgets/Qt6WidgetsConfig.cmake' -print -quit 2>/dev/null)" ] ||
   missing+=(qt6-base-dev)

@@ -548,6 +548,22 @@ expect_err "NormalLess Z"
 run 2 eval NormalLess 1 2
 run 2 eval NormalLess abc
 expect_err "'abc'"
+# The precise family: far tails computed directly, degrees of freedom as real numbers.
+run 0 eval --precise NormalGreater 40
+checks=$((checks + 1))
+grep -qE '^3\.6558935409150297[0-9]*e-350$' "$WORK/out" || fail "precise NormalGreater 40: $(cat "$WORK/out")"
+run 0 eval --precise PoissonEq 1000 1754
+checks=$((checks + 1))
+grep -qE '^2\.564571632953611[0-9]*e-103$' "$WORK/out" || fail "precise PoissonEq: $(cat "$WORK/out")"
+run 0 eval --precise --digits 6 StudentTLess 1e-6 4e9
+expect_out "0.5"
+run 0 eval --precise --list
+checks=$((checks + 1))
+grep -qE '^IncompleteGammaUpper A X +regularised upper' "$WORK/out" || fail "precise --list"
+run 1 eval --precise ChiSquareLess 1 0
+expect_no_out
+run 2 eval --precise ChiSquareBetween 1 2 3
+expect_err "unknown precise function 'ChiSquareBetween'"
 run 2 eval ChiSquareLess 1 -2
 run 2 eval ChiSquareLess 1 2.5
 run 2 eval

@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include "tovrin/testing/TOVRIN_testing.h"
+
 #include <cstdint>
 #include <initializer_list>
 #include <type_traits>
@@ -12,57 +14,24 @@ namespace {
 
 using Ints = std::vector<Int64>;
 using IntRows = std::vector<Ints>;
-
+using testing::ExpectRaises;
 template <typename T>
-T M(Int64 Stored) {
-  return static_cast<T>(static_cast<std::underlying_type_t<T>>(Stored));
-}
-template <typename T>
-std::vector<T> Vec(const Ints& Stored) {
-  std::vector<T> v;
-  for (const Int64 s : Stored) v.push_back(M<T>(s));
-  return v;
+T M(Int64 stored) {
+  return testing::Money<T>(stored);
 }
 template <typename T>
-std::vector<std::vector<T>> Mat(std::initializer_list<Ints> Rows) {
-  std::vector<std::vector<T>> m;
-  for (const Ints& r : Rows) m.push_back(Vec<T>(r));
-  return m;
+std::vector<T> Vec(std::initializer_list<Int64> stored) {
+  return testing::MoneyVec<T>(stored);
 }
 template <typename T>
-Ints StoredOf(const std::vector<T>& V) {
-  Ints out;
-  for (const T x : V) out.push_back(detail::StoredOf(x));
-  return out;
+auto StoredOf(const T& x) {
+  return testing::Stored(x);
 }
 template <typename T>
-IntRows StoredOf(const std::vector<std::vector<T>>& A) {
-  IntRows out;
-  for (const auto& r : A) out.push_back(StoredOf(r));
-  return out;
+std::vector<std::vector<T>> Mat(std::initializer_list<std::initializer_list<Int64>> rows) {
+  return testing::MoneyMat<T>(rows);
 }
-
-template <typename Call>
-void ExpectRaises(TResStringId Ident, Call&& call) {
-  try {
-    call();
-    ADD_FAILURE() << "no EMathError raised";
-  } catch (const EMathError& e) {
-    EXPECT_EQ(e.Ident(), Ident) << e.what();
-  }
-}
-
-// Restores the shape switch when a test that turns it off ends, however it ends.
-class SwitchGuard {
- public:
-  explicit SwitchGuard(bool Value) : saved_(QENMatrixRectangularCheck) {
-    QENMatrixRectangularCheck = Value;
-  }
-  ~SwitchGuard() { QENMatrixRectangularCheck = saved_; }
-
- private:
-  bool saved_;
-};
+using SwitchGuard = testing::SwitchGuard<decltype(QENMatrixRectangularCheck), bool>;
 
 template <typename T>
 std::vector<std::vector<T>> Created(LongWord Rows, LongWord Cols) {
@@ -117,7 +86,7 @@ TYPED_TEST(MoneyMatrix, ShapeQueriesFollowTheSwitch) {
   EXPECT_TRUE(MatricesSameDimensions(Mat<T>({{1, 2}}), Mat<T>({{5, 6}})));
   EXPECT_FALSE(MatricesSameDimensions(Mat<T>({{1, 2}}), Mat<T>({{5}, {6}})));
   {
-    SwitchGuard off(false);
+    SwitchGuard off(QENMatrixRectangularCheck, false);
     MatrixDimensions(ragged, rows, cols, rect);
     EXPECT_EQ(rows, 2u);
     EXPECT_EQ(cols, 2u);
@@ -213,7 +182,7 @@ TYPED_TEST(MoneyMatrix, RowAndColumnOperations) {
   EXPECT_EQ(StoredOf(TransposeMatrix(Mat<T>({{1, 2, 3}}))), (IntRows{{1}, {2}, {3}}));
   ExpectRaises(rsMatrixRect, [] { TransposeMatrix(Mat<T>({})); });
   {
-    SwitchGuard off(false);
+    SwitchGuard off(QENMatrixRectangularCheck, false);
     EXPECT_TRUE(TransposeMatrix(Mat<T>({})).empty());
   }
 }
@@ -239,7 +208,7 @@ TYPED_TEST(MoneyMatrix, RowAndColumnChecksLeaveTheMatrix) {
   QSortMatrixRowsOnCol(ragged, 0, false);
   ExpectRaises(rsMatrixRect, [&] { TransposeMatrix(ragged); });
   {
-    SwitchGuard off(false);
+    SwitchGuard off(QENMatrixRectangularCheck, false);
     ExpectRaises(rsMatrixRect, [&] { SwapMatrixRows(ragged, 0, 1); });
     ExpectRaises(rsMatrixRect, [&] { QSortMatrixRowsOnCol(ragged, 0, false); });
     ExpectRaises(rsMatrixRect, [&] { TransposeMatrix(ragged); });

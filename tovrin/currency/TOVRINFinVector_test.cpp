@@ -2,43 +2,34 @@
 
 #include <gtest/gtest.h>
 
+#include "tovrin/testing/TOVRIN_testing.h"
+
 #include <algorithm>
 #include <cstdint>
 #include <initializer_list>
 #include <limits>
+#include <string>
 #include <type_traits>
+#include <utility>
 #include <vector>
 
 namespace tovrin {
 namespace {
 
-// A money value from its stored integer, and back.
-template <typename T>
-T M(Int64 Stored) {
-  return static_cast<T>(static_cast<std::underlying_type_t<T>>(Stored));
-}
-template <typename T>
-std::vector<T> Vec(std::initializer_list<Int64> Stored) {
-  std::vector<T> v;
-  for (const Int64 s : Stored) v.push_back(M<T>(s));
-  return v;
-}
-template <typename T>
-std::vector<Int64> StoredOf(const std::vector<T>& V) {
-  std::vector<Int64> out;
-  for (const T x : V) out.push_back(detail::StoredOf(x));
-  return out;
-}
 using Ints = std::vector<Int64>;
-
-template <typename Call>
-void ExpectRaises(TResStringId Ident, Call&& call) {
-  try {
-    call();
-    ADD_FAILURE() << "no EMathError raised";
-  } catch (const EMathError& e) {
-    EXPECT_EQ(e.Ident(), Ident) << e.what();
-  }
+using IntRows = std::vector<Ints>;
+using testing::ExpectRaises;
+template <typename T>
+T M(Int64 stored) {
+  return testing::Money<T>(stored);
+}
+template <typename T>
+std::vector<T> Vec(std::initializer_list<Int64> stored) {
+  return testing::MoneyVec<T>(stored);
+}
+template <typename T>
+auto StoredOf(const T& x) {
+  return testing::Stored(x);
 }
 
 template <typename T>
@@ -122,26 +113,24 @@ TYPED_TEST(MoneyVector, EmptyVectorsRaiseBeforeAnything) {
   EXPECT_TRUE(w.empty());
 }
 
-TYPED_TEST(MoneyVector, SignPredicatesOnNegativeZeroAndPositive) {
+// VectorNonNegative, VectorNegative, VectorNonZero, VectorZero, VectorNonPositive and
+// VectorPositive as six 0/1 digits. The smallest stored unit is beyond the tolerance for every
+// type, Currency included.
+TYPED_TEST(MoneyVector, SignPredicates) {
   using T = TypeParam;
-  // The smallest stored unit is well beyond the tolerance for every type, Currency included.
-  const auto neg = Vec<T>({-1, -7}), zero = Vec<T>({0, 0}), pos = Vec<T>({1, 7});
-  const auto mixed = Vec<T>({0, 1});
-  EXPECT_TRUE(VectorNegative(neg));
-  EXPECT_FALSE(VectorNegative(zero));
-  EXPECT_TRUE(VectorNonPositive(neg));
-  EXPECT_TRUE(VectorNonPositive(zero));
-  EXPECT_FALSE(VectorNonPositive(pos));
-  EXPECT_TRUE(VectorZero(zero));
-  EXPECT_FALSE(VectorZero(mixed));
-  EXPECT_TRUE(VectorNonZero(neg));
-  EXPECT_TRUE(VectorNonZero(pos));
-  EXPECT_FALSE(VectorNonZero(mixed));
-  EXPECT_TRUE(VectorNonNegative(zero));
-  EXPECT_TRUE(VectorNonNegative(mixed));
-  EXPECT_FALSE(VectorNonNegative(neg));
-  EXPECT_TRUE(VectorPositive(pos));
-  EXPECT_FALSE(VectorPositive(mixed));
+  const struct {
+    std::initializer_list<Int64> stored;
+    const char* expected;
+  } cases[] = {{{-1, -7}, "011010"}, {{0, 0}, "100110"}, {{1, 7}, "101001"}, {{0, 1}, "100000"}};
+  for (const auto& [stored, expected] : cases) {
+    const auto v = Vec<T>(stored);
+    std::string s;
+    for (bool b : {VectorNonNegative(v), VectorNegative(v), VectorNonZero(v), VectorZero(v),
+                   VectorNonPositive(v), VectorPositive(v)}) {
+      s += b ? '1' : '0';
+    }
+    EXPECT_EQ(s, expected);
+  }
 }
 
 TYPED_TEST(MoneyVector, SortsAndRanksByStoredIntegers) {
@@ -298,7 +287,7 @@ TEST(MoneyVectorConversions, FromFloatRoundsTheExtendedProduct) {
   const TQENFloatVector f{1.23456L};
   EXPECT_EQ(StoredOf(Vector2QENCurrencyVector(f)), (Ints{12346}));
   // 0.125 is a true half of a hundredth; 2.675L x 100 rounds to 267.5 in Extended, as 0.00065L
-  // x 10000 does to 6.5 (see TOVRINFinancials_ref.py).
+  // x 10000 does to 6.5 (see TOVRINFinancials_reference.inc).
   const TQENFloatVector g{0.125L, 0.375L, 2.675L, -0.125L};
   EXPECT_EQ(StoredOf(Vector2QENCurrVector(g)), (Ints{12, 38, 268, -12}));
   EXPECT_EQ(StoredOf(Vector2QENLongCurrVector(TQENFloatVector{0.0078125L, 0.0000005L})),

@@ -41,21 +41,22 @@ TEST(Float2QENCurrency, ExactHalvesGoToEven) {
   EXPECT_EQ(Stored(Float2QENLongCurrency(-0.0078125L)), -7812);
 }
 
-// Values from TOVRINFinancials_ref.py (exact rational arithmetic): the Extended product rounded
-// half to even. Rounding the exact product instead would give 267, 101, 1, 7 and 3 for the
-// first five, whose literals lie just below or above a half.
+struct MoneyRounding {
+  Extended literal;
+  Int64 scale, rounded, exactRounded;
+};
+#include "tovrin/foundation/TOVRINFinancials_reference.inc"
+
+// The Extended product rounded half to even (TOVRINFinancials_reference.inc, exact rational
+// arithmetic); the first five literals lie just below or above a half, where rounding the exact
+// product would give another result.
 TEST(Float2QENCurrency, RoundsTheExtendedProduct) {
-  EXPECT_EQ(Stored(Float2QENCurrency(2.675L)), 268);
-  EXPECT_EQ(Stored(Float2QENCurrency(1.015L)), 102);
-  EXPECT_EQ(Stored(Float2QENLongCurrency(0.0000005L)), 0);
-  EXPECT_EQ(Stored(detail::Float2Money<Currency>(0.00065L)), 6);
-  EXPECT_EQ(Stored(detail::Float2Money<Currency>(0.00035L)), 4);
-  EXPECT_EQ(Stored(Float2QENCurrency(1.005L)), 100);
-  EXPECT_EQ(Stored(Float2QENCurrency(-1.005L)), -100);
-  EXPECT_EQ(Stored(Float2QENCurrency(1234567.885L)), 123456788);
-  EXPECT_EQ(Stored(Float2QENLongCurrency(1.0000005L)), 1000000);
-  EXPECT_EQ(Stored(detail::Float2Money<Currency>(1.23456L)), 12346);
-  EXPECT_EQ(Stored(detail::Float2Money<Currency>(0.00015L)), 2);
+  for (const auto& c : kMoneyRounding) {
+    const Int64 stored = c.scale == 100     ? Stored(Float2QENCurrency(c.literal))
+                         : c.scale == 10000 ? Stored(detail::Float2Money<Currency>(c.literal))
+                                            : Stored(Float2QENLongCurrency(c.literal));
+    EXPECT_EQ(stored, c.rounded) << static_cast<double>(c.literal);
+  }
 }
 
 // Overflow is not reported: the rounded value wraps modulo 2^64, a TQENCurrency keeps its low
@@ -106,8 +107,8 @@ Int64 ExtendedProductReference(Extended X, Int64 Scale) {
   };
   int e = 0;
   const Extended f = std::frexp(std::fabs(X), &e);  // |X| = f 2^e, f in [0.5, 1)
-  const U128 p = static_cast<U128>(static_cast<std::uint64_t>(std::ldexp(f, 64))) *
-                 static_cast<U128>(Scale);
+  const U128 p =
+      static_cast<U128>(static_cast<std::uint64_t>(std::ldexp(f, 64))) * static_cast<U128>(Scale);
   int bits = 0;
   while (bits < 128 && (p >> bits) != 0) ++bits;
   int shift = bits > 64 ? bits - 64 : 0;

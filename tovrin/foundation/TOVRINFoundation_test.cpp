@@ -3,6 +3,7 @@
 #include <limits>
 #include <set>
 #include <string>
+#include <utility>
 
 #include <gtest/gtest.h>
 
@@ -60,55 +61,33 @@ TEST(ConstantsTest, HoldFullExtendedPrecision) {
 
 // --- Tolerance predicates ---------------------------------------------------------------------
 
-TEST(TolerancePredicatesTest, CompareAgainstTheToleranceAbsolutely) {
-  EXPECT_TRUE(FloatIsZero(0.0L));
-  EXPECT_TRUE(FloatIsZero(4.9e-12L));
-  EXPECT_TRUE(FloatIsZero(-4.9e-12L));
-  EXPECT_FALSE(FloatIsZero(5e-12L));
-  EXPECT_FALSE(FloatIsZero(-5.1e-12L));
-  EXPECT_TRUE(FloatIsNotZero(5.1e-12L));
-  EXPECT_FALSE(FloatIsNotZero(1e-30L));
-
-  EXPECT_TRUE(FloatIsPositive(5.1e-12L));
-  EXPECT_FALSE(FloatIsPositive(5e-12L));
-  EXPECT_FALSE(FloatIsPositive(1e-13L));
-  EXPECT_TRUE(FloatIsNegative(-5.1e-12L));
-  EXPECT_FALSE(FloatIsNegative(-5e-12L));
-  EXPECT_FALSE(FloatIsNegative(-1e-13L));
+// FloatIsZero, FloatIsNotZero, FloatIsPositive and FloatIsNegative as four 0/1 digits: the
+// tolerance 5e-12 is absolute, and NaN is neither zero nor signed.
+std::string Predicates(Extended x) {
+  std::string s;
+  for (bool b : {FloatIsZero(x), FloatIsNotZero(x), FloatIsPositive(x), FloatIsNegative(x)}) {
+    s += b ? '1' : '0';
+  }
+  return s;
 }
 
-TEST(TolerancePredicatesTest, NaNIsNeitherZeroNorSigned) {
-  EXPECT_FALSE(FloatIsZero(kNaN));
-  EXPECT_TRUE(FloatIsNotZero(kNaN));
-  EXPECT_FALSE(FloatIsPositive(kNaN));
-  EXPECT_FALSE(FloatIsNegative(kNaN));
-  EXPECT_FALSE(SameFloat(kNaN, kNaN));
-  EXPECT_TRUE(NotSameFloat(kNaN, 1.0L));
-}
-
-TEST(SameFloatTest, AbsoluteUpToOneAndRelativeBeyond) {
-  EXPECT_TRUE(SameFloat(0.0L, 4e-12L));
-  EXPECT_FALSE(SameFloat(0.0L, 6e-12L));
-  EXPECT_TRUE(SameFloat(0.5L, 0.5L + 4e-12L));
-  EXPECT_TRUE(SameFloat(1.0L, 1.0L + 4e-12L));
-  EXPECT_FALSE(SameFloat(1.0L, 1.0L + 6e-12L));
-  EXPECT_TRUE(SameFloat(1e6L, 1e6L + 4e-6L));
-  EXPECT_FALSE(SameFloat(1e6L, 1e6L + 6e-6L));
+TEST(ToleranceTest, PredicatesAndSameFloat) {
+  const std::pair<Extended, const char*> predicates[] = {
+      {0.0L, "1000"},      {4.9e-12L, "1000"}, {-4.9e-12L, "1000"}, {5e-12L, "0100"},
+      {-5.1e-12L, "0101"}, {5.1e-12L, "0110"}, {1e-30L, "1000"},    {kNaN, "0100"}};
+  for (const auto& [x, digits] : predicates) EXPECT_EQ(Predicates(x), digits) << double(x);
+  // SameFloat: absolute up to 1, relative beyond; Double and Single at their own precision.
+  EXPECT_TRUE(SameFloat(0.0L, 4e-12L) && SameFloat(0.5L, 0.5L + 4e-12L));
+  EXPECT_TRUE(SameFloat(1.0L, 1.0L + 4e-12L) && !SameFloat(1.0L, 1.0L + 6e-12L));
+  EXPECT_TRUE(SameFloat(1e6L, 1e6L + 4e-6L) && !SameFloat(1e6L, 1e6L + 6e-6L));
   EXPECT_TRUE(SameFloat(-1e300L, -1e300L * (1 + 4e-12L)));
-  EXPECT_FALSE(SameFloat(1e-20L, -1.0L));
+  EXPECT_FALSE(SameFloat(0.0L, 6e-12L) || SameFloat(1e-20L, -1.0L) || SameFloat(kNaN, kNaN));
   EXPECT_TRUE(SameFloat(kInf, kInf));
-  EXPECT_FALSE(SameFloat(kInf, -kInf));
-  EXPECT_FALSE(SameFloat(std::numeric_limits<Extended>::max(), kInf));
-  EXPECT_TRUE(NotSameFloat(1.0L, 2.0L));
-}
-
-TEST(SameFloatTest, DoubleAndSingleCompareAtTheirOwnPrecision) {
-  EXPECT_TRUE(SameFloat(1.0, 1.0 + 4e-12));
-  EXPECT_FALSE(SameFloat(1.0, 1.0 + 6e-12));
-  EXPECT_TRUE(SameFloat(1.0F, 1.000004F));
-  EXPECT_FALSE(SameFloat(1.0F, 1.00001F));
-  EXPECT_TRUE(SameFloat(0.0F, 4e-6F));
-  EXPECT_FALSE(SameFloat(0.0F, 6e-6F));
+  EXPECT_FALSE(SameFloat(kInf, -kInf) || SameFloat(std::numeric_limits<Extended>::max(), kInf));
+  EXPECT_TRUE(NotSameFloat(1.0L, 2.0L) && NotSameFloat(kNaN, 1.0L));
+  EXPECT_TRUE(SameFloat(1.0, 1.0 + 4e-12) && !SameFloat(1.0, 1.0 + 6e-12));
+  EXPECT_TRUE(SameFloat(1.0F, 1.000004F) && !SameFloat(1.0F, 1.00001F));
+  EXPECT_TRUE(SameFloat(0.0F, 4e-6F) && !SameFloat(0.0F, 6e-6F));
 }
 
 // --- Elementary helpers -----------------------------------------------------------------------
@@ -184,36 +163,34 @@ TEST(SystemTest, SwapAndClear) {
 
 // --- Text conversions -------------------------------------------------------------------------
 
-TEST(Float2EStrTest, FixedNotationWithExactDecimals) {
-  EXPECT_EQ(Float2EStr(1.5L, 2), "1.50");
-  EXPECT_EQ(Float2EStr(1.5L, 0), "2");
-  EXPECT_EQ(Float2EStr(-1234567.0L, 1), "-1234567.0");
-  EXPECT_EQ(Float2EStr(1e20L, 0), "100000000000000000000");
-  EXPECT_EQ(Float2EStr(0.0L, 4), "0.0000");
-}
-
-TEST(Float2EStrTest, RoundsTheExactBinaryValueTiesToEven) {
-  // Exact binary ties go to the even digit.
-  EXPECT_EQ(Float2EStr(2.5L, 0), "2");
-  EXPECT_EQ(Float2EStr(3.5L, 0), "4");
-  EXPECT_EQ(Float2EStr(0.125L, 2), "0.12");
-  EXPECT_EQ(Float2EStr(0.375L, 2), "0.38");
-  EXPECT_EQ(Float2EStr(-2.25L, 1), "-2.2");
-  // Decimal expansions of the stored values (computed exactly with Python's decimal module at
-  // 64-bit precision): 2.675L is 2.67499999999999999995..., 0.3L is 0.30000000000000000001...
-  EXPECT_EQ(Float2EStr(2.675L, 2), "2.67");
-  EXPECT_EQ(Float2EStr(0.3L, 19), "0.3000000000000000000");
-  EXPECT_EQ(Float2EStr(0.3L, 20), "0.30000000000000000001");
-  EXPECT_EQ(Float2EStr(0.1L, 21), "0.100000000000000000001");
-  EXPECT_EQ(Float2EStr(1e-3L, 25), "0.0009999999999999999999585");
-}
-
-TEST(Float2EStrTest, NeverWritesNegativeZero) {
-  EXPECT_EQ(Float2EStr(-0.0L, 3), "0.000");
-  EXPECT_EQ(Float2EStr(-0.001L, 2), "0.00");
-  EXPECT_EQ(Float2EStr(-0.4L, 0), "0");
-  EXPECT_EQ(Float2EStr(-0.5L, 0), "0");
-  EXPECT_EQ(Float2EStr(-0.6L, 0), "-1");
+// Fixed notation of the exact binary value, ties to even, never a negative zero. The decimal
+// expansions of the stored values come from Python's decimal module at 64-bit precision:
+// 2.675L is 2.67499999999999999995..., 0.3L is 0.30000000000000000001...
+TEST(Float2EStrTest, ExactDecimalsTiesToEven) {
+  const struct {
+    Extended x;
+    Byte decimals;
+    const char* text;
+  } cases[] = {{1.5L, 2, "1.50"},
+               {1.5L, 0, "2"},
+               {-1234567.0L, 1, "-1234567.0"},
+               {1e20L, 0, "100000000000000000000"},
+               {0.0L, 4, "0.0000"},
+               {2.5L, 0, "2"},
+               {3.5L, 0, "4"},
+               {0.125L, 2, "0.12"},
+               {0.375L, 2, "0.38"},
+               {-2.25L, 1, "-2.2"},
+               {2.675L, 2, "2.67"},
+               {0.3L, 19, "0.3000000000000000000"},
+               {0.3L, 20, "0.30000000000000000001"},
+               {0.1L, 21, "0.100000000000000000001"},
+               {1e-3L, 25, "0.0009999999999999999999585"},
+               {-0.0L, 3, "0.000"},
+               {-0.001L, 2, "0.00"},
+               {-0.5L, 0, "0"},
+               {-0.6L, 0, "-1"}};
+  for (const auto& c : cases) EXPECT_EQ(Float2EStr(c.x, c.decimals), c.text);
 }
 
 TEST(Float2EStrTest, SpecialValuesAndExtremes) {
@@ -235,14 +212,10 @@ TEST(Int2EStrTest, PlainDecimal) {
 }
 
 TEST(Str2FloatTest, AcceptsTheDecimalForms) {
-  EXPECT_EQ(Str2Float("1"), 1.0L);
-  EXPECT_EQ(Str2Float("-2.5"), -2.5L);
-  EXPECT_EQ(Str2Float(".5"), 0.5L);
-  EXPECT_EQ(Str2Float("3."), 3.0L);
-  EXPECT_EQ(Str2Float("+7"), 7.0L);
-  EXPECT_EQ(Str2Float("1e-3"), 1e-3L);
-  EXPECT_EQ(Str2Float("1E+2"), 100.0L);
-  EXPECT_EQ(Str2Float(" \t0.1  "), 0.1L);
+  const std::pair<const char*, Extended> cases[] = {
+      {"1", 1.0L},  {"-2.5", -2.5L}, {".5", 0.5L},     {"3.", 3.0L},
+      {"+7", 7.0L}, {"1e-3", 1e-3L}, {"1E+2", 100.0L}, {" \t0.1  ", 0.1L}};
+  for (const auto& [text, value] : cases) EXPECT_EQ(Str2Float(text), value) << text;
   EXPECT_TRUE(std::signbit(Str2Float("-0")));
 }
 

@@ -1,5 +1,5 @@
 // Tests of Gamma, LnGamma, Beta, IncompleteBeta and InverseIncompleteBeta against reference
-// values computed at 256 bits by testdata/gammabeta_reference.py, plus exact values, identities,
+// values computed at 256 bits by TOVRINMath_GammaBeta_reference.py, plus exact values, identities,
 // round trips and the domain errors.
 #include <gtest/gtest.h>
 
@@ -12,12 +12,11 @@
 
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINMath.h"
-#include "tovrin/foundation/testdata/gammabeta_reference.h"
 
 namespace tovrin {
 namespace {
 
-using namespace testdata;
+#include "tovrin/foundation/TOVRINMath_GammaBeta_reference.inc"
 
 constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
 constexpr Extended kInf = std::numeric_limits<Extended>::infinity();

@@ -36,12 +36,11 @@ class VectorEditModel : public GridModel {
   }
 
   void SetLabels(const QStringList& Labels) {
-    for (std::size_t row = 0; row < labels_.size(); ++row) {
-      const auto given = static_cast<qsizetype>(row);
-      // An empty entry is an empty label; only rows past the list have none.
-      labels_[row] =
-          given < Labels.size() ? QString(Labels[given].isNull() ? "" : Labels[given]) : QString();
-    }
+    labels_.assign(Labels.begin(), Labels.end());
+    // An empty entry is an empty label; only rows past the list have none.
+    for (QString& label : labels_)
+      if (label.isNull()) label = QString("");
+    EnsureLabels(values_.size());
     if (labelled_ && Count() > 0) emit dataChanged(index(0, 0), index(Count() - 1, 0));
   }
 
@@ -49,12 +48,11 @@ class VectorEditModel : public GridModel {
     // Everything is allocated before the views are told, so a failure leaves them consistent.
     TQENFloatVector values = V;
     std::vector<bool> null(values.size(), false);
-    labels_.reserve(values.size());
+    EnsureLabels(values.size());
     beginResetModel();
     values_ = std::move(values);
     null_ = std::move(null);
     nullCount_ = 0;
-    labels_.resize(values_.size());
     endResetModel();
     ReportChanged();
   }
@@ -63,17 +61,17 @@ class VectorEditModel : public GridModel {
     const std::size_t old = values_.size();
     if (N == old) return;
     if (N > old) {
-      values_.reserve(N), null_.reserve(N), labels_.reserve(N);
+      values_.reserve(N), null_.reserve(N);
+      EnsureLabels(N);
       beginInsertRows(QModelIndex(), static_cast<int>(old), static_cast<int>(N - 1));
       values_.resize(N);
       null_.resize(N, true);
-      labels_.resize(N);
       nullCount_ += N - old;
       endInsertRows();
     } else {
       beginRemoveRows(QModelIndex(), static_cast<int>(N), static_cast<int>(old - 1));
       nullCount_ -= static_cast<std::size_t>(std::count(null_.begin() + N, null_.end(), true));
-      values_.resize(N), null_.resize(N), labels_.resize(N);
+      values_.resize(N), null_.resize(N);
       endRemoveRows();
     }
     ReportChanged();
@@ -102,17 +100,20 @@ class VectorEditModel : public GridModel {
   // The values become Work, none null; Order, when given, is the old row of each new row and
   // carries the labels along.
   void Commit(TQENFloatVector Work, const std::vector<std::size_t>& Order = {}) {
+    // Everything is allocated before the views are told, so a failure leaves them consistent.
+    std::vector<bool> null(Work.size(), false);
+    EnsureLabels(Work.size());
+    std::vector<QString> labels;
+    if (!Order.empty()) {
+      labels = labels_;
+      for (std::size_t row = 0; row < Order.size(); ++row) labels[row] = labels_[Order[row]];
+    }
     const bool sameCount = Work.size() == values_.size();
     if (!sameCount) beginResetModel();
     values_ = std::move(Work);
-    null_.assign(values_.size(), false);
+    null_ = std::move(null);
     nullCount_ = 0;
-    if (!Order.empty()) {
-      std::vector<QString> labels(Order.size());
-      for (std::size_t row = 0; row < Order.size(); ++row) labels[row] = labels_[Order[row]];
-      labels_ = std::move(labels);
-    }
-    labels_.resize(values_.size());
+    if (!Order.empty()) labels_ = std::move(labels);
     if (sameCount) {
       AllCellsChanged();
     } else {
@@ -127,7 +128,9 @@ class VectorEditModel : public GridModel {
     const std::size_t row =
         Index >= 0 && static_cast<std::size_t>(Index) < n ? static_cast<std::size_t>(Index) : n;
     // Reserved first, so that nothing can fail between beginInsertRows and endInsertRows.
-    values_.reserve(n + 1), null_.reserve(n + 1), labels_.reserve(n + 1);
+    values_.reserve(n + 1), null_.reserve(n + 1);
+    EnsureLabels(n);
+    labels_.reserve(labels_.size() + 1);
     beginInsertRows(QModelIndex(), static_cast<int>(row), static_cast<int>(row));
     AddValue2Vector(values_, Value, Index);
     null_.insert(null_.begin() + static_cast<std::ptrdiff_t>(row), false);
@@ -201,6 +204,11 @@ class VectorEditModel : public GridModel {
   }
 
  private:
+  // Labels are kept for every row and also past the last one, for rows added later.
+  void EnsureLabels(std::size_t Rows) {
+    if (labels_.size() < Rows) labels_.resize(Rows);
+  }
+
   bool labelled_;
   TQENFloatVector values_;
   std::vector<bool> null_;

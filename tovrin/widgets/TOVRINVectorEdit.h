@@ -113,8 +113,9 @@ class TQENLabelledVectorEdit : public TQENVectorEdit {
   explicit TQENLabelledVectorEdit(QWidget* parent = nullptr);
   ~TQENLabelledVectorEdit() override;
 
-  // One label per row; rows past the end of Labels have none, labels past the last row are
-  // dropped. Setting them is not a change of contents (no Changed()).
+  // One label per row; rows past the end of Labels have none, and labels past the last row
+  // wait for rows added later (Labels may be set before the values). Setting them is not a
+  // change of contents (no Changed()).
   QStringList Labels() const;
   void SetLabels(const QStringList& Labels);
 };

@@ -175,8 +175,8 @@ TEST(VectorEditKeyboard, TypingIntoACellStoresTheNumberAndDeleteMakesNulls) {
 
 TEST(LabelledVectorEdit, LabelsTravelWithTheirValuesAndMissingOnesReadNA) {
   TQENLabelledVectorEdit edit;
+  edit.SetLabels({"c", "a"});  // before the values: kept for the rows to come
   edit.SetVector({3, 1, 2});
-  edit.SetLabels({"c", "a"});
   EXPECT_EQ(Cell(edit, 2, 0).toStdString(), LoadResString(rsNA));
   ASSERT_TRUE(edit.Sort());
   EXPECT_EQ(edit.Vector(), (TQENFloatVector{1, 2, 3}));

@@ -56,7 +56,7 @@ StudioWindow::StudioWindow(QWidget* parent) : QWidget(parent) {
   };
   for (const auto& [name, command] : vectorCommands) {
     auto* button = new QPushButton(name);
-    connect(button, &QPushButton::clicked, this, [command] { command(); });
+    connect(button, &QPushButton::clicked, this, [run = command] { run(); });
     vectorButtons->addWidget(button);
   }
   auto* sampleLayout = new QVBoxLayout(sample);
@@ -92,7 +92,7 @@ StudioWindow::StudioWindow(QWidget* parent) : QWidget(parent) {
   int slot = 0;
   for (const auto& [name, command] : matrixCommands) {
     auto* button = new QPushButton(name);
-    connect(button, &QPushButton::clicked, this, [command] { command(); });
+    connect(button, &QPushButton::clicked, this, [run = command] { run(); });
     matrixButtons->addWidget(button, slot / 3, slot % 3);
     ++slot;
   }
