@@ -11,6 +11,7 @@
 
 #include "tovrin/foundation/TOVRINFinancials.h"
 #include "tovrin/foundation/TOVRINFoundation.h"
+#include "tovrin/matrix/TOVRINMatrix.h"  // QENMatrixRectangularCheck
 
 namespace tovrin {
 
