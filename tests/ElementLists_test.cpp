@@ -41,11 +41,17 @@ static_assert(CanSort<TQENSIntVector> && !CanSort<std::vector<Int64*>>);
 static_assert(!CanSort<TQENFloatMatrix> && !CanSort<std::vector<long double>>);
 
 template <typename M>
-concept CanInvert = requires(M& m) { MatrixInverse(m, m); };
+concept CanInvert = requires(M& m) {
+  MatrixInverse(m, m);
+};
 template <typename M>
-concept CanSumRow = requires(const M& m) { SumMatrixRow(m, 0); };
+concept CanSumRow = requires(const M& m) {
+  SumMatrixRow(m, 0);
+};
 template <typename V>
-concept CanTakeMedian = requires(const V& v) { GetMedian(v); };
+concept CanTakeMedian = requires(const V& v) {
+  GetMedian(v);
+};
 
 static_assert(CanInvert<TQENDoubleMatrix> && !CanInvert<TQENInt64Matrix>);
 static_assert(CanSumRow<TQENLWordMatrix> && !CanSumRow<TQENLIntMatrix>);

@@ -1,7 +1,7 @@
 // The whole public interface of tovrin.
 #pragma once
 
-#include "tovrin/foundation/TOVRINFinancials.h"
+#include "tovrin/currency/TOVRINFinancials.h"
 #include "tovrin/foundation/TOVRINFoundation.h"
 #include "tovrin/vector/TOVRINVector.h"
 #include "tovrin/matrix/TOVRINMatrix.h"

@@ -9,8 +9,9 @@
 // column scaling or sum, and no element-wise function for money.
 #pragma once
 
-#include "tovrin/foundation/TOVRINFinancials.h"
+#include "tovrin/currency/TOVRINFinancials.h"
 #include "tovrin/foundation/TOVRINFoundation.h"
+#include "tovrin/matrix/TOVRINMatrix.h"  // QENMatrixRectangularCheck
 
 namespace tovrin {
 

@@ -8,7 +8,7 @@
 // overflow not reported (wrapped); nothing here raises for a value out of range.
 #pragma once
 
-#include "tovrin/foundation/TOVRINFinancials.h"
+#include "tovrin/currency/TOVRINFinancials.h"
 #include "tovrin/foundation/TOVRINFoundation.h"
 
 namespace tovrin {

@@ -5,12 +5,18 @@
 // the element type beyond copying it.
 #pragma once
 
+#include <atomic>
 #include <cstddef>
 #include <vector>
 
 #include "tovrin/foundation/TOVRINElementTypes.h"
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINGlobals.h"
+
+namespace tovrin {
+// The matrix unit's shape switch (TOVRINMatrix.h), defined with the matrix unit.
+extern std::atomic<bool> QENMatrixRectangularCheck;
+}  // namespace tovrin
 
 namespace tovrin::detail {
 

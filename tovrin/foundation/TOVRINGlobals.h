@@ -1,4 +1,4 @@
-// Element types, containers, constants and the shared shape switch of tovrin.
+// Element types, containers and constants of tovrin.
 //
 // Every vector is a std::vector of one of ten element types; a matrix is a vector of rows
 // that may differ in length. `Extended` is the 80-bit x87 type; inside a TQENFloatVector it
@@ -6,7 +6,6 @@
 // values occupies 10 * n bytes.
 #pragma once
 
-#include <atomic>
 #include <cstdint>
 #include <cstring>
 #include <limits>
@@ -100,9 +99,5 @@ inline constexpr Single QENSingleTolerance = 5e-6F;
 
 // The text shown for a missing value.
 inline constexpr const char* QENNullStr = "N/A";
-
-// Whether shape checks walk every row of a matrix (true) or trust row 0 (false).
-// Process-wide; the library reads it and never writes it.
-inline std::atomic<bool> QENMatrixRectangularCheck{true};
 
 }  // namespace tovrin

@@ -245,7 +245,8 @@ Extended XMinusLog1p(Extended t) {
 // library is correctly rounded to within about 0.6 units in the last place, whatever the
 // size of the exponent). Also sets log_power to the logarithm of the result, for when the power
 // itself leaves the range.
-Extended ScaledPower(Extended x_hi, Extended x_lo, Extended a, Extended b, Extended& log_power) {
+Extended ScaledPower(Extended x_hi, Extended x_lo, Extended a, Extended b, Extended& log_power,
+                     bool sqrt_half = false) {
   const Extended q = b / a;
   const ExactPair qa = TwoProduct(q, a);
   const Extended q_lo = ((b - qa.hi) - qa.lo) / a;  // b/a = q + q_lo
@@ -253,7 +254,7 @@ Extended ScaledPower(Extended x_hi, Extended x_lo, Extended a, Extended b, Exten
   const ExactPair z = TwoSum(x_hi, xq.hi);
   const Extended z_lo = z.lo + xq.lo + x_hi * q_lo + x_lo * (1.0L + q);
   const Extended delta = z_lo / z.hi;
-  const Extended power = std::pow(z.hi, a);
+  const Extended power = sqrt_half && a == 0.5L ? std::sqrt(z.hi) : std::pow(z.hi, a);
   const Extended ad = a * delta;
   if (std::isnormal(power)) {
     if (std::fabs(ad) < 1e-6L) return power * (1.0L + ad);
@@ -327,16 +328,19 @@ struct BetaPoint {
   Extended y;
   Extended x_lo = 0.0L;  // x + x_lo and y + y_lo are the exact coordinates
   Extended y_lo = 0.0L;
+  // The precise family takes a power 1/2 by sqrt (correctly rounded, and several times faster
+  // than pow); the classic functions keep pow's last bits.
+  bool sqrt_half = false;
 };
 
 // The point (x, 1 - x) for an exact x; the rounding of 1 - x is kept in y_lo (exactly, as in
 // Fast2Sum).
-BetaPoint PointFromX(Extended x) {
+BetaPoint PointFromX(Extended x, bool sqrt_half = false) {
   const Extended y = 1.0L - x;
-  return {x, y, 0.0L, (1.0L - y) - x};
+  return {x, y, 0.0L, (1.0L - y) - x, sqrt_half};
 }
 
-BetaPoint Swapped(const BetaPoint& p) { return {p.y, p.x, p.y_lo, p.x_lo}; }
+BetaPoint Swapped(const BetaPoint& p) { return {p.y, p.x, p.y_lo, p.x_lo, p.sqrt_half}; }
 
 // lambda = a y - b x = a - (a + b) x, from the exact member of the pair.
 Extended BetaLambda(const BetaPoint& p, Extended a, Extended b) {
@@ -344,9 +348,9 @@ Extended BetaLambda(const BetaPoint& p, Extended a, Extended b) {
   return -ShiftedDifference(b, a, p.y);
 }
 
-// pow(x_hi + x_lo, a) for a small correction x_lo.
-Extended PowerOfPair(Extended x_hi, Extended x_lo, Extended a) {
-  const Extended power = std::pow(x_hi, a);
+// pow(x_hi + x_lo, a) for a small correction x_lo (sqrt for a = 1/2 when sqrt_half is set).
+Extended PowerOfPair(Extended x_hi, Extended x_lo, Extended a, bool sqrt_half) {
+  const Extended power = sqrt_half && a == 0.5L ? std::sqrt(x_hi) : std::pow(x_hi, a);
   if (x_lo == 0.0L) return power;
   return power * (1.0L + a * (x_lo / x_hi));
 }
@@ -358,8 +362,8 @@ Extended PowerOfPair(Extended x_hi, Extended x_lo, Extended a) {
 Extended BetaPowerFactor(const BetaPoint& p, Extended a, Extended b, Extended lambda) {
   if (a < kStirlingStart && b < kStirlingStart) {
     // Small shapes: the powers and B(a, b) directly.
-    const Extended xa = PowerOfPair(p.x, p.x_lo, a);
-    const Extended yb = PowerOfPair(p.y, p.y_lo, b);
+    const Extended xa = PowerOfPair(p.x, p.x_lo, a, p.sqrt_half);
+    const Extended yb = PowerOfPair(p.y, p.y_lo, b, p.sqrt_half);
     const Extended factor = xa * yb / BetaFinite(a, b);
     if (std::isnormal(xa) && std::isnormal(yb) && std::isnormal(factor)) return factor;
   }
@@ -371,8 +375,8 @@ Extended BetaPowerFactor(const BetaPoint& p, Extended a, Extended b, Extended la
     // only pow's rounding of each.
     Extended log_a;
     Extended log_b;
-    const Extended pa = ScaledPower(p.x, p.x_lo, a, b, log_a);
-    const Extended pb = ScaledPower(p.y, p.y_lo, b, a, log_b);
+    const Extended pa = ScaledPower(p.x, p.x_lo, a, b, log_a, p.sqrt_half);
+    const Extended pb = ScaledPower(p.y, p.y_lo, b, a, log_b, p.sqrt_half);
     const Extended product = pa * pb;
     if (std::isnormal(pa) && std::isnormal(pb) && std::isnormal(product)) {
       return product * (scale * std::exp(correction));
@@ -392,10 +396,10 @@ Extended BetaPowerFactor(const BetaPoint& p, Extended a, Extended b, Extended la
   Extended log_power = 0.0L;
   if (ta < -0.5L) {
     exponent = ShapeTimesPhi(b, tb, lambda) - lambda;
-    power = ScaledPower(p.x, p.x_lo, a, b, log_power);
+    power = ScaledPower(p.x, p.x_lo, a, b, log_power, p.sqrt_half);
   } else if (tb < -0.5L) {
     exponent = ShapeTimesPhi(a, ta, -lambda) + lambda;
-    power = ScaledPower(p.y, p.y_lo, b, a, log_power);
+    power = ScaledPower(p.y, p.y_lo, b, a, log_power, p.sqrt_half);
   } else {
     exponent = ShapeTimesPhi(a, ta, -lambda) + ShapeTimesPhi(b, tb, lambda);
   }
@@ -687,7 +691,7 @@ Extended InverseBetaLowerHalf(Extended p, Extended q, Extended a, Extended b, Be
   const Extended target = use_lower ? p : q;
   bool hi_evaluated = false;
   for (int i = 0; i < kMaxIterations; ++i) {
-    const BetaPoint pt = PointFromX(x);
+    const BetaPoint pt = PointFromX(x, start.sqrt_half);
     const BetaValues v = IncompleteBetaBoth(pt, a, b);
     // f(x) = I_x - p, written in the tail that is known accurately.
     const Extended f = use_lower ? v.lower - p : q - v.upper;
@@ -1072,7 +1076,7 @@ Tails IncompleteBetaTails(Extended X, Extended XLo, Extended Y, Extended YLo, Ex
     if (A < kTinyShape && B < kTinyShape) return {B / (A + B), A / (A + B)};
     return A < kTinyShape ? Tails{1.0L, 0.0L} : Tails{0.0L, 1.0L};
   }
-  const BetaPoint p{X, Y, XLo, YLo};
+  const BetaPoint p{X, Y, XLo, YLo, true};
   BetaValues v = IncompleteBetaBothLarge(p, A, B);
   // The side is chosen by the mean; for a very skewed shape the complement can still be small,
   // and then it is computed directly where the expansion for a small second shape applies.
@@ -1092,7 +1096,7 @@ Tails IncompleteBetaTails(Extended X, Extended XLo, Extended Y, Extended YLo, Ex
 
 Extended BetaPowerFactor(Extended X, Extended XLo, Extended Y, Extended YLo, Extended A,
                          Extended B) {
-  const BetaPoint p{X, Y, XLo, YLo};
+  const BetaPoint p{X, Y, XLo, YLo, true};
   return tovrin::BetaPowerFactor(p, A, B, BetaLambda(p, A, B));
 }
 
@@ -1108,17 +1112,20 @@ BetaRoot InverseIncompleteBetaTails(Extended P, Extended Q, Extended A, Extended
     const Extended level = A < kTinyShape ? (B < kTinyShape ? B / (A + B) : 1.0L) : 0.0L;
     return P <= level ? BetaRoot{0.0L, 1.0L} : BetaRoot{1.0L, 0.0L};
   }
-  const BetaPoint start = InverseBetaEstimate(P, Q, A, B);
+  BetaPoint start = InverseBetaEstimate(P, Q, A, B);
+  start.sqrt_half = true;
   bool beyond_half = false;
   if (start.x <= 0.5L) {
     const Extended x = InverseBetaLowerHalf(P, Q, A, B, start, beyond_half);
     if (!beyond_half) return {x, 1.0L - x};
-    const Extended y = InverseBetaLowerHalf(Q, P, B, A, BetaPoint{0.5L, 0.5L}, beyond_half);
+    const Extended y =
+        InverseBetaLowerHalf(Q, P, B, A, BetaPoint{0.5L, 0.5L, 0.0L, 0.0L, true}, beyond_half);
     return {1.0L - y, y};
   }
   const Extended y = InverseBetaLowerHalf(Q, P, B, A, Swapped(start), beyond_half);
   if (!beyond_half) return {1.0L - y, y};
-  const Extended x = InverseBetaLowerHalf(P, Q, A, B, BetaPoint{0.5L, 0.5L}, beyond_half);
+  const Extended x =
+      InverseBetaLowerHalf(P, Q, A, B, BetaPoint{0.5L, 0.5L, 0.0L, 0.0L, true}, beyond_half);
   return {x, 1.0L - x};
 }
 

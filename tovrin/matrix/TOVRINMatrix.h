@@ -9,12 +9,17 @@
 // Floating-point work is done in Extended and rounded to the element type on store.
 #pragma once
 
+#include <atomic>
 #include <vector>
 
 #include "tovrin/foundation/TOVRINElementTypes.h"
 #include "tovrin/foundation/TOVRINFoundation.h"
 
 namespace tovrin {
+
+// Whether shape checks walk every row of a matrix (true, the start-up value) or trust row 0
+// (false). Process-wide; the library reads it and never writes it.
+extern std::atomic<bool> QENMatrixRectangularCheck;
 
 // === Creation ===============================================================================
 

@@ -1,5 +1,6 @@
 // Creation, shape queries, conversion, two-matrix and scalar arithmetic, element-wise
 // functions and the grand mean.
+#include <atomic>
 #include <cmath>
 
 #include "tovrin/detail/ElementRules.h"
@@ -8,6 +9,9 @@
 #include "tovrin/matrix/TOVRINMatrix.h"
 
 namespace tovrin {
+
+std::atomic<bool> QENMatrixRectangularCheck{true};
+
 namespace {
 
 using detail::MatrixOf;

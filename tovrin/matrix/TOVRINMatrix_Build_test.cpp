@@ -371,3 +371,5 @@ TYPED_TEST(MatrixElementWise, FailuresStopWhereTheyAreWithoutRollBack) {
 
 }  // namespace
 }  // namespace tovrin
+
+TEST(ShapeSwitchTest, IsOnAtStartUp) { EXPECT_TRUE(tovrin::QENMatrixRectangularCheck.load()); }

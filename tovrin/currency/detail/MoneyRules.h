@@ -12,7 +12,7 @@
 
 #include <cstdint>
 
-#include "tovrin/foundation/TOVRINFinancials.h"
+#include "tovrin/currency/TOVRINFinancials.h"
 #include "tovrin/foundation/TOVRINFoundation.h"
 
 namespace tovrin::detail {

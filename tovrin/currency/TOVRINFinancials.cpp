@@ -1,4 +1,4 @@
-#include "tovrin/foundation/TOVRINFinancials.h"
+#include "tovrin/currency/TOVRINFinancials.h"
 
 #include <cmath>
 #include <cstdint>

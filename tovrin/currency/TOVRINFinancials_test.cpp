@@ -1,4 +1,4 @@
-#include "tovrin/foundation/TOVRINFinancials.h"
+#include "tovrin/currency/TOVRINFinancials.h"
 
 #include <gtest/gtest.h>
 
@@ -45,7 +45,7 @@ struct MoneyRounding {
   Extended literal;
   Int64 scale, rounded, exactRounded;
 };
-#include "tovrin/foundation/TOVRINFinancials_reference.inc"
+#include "tovrin/currency/TOVRINFinancials_reference.inc"
 
 // The Extended product rounded half to even (TOVRINFinancials_reference.inc, exact rational
 // arithmetic); the first five literals lie just below or above a half, where rounding the exact
