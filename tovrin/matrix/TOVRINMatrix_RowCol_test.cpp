@@ -387,40 +387,6 @@ TEST(RowColProductRounding, DoubleProductsAreFormedInExtended) {
   EXPECT_EQ(f[0][0], 0.0F);
 }
 
-// Random matrices against the element-by-element definition, evaluated here in the plain
-// i, j, k order: every bit must agree.
-template <typename T>
-Matrix<T> ProductByDefinition(const Matrix<T>& A, const Matrix<T>& B) {
-  Matrix<T> r(A.size(), std::vector<T>(B[0].size()));
-  for (std::size_t i = 0; i < A.size(); ++i) {
-    for (std::size_t j = 0; j < B[0].size(); ++j) {
-      T acc = T(0);
-      for (std::size_t k = 0; k < B.size(); ++k) {
-        acc = T(static_cast<long double>(acc) +
-                static_cast<long double>(B[k][j]) * static_cast<long double>(A[i][k]));
-      }
-      r[i][j] = acc;
-    }
-  }
-  return r;
-}
-
-TYPED_TEST(RowColProduct, BitForBitTheDefinedOrder) {
-  std::mt19937_64 gen(12345);
-  std::uniform_real_distribution<double> u(-1.0, 1.0);
-  for (auto [n, m, p] : {std::tuple{7, 5, 9}, std::tuple{6, 3, 5}, std::tuple{3, 4, 2},
-                         std::tuple{1, 13, 1}, std::tuple{16, 16, 16}}) {
-    Matrix<TypeParam> a(n, std::vector<TypeParam>(m)), b(m, std::vector<TypeParam>(p));
-    for (auto& row : a) {
-      for (auto& x : row) x = TypeParam(static_cast<long double>(u(gen)) / 3);
-    }
-    for (auto& row : b) {
-      for (auto& x : row) x = TypeParam(static_cast<long double>(u(gen)) * 7);
-    }
-    EXPECT_TRUE(SameBits(MultiplyMatrices(a, b), ProductByDefinition(a, b)));
-  }
-}
-
 // --- Sums -----------------------------------------------------------------------------------
 
 template <typename T>
