@@ -240,18 +240,14 @@ Extended XMinusLog1p(Extended t) {
   return u * t - 2.0L * series;
 }
 
-// x^a for x > 0. The classic functions take pow (precise_powers unset). The precise family
-// takes sqrt for a = 1/2 and exp(a ln x) where |a ln x| <= kExpLogPowerLimit: that leaves a
-// relative error of about |a ln x| units in the last place, at a fraction of the cost of the
-// 80-bit pow; beyond the limit pow keeps the error near one unit.
+// x^a for x > 0: pow for the classic functions (precise_powers unset), PrecisePower for the
+// precise family. PrecisePower takes exp(a ln x) while |a ln x| <= kExpLogPowerLimit, which
+// leaves a relative error of about |a ln x| units in the last place at a fraction of the cost
+// of the 80-bit pow; beyond the limit pow keeps the error near one unit.
 constexpr Extended kExpLogPowerLimit = 8.0L;
 
 Extended Power(Extended x, Extended a, bool precise_powers) {
-  if (!precise_powers) return std::pow(x, a);
-  if (a == 0.5L) return std::sqrt(x);
-  const Extended e = a * std::log(x);
-  if (std::fabs(e) <= kExpLogPowerLimit) return std::exp(e);
-  return std::pow(x, a);
+  return precise_powers ? detail::PrecisePower(x, a) : std::pow(x, a);
 }
 
 // (x (a + b) / a)^a for x = x_hi + x_lo, with x (1 + b/a) carried to twice the working
@@ -1038,6 +1034,13 @@ detail::Tails TemmeGammaTails(Extended a, Extended x, const ExactPair& t) {
 }  // namespace
 
 namespace detail {
+
+Extended PrecisePower(Extended X, Extended A) {
+  if (A == 0.5L) return std::sqrt(X);
+  const Extended e = A * std::log(X);
+  if (std::fabs(e) <= kExpLogPowerLimit) return std::exp(e);
+  return std::pow(X, A);
+}
 
 Extended GammaPowerFactor(Extended A, Extended X) {
   if (std::isnan(A) || std::isnan(X)) return kNaN;
