@@ -55,7 +55,9 @@ Extended NormalUpper(const Pair& z) {
   if (std::isnan(z.hi)) return kNaN;
   const Pair x = detail::Product(z, Pair{kInvSqrt2, kInvSqrt2Lo});
   Extended e = std::erfc(x.hi);
-  if (x.lo != 0.0L && std::fabs(x.hi) < 110.0L) {
+  // The correction is x.lo erfc'(x.hi), at most 2 x^2 units in the last place of erfc for
+  // x > 0 and less than one below: below x = 2 it is not worth its exp.
+  if (x.lo != 0.0L && x.hi > 2.0L && x.hi < 110.0L) {
     e -= x.lo * kTwoOverSqrtPi * std::exp(-x.hi * x.hi);
   }
   return 0.5L * e;
@@ -503,35 +505,33 @@ Extended StudentTPDF(Extended T, Extended DF) {
 
 // === Exponential ================================================================================
 
-namespace {
-Pair ExponentialRate(Extended Mean, Extended X) {
-  if (Mean <= 0 || X < 0) RaiseMathError(rsExpDistInvalid);
-  return detail::Quotient(Pair{X}, Pair{Mean});
-}
-}  // namespace
-
 Extended ExponentialLess(Extended Mean, Extended X) {
-  const Pair q = ExponentialRate(Mean, X);
-  if (std::isinf(q.hi)) return 1;
-  const Extended less = -std::expm1(-q.hi);
-  return less + q.lo * (1.0L - less);
+  if (Mean <= 0 || X < 0) RaiseMathError(rsExpDistInvalid);
+  // 1 - e^-q moves by q e^-q / (1 - e^-q) <= 1 times the relative error of q: the rounded
+  // quotient is enough.
+  return -std::expm1(-(X / Mean));
 }
 
 namespace {
-// e^-q for q = hi + lo >= 0.
-Extended ExpMinus(const Pair& q) {
+// e^-q for q = X / Mean >= 0. The rounding of q moves e^-q by q units in the last place, so
+// below q = 16 the rounded quotient serves; beyond, q is carried to twice the precision.
+Extended ExpMinusRatio(Extended X, Extended Mean) {
+  const Extended rounded = X / Mean;
+  if (rounded < 16.0L) return std::exp(-rounded);
+  const Pair q = detail::Quotient(Pair{X}, Pair{Mean});
   if (!(q.hi < 12000.0L)) return std::isnan(q.hi) ? kNaN : 0.0L;
   return std::exp(-q.hi) * (1.0L - q.lo);
 }
 }  // namespace
 
 Extended ExponentialGreater(Extended Mean, Extended X) {
-  return ExpMinus(ExponentialRate(Mean, X));
+  if (Mean <= 0 || X < 0) RaiseMathError(rsExpDistInvalid);
+  return ExpMinusRatio(X, Mean);
 }
 
 Extended ExponentialPDF(Extended X, Extended Mean) {
   if (!(Mean > 0) || X < 0) RaiseMathError(rsExpDistInvalid);
-  return ExpMinus(detail::Quotient(Pair{X}, Pair{Mean})) / Mean;
+  return ExpMinusRatio(X, Mean) / Mean;
 }
 
 // === Beta =======================================================================================
