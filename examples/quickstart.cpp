@@ -8,8 +8,8 @@ int main() {
   const TQENFloatVector samples{2.5L, 3.25L, 4.0L};
   Extended sum = 0;
   for (Extended x : samples) sum += x;
-  std::cout << "sum  " << Float2EStr(sum, 2) << '\n';                   // 9.75
-  std::cout << "0.1L " << Float2EStr(Str2Float("0.1"), 21) << '\n';    // the stored binary value
+  std::cout << "sum  " << Float2EStr(sum, 2) << '\n';                // 9.75
+  std::cout << "0.1L " << Float2EStr(Str2Float("0.1"), 21) << '\n';  // the stored binary value
   try {
     Str2Float("1,5");
   } catch (const EConvertError& e) {

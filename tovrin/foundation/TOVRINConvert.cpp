@@ -1,10 +1,10 @@
 #include "tovrin/foundation/TOVRINConvert.h"
 
+#include <locale.h>  // newlocale, strtold_l
 #include <charconv>
 #include <clocale>
 #include <cmath>
 #include <cstdlib>
-#include <locale.h>  // newlocale, strtold_l
 #include <vector>
 
 #include "tovrin/foundation/TOVRINErrors.h"
@@ -51,8 +51,7 @@ std::string Float2EStr(Extended X, Byte Decimals) {
   auto [end, ec] = std::to_chars(buffer.data(), buffer.data() + buffer.size(), X,
                                  std::chars_format::fixed, static_cast<int>(Decimals));
   std::string text(buffer.data(), end);
-  if (!text.empty() && text[0] == '-' &&
-      text.find_first_not_of("0.", 1) == std::string::npos) {
+  if (!text.empty() && text[0] == '-' && text.find_first_not_of("0.", 1) == std::string::npos) {
     text.erase(0, 1);
   }
   return text;

@@ -15,7 +15,7 @@ struct ResString {
   const char* text;
 };
 
-#define TOVRIN_RS(id, text) ResString{#id, text}
+#define TOVRIN_RS(id, text) (ResString{#id, text})
 constexpr std::array<ResString, rsResStringCount> kResStrings{{
     TOVRIN_RS(rsVectorIsEmpty, "Vector is empty"),
     TOVRIN_RS(rsVectorNeg, "Vector has a negative element"),

@@ -240,13 +240,23 @@ Extended XMinusLog1p(Extended t) {
   return u * t - 2.0L * series;
 }
 
+// x^a for x > 0: pow for the classic functions (precise_powers unset), PrecisePower for the
+// precise family. PrecisePower takes exp(a ln x) while |a ln x| <= kExpLogPowerLimit, which
+// leaves a relative error of about |a ln x| units in the last place at a fraction of the cost
+// of the 80-bit pow; beyond the limit pow keeps the error near one unit.
+constexpr Extended kExpLogPowerLimit = 8.0L;
+
+Extended Power(Extended x, Extended a, bool precise_powers) {
+  return precise_powers ? detail::PrecisePower(x, a) : std::pow(x, a);
+}
+
 // (x (a + b) / a)^a for x = x_hi + x_lo, with x (1 + b/a) carried to twice the working
 // precision, so that the result carries little more than pow's own rounding (pow of the 80-bit
 // library is correctly rounded to within about 0.6 units in the last place, whatever the
 // size of the exponent). Also sets log_power to the logarithm of the result, for when the power
 // itself leaves the range.
 Extended ScaledPower(Extended x_hi, Extended x_lo, Extended a, Extended b, Extended& log_power,
-                     bool sqrt_half = false) {
+                     bool precise_powers = false) {
   const Extended q = b / a;
   const ExactPair qa = TwoProduct(q, a);
   const Extended q_lo = ((b - qa.hi) - qa.lo) / a;  // b/a = q + q_lo
@@ -254,7 +264,7 @@ Extended ScaledPower(Extended x_hi, Extended x_lo, Extended a, Extended b, Exten
   const ExactPair z = TwoSum(x_hi, xq.hi);
   const Extended z_lo = z.lo + xq.lo + x_hi * q_lo + x_lo * (1.0L + q);
   const Extended delta = z_lo / z.hi;
-  const Extended power = sqrt_half && a == 0.5L ? std::sqrt(z.hi) : std::pow(z.hi, a);
+  const Extended power = Power(z.hi, a, precise_powers);
   const Extended ad = a * delta;
   if (std::isnormal(power)) {
     if (std::fabs(ad) < 1e-6L) return power * (1.0L + ad);
@@ -328,19 +338,19 @@ struct BetaPoint {
   Extended y;
   Extended x_lo = 0.0L;  // x + x_lo and y + y_lo are the exact coordinates
   Extended y_lo = 0.0L;
-  // The precise family takes a power 1/2 by sqrt (correctly rounded, and several times faster
-  // than pow); the classic functions keep pow's last bits.
-  bool sqrt_half = false;
+  // Set for the precise family, whose powers are taken the faster way of Power (the classic
+  // functions keep pow's last bits).
+  bool precise_powers = false;
 };
 
 // The point (x, 1 - x) for an exact x; the rounding of 1 - x is kept in y_lo (exactly, as in
 // Fast2Sum).
-BetaPoint PointFromX(Extended x, bool sqrt_half = false) {
+BetaPoint PointFromX(Extended x, bool precise_powers = false) {
   const Extended y = 1.0L - x;
-  return {x, y, 0.0L, (1.0L - y) - x, sqrt_half};
+  return {x, y, 0.0L, (1.0L - y) - x, precise_powers};
 }
 
-BetaPoint Swapped(const BetaPoint& p) { return {p.y, p.x, p.y_lo, p.x_lo, p.sqrt_half}; }
+BetaPoint Swapped(const BetaPoint& p) { return {p.y, p.x, p.y_lo, p.x_lo, p.precise_powers}; }
 
 // lambda = a y - b x = a - (a + b) x, from the exact member of the pair.
 Extended BetaLambda(const BetaPoint& p, Extended a, Extended b) {
@@ -348,9 +358,9 @@ Extended BetaLambda(const BetaPoint& p, Extended a, Extended b) {
   return -ShiftedDifference(b, a, p.y);
 }
 
-// pow(x_hi + x_lo, a) for a small correction x_lo (sqrt for a = 1/2 when sqrt_half is set).
-Extended PowerOfPair(Extended x_hi, Extended x_lo, Extended a, bool sqrt_half) {
-  const Extended power = sqrt_half && a == 0.5L ? std::sqrt(x_hi) : std::pow(x_hi, a);
+// (x_hi + x_lo)^a for a small correction x_lo.
+Extended PowerOfPair(Extended x_hi, Extended x_lo, Extended a, bool precise_powers) {
+  const Extended power = Power(x_hi, a, precise_powers);
   if (x_lo == 0.0L) return power;
   return power * (1.0L + a * (x_lo / x_hi));
 }
@@ -362,8 +372,8 @@ Extended PowerOfPair(Extended x_hi, Extended x_lo, Extended a, bool sqrt_half) {
 Extended BetaPowerFactor(const BetaPoint& p, Extended a, Extended b, Extended lambda) {
   if (a < kStirlingStart && b < kStirlingStart) {
     // Small shapes: the powers and B(a, b) directly.
-    const Extended xa = PowerOfPair(p.x, p.x_lo, a, p.sqrt_half);
-    const Extended yb = PowerOfPair(p.y, p.y_lo, b, p.sqrt_half);
+    const Extended xa = PowerOfPair(p.x, p.x_lo, a, p.precise_powers);
+    const Extended yb = PowerOfPair(p.y, p.y_lo, b, p.precise_powers);
     const Extended factor = xa * yb / BetaFinite(a, b);
     if (std::isnormal(xa) && std::isnormal(yb) && std::isnormal(factor)) return factor;
   }
@@ -375,8 +385,8 @@ Extended BetaPowerFactor(const BetaPoint& p, Extended a, Extended b, Extended la
     // only pow's rounding of each.
     Extended log_a;
     Extended log_b;
-    const Extended pa = ScaledPower(p.x, p.x_lo, a, b, log_a, p.sqrt_half);
-    const Extended pb = ScaledPower(p.y, p.y_lo, b, a, log_b, p.sqrt_half);
+    const Extended pa = ScaledPower(p.x, p.x_lo, a, b, log_a, p.precise_powers);
+    const Extended pb = ScaledPower(p.y, p.y_lo, b, a, log_b, p.precise_powers);
     const Extended product = pa * pb;
     if (std::isnormal(pa) && std::isnormal(pb) && std::isnormal(product)) {
       return product * (scale * std::exp(correction));
@@ -396,10 +406,10 @@ Extended BetaPowerFactor(const BetaPoint& p, Extended a, Extended b, Extended la
   Extended log_power = 0.0L;
   if (ta < -0.5L) {
     exponent = ShapeTimesPhi(b, tb, lambda) - lambda;
-    power = ScaledPower(p.x, p.x_lo, a, b, log_power, p.sqrt_half);
+    power = ScaledPower(p.x, p.x_lo, a, b, log_power, p.precise_powers);
   } else if (tb < -0.5L) {
     exponent = ShapeTimesPhi(a, ta, -lambda) + lambda;
-    power = ScaledPower(p.y, p.y_lo, b, a, log_power, p.sqrt_half);
+    power = ScaledPower(p.y, p.y_lo, b, a, log_power, p.precise_powers);
   } else {
     exponent = ShapeTimesPhi(a, ta, -lambda) + ShapeTimesPhi(b, tb, lambda);
   }
@@ -691,7 +701,7 @@ Extended InverseBetaLowerHalf(Extended p, Extended q, Extended a, Extended b, Be
   const Extended target = use_lower ? p : q;
   bool hi_evaluated = false;
   for (int i = 0; i < kMaxIterations; ++i) {
-    const BetaPoint pt = PointFromX(x, start.sqrt_half);
+    const BetaPoint pt = PointFromX(x, start.precise_powers);
     const BetaValues v = IncompleteBetaBoth(pt, a, b);
     // f(x) = I_x - p, written in the tail that is known accurately.
     const Extended f = use_lower ? v.lower - p : q - v.upper;
@@ -1025,6 +1035,13 @@ detail::Tails TemmeGammaTails(Extended a, Extended x, const ExactPair& t) {
 
 namespace detail {
 
+Extended PrecisePower(Extended X, Extended A) {
+  if (A == 0.5L) return std::sqrt(X);
+  const Extended e = A * std::log(X);
+  if (std::fabs(e) <= kExpLogPowerLimit) return std::exp(e);
+  return std::pow(X, A);
+}
+
 Extended GammaPowerFactor(Extended A, Extended X) {
   if (std::isnan(A) || std::isnan(X)) return kNaN;
   return GammaFactor(A, X);
@@ -1113,7 +1130,7 @@ BetaRoot InverseIncompleteBetaTails(Extended P, Extended Q, Extended A, Extended
     return P <= level ? BetaRoot{0.0L, 1.0L} : BetaRoot{1.0L, 0.0L};
   }
   BetaPoint start = InverseBetaEstimate(P, Q, A, B);
-  start.sqrt_half = true;
+  start.precise_powers = true;
   bool beyond_half = false;
   if (start.x <= 0.5L) {
     const Extended x = InverseBetaLowerHalf(P, Q, A, B, start, beyond_half);

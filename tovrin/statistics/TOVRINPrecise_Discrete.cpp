@@ -54,11 +54,11 @@ Extended Deviance(Extended x, const Pair& m) {
   return d + m.lo * (1.0L - x / m.hi);
 }
 
-// (m / x)^x for m = hi + lo: pow of the double-length base, so the result carries only pow's
-// rounding. Not normal when it leaves the range.
+// (m / x)^x for m = hi + lo: the power of the double-length base, so the result carries only
+// the power's own rounding. Not normal when it leaves the range.
 Extended PowerOfRatio(const Pair& m, Extended x) {
   const Pair q = detail::Quotient(m, Pair{x});
-  return std::pow(q.hi, x) * (1.0L + x * (q.lo / q.hi));
+  return detail::PrecisePower(q.hi, x) * (1.0L + x * (q.lo / q.hi));
 }
 
 bool AllNormal(Extended a, Extended b, Extended c) {
@@ -269,7 +269,7 @@ Extended PoissonEq(Extended Mean, LongWord X) {
   const Extended root = std::exp(-StirlingError(x)) / std::sqrt(kTwoPi * x);
   // The power as the square of its half, which reaches twice as far.
   const Pair q = detail::Quotient(Pair{Mean}, Pair{x});
-  const Extended half = std::pow(q.hi, 0.5L * x);
+  const Extended half = detail::PrecisePower(q.hi, 0.5L * x);
   const Pair d = detail::ExactSum(x, -Mean);
   const Extended decay = std::exp(d.hi);
   const Extended partial = half * decay * root;

@@ -90,14 +90,14 @@ Extended BetaDensity(Extended x, Extended a, Extended b) {
 // asymptotic series, whose first neglected term is below 1e-21 of the result from 15 on.
 Extended StirlingError(Extended h) {
   static constexpr Extended kHalfSteps[30] = {
-      0.1534264097200273452913839L,  0.08106146679532725821967026L,
-      0.0548141210519176538961387L,  0.04134069595540929409382208L,
-      0.03316287351993628748511051L, 0.02767792568499833914878929L,
-      0.02374616365629749597133028L, 0.02079067210376509311152277L,
-      0.01848845053267318523077936L, 0.01664469118982119216319487L,
-      0.01513497322191737887351384L, 0.01387612882307074799874573L,
-      0.01281046524292022692425066L, 0.01189670994589177009505572L,
-      0.01110455975820691732663076L, 0.01041126526197209649747857L,
+      0.1534264097200273452913839L,   0.08106146679532725821967026L,
+      0.0548141210519176538961387L,   0.04134069595540929409382208L,
+      0.03316287351993628748511051L,  0.02767792568499833914878929L,
+      0.02374616365629749597133028L,  0.02079067210376509311152277L,
+      0.01848845053267318523077936L,  0.01664469118982119216319487L,
+      0.01513497322191737887351384L,  0.01387612882307074799874573L,
+      0.01281046524292022692425066L,  0.01189670994589177009505572L,
+      0.01110455975820691732663076L,  0.01041126526197209649747857L,
       0.009799416126158803298390373L, 0.009255462182712732917728637L,
       0.008768700134139385462955047L, 0.008330563433362871256469319L,
       0.007934114564314020547249562L, 0.007573675487951840794972024L,
@@ -111,9 +111,9 @@ Extended StirlingError(Extended h) {
     return LnGamma(h + 1) - (h + 0.5L) * std::log(h) + h - 0.5L * std::log(2 * QENPi);
   }
   // Bernoulli terms B(2k) / (2k (2k - 1) h^(2k - 1)), k = 1..9.
-  static constexpr Extended kTerms[9] = {1.0L / 12,         -1.0L / 360,        1.0L / 1260,
-                                         -1.0L / 1680,      1.0L / 1188,        -691.0L / 360360,
-                                         1.0L / 156,        -3617.0L / 122400,  43867.0L / 244188};
+  static constexpr Extended kTerms[9] = {1.0L / 12,    -1.0L / 360,       1.0L / 1260,
+                                         -1.0L / 1680, 1.0L / 1188,       -691.0L / 360360,
+                                         1.0L / 156,   -3617.0L / 122400, 43867.0L / 244188};
   const Extended r2 = 1 / (h * h);
   Extended sum = kTerms[8];
   for (int k = 7; k >= 0; --k) sum = kTerms[k] + sum * r2;
@@ -150,7 +150,8 @@ Extended Deviance(Extended x, Extended m) {
 Extended BinomialTerm(Extended k, Extended n, Extended p, Extended q) {
   if (p == 0) return k == 0 ? 1 : 0;
   if (q == 0) return k == n ? 1 : 0;
-  if (k == 0) return n == 0 ? 1 : std::exp(p < 0.1L ? -Deviance(n, n * q) - n * p : n * std::log(q));
+  if (k == 0)
+    return n == 0 ? 1 : std::exp(p < 0.1L ? -Deviance(n, n * q) - n * p : n * std::log(q));
   if (k == n) return std::exp(q < 0.1L ? -Deviance(n, n * p) - n * q : n * std::log(p));
   const Extended exponent = StirlingError(n) - StirlingError(k) - StirlingError(n - k) -
                             Deviance(k, n * p) - Deviance(n - k, n * q);

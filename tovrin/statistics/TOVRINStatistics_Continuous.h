@@ -84,8 +84,8 @@ void ChiSquarePDFValues(LongWord DF, Extended XLow, Extended XHigh, LongWord N,
 // FDistLess raises rsValueGZero for X <= 0 (or NaN) and rsDF for a zero DF. FDistPDF raises
 // rsDF, and rsValueGEZero for X < 0; it is evaluated as a binomial term in saddle-point form
 // (Stirling errors and deviances), so any degrees of freedom keep its relative error within a
-// few units in the last place times (1 + |ln f|). InvFDistLess raises rsValue01Inc for P outside [0, 1] and
-// rsDF; P = 1 gives 0. It brackets the root from [1e-16, 100] outwards and refines it by
+// few units in the last place times (1 + |ln f|). InvFDistLess raises rsValue01Inc for P outside
+// [0, 1] and rsDF; P = 1 gives 0. It brackets the root from [1e-16, 100] outwards and refines it by
 // Ridders' method until FDistLess is within QENTolerance of P; rsInvalidValue when no bracket
 // or no convergence is found (a bracket pushed below zero raises FDistLess's rsValueGZero).
 Extended FDistLess(Extended X, LongWord DF1, LongWord DF2);

@@ -43,6 +43,11 @@ struct BetaRoot {
 };
 BetaRoot InverseIncompleteBetaTails(Extended P, Extended Q, Extended A, Extended B);
 
+// X^A for X > 0, faster than pow and still well inside the precise family's bound: sqrt for
+// A = 1/2, exp(A ln X) while |A ln X| <= 8 (an error of about that many units in the last
+// place), pow beyond.
+Extended PrecisePower(Extended X, Extended A);
+
 // Stirling's remainder ln Gamma(X) - ((X - 1/2) ln X - X + ln(2 pi) / 2) for X > 0.
 Extended StirlingRemainder(Extended X);
 
