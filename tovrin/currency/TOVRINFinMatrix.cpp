@@ -69,204 +69,149 @@ TQENCurrencyMatrix CreateCurrencyIdentityMatrix(LongWord N) {
   return detail::CreateIdentityOf(N, Currency{detail::kMoneyScale<Currency>});
 }
 
-bool MatrixIsRectangular(const TQENCurrMatrix& M) { return detail::IsRectangularOf(M); }
-bool MatrixIsRectangular(const TQENLongCurrMatrix& M) { return detail::IsRectangularOf(M); }
-bool MatrixIsRectangular(const TQENCurrencyMatrix& M) { return detail::IsRectangularOf(M); }
+template <detail::MoneyElement T>
+bool MatrixIsRectangular(const detail::MatrixOf<T>& M) {
+  return detail::IsRectangularOf(M);
+}
 
-void MatrixDimensions(const TQENCurrMatrix& M, LongWord& Rows, LongWord& Cols, bool& Rectangular) {
-  DimensionsOf(M, Rows, Cols, Rectangular);
-}
-void MatrixDimensions(const TQENLongCurrMatrix& M, LongWord& Rows, LongWord& Cols,
-                      bool& Rectangular) {
-  DimensionsOf(M, Rows, Cols, Rectangular);
-}
-void MatrixDimensions(const TQENCurrencyMatrix& M, LongWord& Rows, LongWord& Cols,
+template <detail::MoneyElement T>
+void MatrixDimensions(const detail::MatrixOf<T>& M, LongWord& Rows, LongWord& Cols,
                       bool& Rectangular) {
   DimensionsOf(M, Rows, Cols, Rectangular);
 }
 
-bool MatrixIsSquare(const TQENCurrMatrix& M) { return detail::IsSquareOf(M); }
-bool MatrixIsSquare(const TQENLongCurrMatrix& M) { return detail::IsSquareOf(M); }
-bool MatrixIsSquare(const TQENCurrencyMatrix& M) { return detail::IsSquareOf(M); }
+template <detail::MoneyElement T>
+bool MatrixIsSquare(const detail::MatrixOf<T>& M) {
+  return detail::IsSquareOf(M);
+}
 
-bool MatricesSameDimensions(const TQENCurrMatrix& M1, const TQENCurrMatrix& M2) {
-  return detail::SameDimensionsOf(M1, M2);
-}
-bool MatricesSameDimensions(const TQENLongCurrMatrix& M1, const TQENLongCurrMatrix& M2) {
-  return detail::SameDimensionsOf(M1, M2);
-}
-bool MatricesSameDimensions(const TQENCurrencyMatrix& M1, const TQENCurrencyMatrix& M2) {
+template <detail::MoneyElement T>
+bool MatricesSameDimensions(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
   return detail::SameDimensionsOf(M1, M2);
 }
 
-TQENFloatMatrix Matrix2FloatMatrix(const TQENCurrMatrix& M) {
-  return detail::ConvertMatrixOf<PackedExtended>(M, [](auto x) { return FloatOf(x); });
-}
-TQENFloatMatrix Matrix2FloatMatrix(const TQENLongCurrMatrix& M) {
-  return detail::ConvertMatrixOf<PackedExtended>(M, [](auto x) { return FloatOf(x); });
-}
-TQENFloatMatrix Matrix2FloatMatrix(const TQENCurrencyMatrix& M) {
+template <detail::MoneyElement T>
+TQENFloatMatrix Matrix2FloatMatrix(const detail::MatrixOf<T>& M) {
   return detail::ConvertMatrixOf<PackedExtended>(M, [](auto x) { return FloatOf(x); });
 }
 
-TQENCurrMatrix AddMatrices(const TQENCurrMatrix& M1, const TQENCurrMatrix& M2) {
-  return detail::CombineMatrices(M1, M2, &MoneyRules<TQENCurrency>::Add);
-}
-TQENLongCurrMatrix AddMatrices(const TQENLongCurrMatrix& M1, const TQENLongCurrMatrix& M2) {
-  return detail::CombineMatrices(M1, M2, &MoneyRules<TQENLongCurrency>::Add);
-}
-TQENCurrencyMatrix AddMatrices(const TQENCurrencyMatrix& M1, const TQENCurrencyMatrix& M2) {
-  return detail::CombineMatrices(M1, M2, &MoneyRules<Currency>::Add);
+template <detail::MoneyElement T>
+detail::MatrixOf<T> AddMatrices(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
+  return detail::CombineMatrices(M1, M2, &MoneyRules<T>::Add);
 }
 
-void AddToMatrix(TQENCurrMatrix& M1, const TQENCurrMatrix& M2) {
-  detail::CombineIntoMatrix(M1, M2, &MoneyRules<TQENCurrency>::Add);
-}
-void AddToMatrix(TQENLongCurrMatrix& M1, const TQENLongCurrMatrix& M2) {
-  detail::CombineIntoMatrix(M1, M2, &MoneyRules<TQENLongCurrency>::Add);
-}
-void AddToMatrix(TQENCurrencyMatrix& M1, const TQENCurrencyMatrix& M2) {
-  detail::CombineIntoMatrix(M1, M2, &MoneyRules<Currency>::Add);
+template <detail::MoneyElement T>
+void AddToMatrix(detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
+  detail::CombineIntoMatrix(M1, M2, &MoneyRules<T>::Add);
 }
 
-TQENCurrMatrix SubtractMatrices(const TQENCurrMatrix& M1, const TQENCurrMatrix& M2) {
-  return detail::CombineMatrices(M1, M2, &MoneyRules<TQENCurrency>::Sub);
-}
-TQENLongCurrMatrix SubtractMatrices(const TQENLongCurrMatrix& M1, const TQENLongCurrMatrix& M2) {
-  return detail::CombineMatrices(M1, M2, &MoneyRules<TQENLongCurrency>::Sub);
-}
-TQENCurrencyMatrix SubtractMatrices(const TQENCurrencyMatrix& M1, const TQENCurrencyMatrix& M2) {
-  return detail::CombineMatrices(M1, M2, &MoneyRules<Currency>::Sub);
+template <detail::MoneyElement T>
+detail::MatrixOf<T> SubtractMatrices(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
+  return detail::CombineMatrices(M1, M2, &MoneyRules<T>::Sub);
 }
 
-void SubtractFromMatrix(TQENCurrMatrix& M1, const TQENCurrMatrix& M2) {
-  detail::CombineIntoMatrix(M1, M2, &MoneyRules<TQENCurrency>::Sub);
-}
-void SubtractFromMatrix(TQENLongCurrMatrix& M1, const TQENLongCurrMatrix& M2) {
-  detail::CombineIntoMatrix(M1, M2, &MoneyRules<TQENLongCurrency>::Sub);
-}
-void SubtractFromMatrix(TQENCurrencyMatrix& M1, const TQENCurrencyMatrix& M2) {
-  detail::CombineIntoMatrix(M1, M2, &MoneyRules<Currency>::Sub);
+template <detail::MoneyElement T>
+void SubtractFromMatrix(detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
+  detail::CombineIntoMatrix(M1, M2, &MoneyRules<T>::Sub);
 }
 
-TQENCurrMatrix MultiplyMatrixByConst(const TQENCurrMatrix& M, Extended K) { return ScaledOf(M, K); }
-TQENLongCurrMatrix MultiplyMatrixByConst(const TQENLongCurrMatrix& M, Extended K) {
-  return ScaledOf(M, K);
-}
-TQENCurrencyMatrix MultiplyMatrixByConst(const TQENCurrencyMatrix& M, Extended K) {
+template <detail::MoneyElement T>
+detail::MatrixOf<T> MultiplyMatrixByConst(const detail::MatrixOf<T>& M, Extended K) {
   return ScaledOf(M, K);
 }
 
-void MultiplyMatrixByConst2(TQENCurrMatrix& M, Extended K) { ScaleInPlace(M, K); }
-void MultiplyMatrixByConst2(TQENLongCurrMatrix& M, Extended K) { ScaleInPlace(M, K); }
-void MultiplyMatrixByConst2(TQENCurrencyMatrix& M, Extended K) { ScaleInPlace(M, K); }
+template <detail::MoneyElement T>
+void MultiplyMatrixByConst2(detail::MatrixOf<T>& M, Extended K) {
+  ScaleInPlace(M, K);
+}
 
-void LinearTransformMatrix(TQENCurrMatrix& M, Extended A, Extended B) {
-  LinearTransformOf(M, A, B);
-}
-void LinearTransformMatrix(TQENLongCurrMatrix& M, Extended A, Extended B) {
-  LinearTransformOf(M, A, B);
-}
-void LinearTransformMatrix(TQENCurrencyMatrix& M, Extended A, Extended B) {
+template <detail::MoneyElement T>
+void LinearTransformMatrix(detail::MatrixOf<T>& M, Extended A, Extended B) {
   LinearTransformOf(M, A, B);
 }
 
-TQENCurrency GrandMean(const TQENCurrMatrix& M, LongWord& N) { return GrandMeanOf(M, N); }
-TQENLongCurrency GrandMean(const TQENLongCurrMatrix& M, LongWord& N) { return GrandMeanOf(M, N); }
-Currency GrandMean(const TQENCurrencyMatrix& M, LongWord& N) { return GrandMeanOf(M, N); }
+template <detail::MoneyElement T>
+T GrandMean(const detail::MatrixOf<T>& M, LongWord& N) {
+  return GrandMeanOf(M, N);
+}
 
-void SwapMatrixRows(TQENCurrMatrix& M, LongWord Row1, LongWord Row2) {
-  detail::SwapRowsOf(M, Row1, Row2);
-}
-void SwapMatrixRows(TQENLongCurrMatrix& M, LongWord Row1, LongWord Row2) {
-  detail::SwapRowsOf(M, Row1, Row2);
-}
-void SwapMatrixRows(TQENCurrencyMatrix& M, LongWord Row1, LongWord Row2) {
+template <detail::MoneyElement T>
+void SwapMatrixRows(detail::MatrixOf<T>& M, LongWord Row1, LongWord Row2) {
   detail::SwapRowsOf(M, Row1, Row2);
 }
 
-void SwapMatrixCols(TQENCurrMatrix& M, LongWord Col1, LongWord Col2) {
-  detail::SwapColsOf(M, Col1, Col2);
-}
-void SwapMatrixCols(TQENLongCurrMatrix& M, LongWord Col1, LongWord Col2) {
-  detail::SwapColsOf(M, Col1, Col2);
-}
-void SwapMatrixCols(TQENCurrencyMatrix& M, LongWord Col1, LongWord Col2) {
+template <detail::MoneyElement T>
+void SwapMatrixCols(detail::MatrixOf<T>& M, LongWord Col1, LongWord Col2) {
   detail::SwapColsOf(M, Col1, Col2);
 }
 
-void QSortMatrixRowsOnCol(TQENCurrMatrix& M, LongWord Col, bool Ascending) {
-  detail::QSortRowsOnColOf(M, Col, Ascending);
-}
-void QSortMatrixRowsOnCol(TQENLongCurrMatrix& M, LongWord Col, bool Ascending) {
-  detail::QSortRowsOnColOf(M, Col, Ascending);
-}
-void QSortMatrixRowsOnCol(TQENCurrencyMatrix& M, LongWord Col, bool Ascending) {
+template <detail::MoneyElement T>
+void QSortMatrixRowsOnCol(detail::MatrixOf<T>& M, LongWord Col, bool Ascending) {
   detail::QSortRowsOnColOf(M, Col, Ascending);
 }
 
-void QSortMatrixColsOnRow(TQENCurrMatrix& M, LongWord Row, bool Ascending) {
-  detail::QSortColsOnRowOf(M, Row, Ascending);
-}
-void QSortMatrixColsOnRow(TQENLongCurrMatrix& M, LongWord Row, bool Ascending) {
-  detail::QSortColsOnRowOf(M, Row, Ascending);
-}
-void QSortMatrixColsOnRow(TQENCurrencyMatrix& M, LongWord Row, bool Ascending) {
+template <detail::MoneyElement T>
+void QSortMatrixColsOnRow(detail::MatrixOf<T>& M, LongWord Row, bool Ascending) {
   detail::QSortColsOnRowOf(M, Row, Ascending);
 }
 
-TQENCurrVector ExtractMatrixRow(const TQENCurrMatrix& M, LongWord Row) {
-  return detail::ExtractRowOf(M, Row);
-}
-TQENLongCurrVector ExtractMatrixRow(const TQENLongCurrMatrix& M, LongWord Row) {
-  return detail::ExtractRowOf(M, Row);
-}
-TQENCurrencyVector ExtractMatrixRow(const TQENCurrencyMatrix& M, LongWord Row) {
+template <detail::MoneyElement T>
+std::vector<T> ExtractMatrixRow(const detail::MatrixOf<T>& M, LongWord Row) {
   return detail::ExtractRowOf(M, Row);
 }
 
-TQENCurrVector ExtractMatrixCol(const TQENCurrMatrix& M, LongWord Col) {
-  return detail::ExtractColOf(M, Col);
-}
-TQENLongCurrVector ExtractMatrixCol(const TQENLongCurrMatrix& M, LongWord Col) {
-  return detail::ExtractColOf(M, Col);
-}
-TQENCurrencyVector ExtractMatrixCol(const TQENCurrencyMatrix& M, LongWord Col) {
+template <detail::MoneyElement T>
+std::vector<T> ExtractMatrixCol(const detail::MatrixOf<T>& M, LongWord Col) {
   return detail::ExtractColOf(M, Col);
 }
 
-void OverwriteMatrixRow(TQENCurrMatrix& M, LongWord Row, const TQENCurrVector& V,
-                        TQENCurrency Fill) {
-  detail::OverwriteRowOf(M, Row, V, Fill);
-}
-void OverwriteMatrixRow(TQENLongCurrMatrix& M, LongWord Row, const TQENLongCurrVector& V,
-                        TQENLongCurrency Fill) {
-  detail::OverwriteRowOf(M, Row, V, Fill);
-}
-void OverwriteMatrixRow(TQENCurrencyMatrix& M, LongWord Row, const TQENCurrencyVector& V,
-                        Currency Fill) {
+template <detail::MoneyElement T>
+void OverwriteMatrixRow(detail::MatrixOf<T>& M, LongWord Row, const std::vector<T>& V, T Fill) {
   detail::OverwriteRowOf(M, Row, V, Fill);
 }
 
-void OverwriteMatrixCol(TQENCurrMatrix& M, LongWord Col, const TQENCurrVector& V,
-                        TQENCurrency Fill) {
-  detail::OverwriteColOf(M, Col, V, Fill);
-}
-void OverwriteMatrixCol(TQENLongCurrMatrix& M, LongWord Col, const TQENLongCurrVector& V,
-                        TQENLongCurrency Fill) {
-  detail::OverwriteColOf(M, Col, V, Fill);
-}
-void OverwriteMatrixCol(TQENCurrencyMatrix& M, LongWord Col, const TQENCurrencyVector& V,
-                        Currency Fill) {
+template <detail::MoneyElement T>
+void OverwriteMatrixCol(detail::MatrixOf<T>& M, LongWord Col, const std::vector<T>& V, T Fill) {
   detail::OverwriteColOf(M, Col, V, Fill);
 }
 
-TQENCurrMatrix CopyMatrix(const TQENCurrMatrix& M) { return detail::CopyMatrixOf(M); }
-TQENLongCurrMatrix CopyMatrix(const TQENLongCurrMatrix& M) { return detail::CopyMatrixOf(M); }
-TQENCurrencyMatrix CopyMatrix(const TQENCurrencyMatrix& M) { return detail::CopyMatrixOf(M); }
+template <detail::MoneyElement T>
+detail::MatrixOf<T> CopyMatrix(const detail::MatrixOf<T>& M) {
+  return detail::CopyMatrixOf(M);
+}
 
-TQENCurrMatrix TransposeMatrix(const TQENCurrMatrix& M) { return detail::TransposeOf(M); }
-TQENLongCurrMatrix TransposeMatrix(const TQENLongCurrMatrix& M) { return detail::TransposeOf(M); }
-TQENCurrencyMatrix TransposeMatrix(const TQENCurrencyMatrix& M) { return detail::TransposeOf(M); }
+template <detail::MoneyElement T>
+detail::MatrixOf<T> TransposeMatrix(const detail::MatrixOf<T>& M) {
+  return detail::TransposeOf(M);
+}
+
+using detail::MatrixOf;
+
+#define TOVRIN_INSTANTIATE(T)                                                         \
+  template bool MatrixIsRectangular(const MatrixOf<T>&);                              \
+  template void MatrixDimensions(const MatrixOf<T>&, LongWord&, LongWord&, bool&);    \
+  template bool MatrixIsSquare(const MatrixOf<T>&);                                   \
+  template bool MatricesSameDimensions(const MatrixOf<T>&, const MatrixOf<T>&);       \
+  template TQENFloatMatrix Matrix2FloatMatrix(const MatrixOf<T>&);                    \
+  template MatrixOf<T> AddMatrices(const MatrixOf<T>&, const MatrixOf<T>&);           \
+  template void AddToMatrix(MatrixOf<T>&, const MatrixOf<T>&);                        \
+  template MatrixOf<T> SubtractMatrices(const MatrixOf<T>&, const MatrixOf<T>&);      \
+  template void SubtractFromMatrix(MatrixOf<T>&, const MatrixOf<T>&);                 \
+  template MatrixOf<T> MultiplyMatrixByConst(const MatrixOf<T>&, Extended);           \
+  template void MultiplyMatrixByConst2(MatrixOf<T>&, Extended);                       \
+  template void LinearTransformMatrix(MatrixOf<T>&, Extended, Extended);              \
+  template T GrandMean(const MatrixOf<T>&, LongWord&);                                \
+  template void SwapMatrixRows(MatrixOf<T>&, LongWord, LongWord);                     \
+  template void SwapMatrixCols(MatrixOf<T>&, LongWord, LongWord);                     \
+  template void QSortMatrixRowsOnCol(MatrixOf<T>&, LongWord, bool);                   \
+  template void QSortMatrixColsOnRow(MatrixOf<T>&, LongWord, bool);                   \
+  template std::vector<T> ExtractMatrixRow(const MatrixOf<T>&, LongWord);             \
+  template std::vector<T> ExtractMatrixCol(const MatrixOf<T>&, LongWord);             \
+  template void OverwriteMatrixRow(MatrixOf<T>&, LongWord, const std::vector<T>&, T); \
+  template void OverwriteMatrixCol(MatrixOf<T>&, LongWord, const std::vector<T>&, T); \
+  template MatrixOf<T> CopyMatrix(const MatrixOf<T>&);                                \
+  template MatrixOf<T> TransposeMatrix(const MatrixOf<T>&);
+TOVRIN_MONEY_ELEMENTS(TOVRIN_INSTANTIATE)
+#undef TOVRIN_INSTANTIATE
 
 }  // namespace tovrin

@@ -46,241 +46,145 @@ PackedExtended FloatOf(Currency x) { return Currency2Float(x); }
 
 }  // namespace
 
-void AppendValue2Vector(TQENCurrVector& V, TQENCurrency Value) { detail::AppendElement(V, Value); }
-void AppendValue2Vector(TQENLongCurrVector& V, TQENLongCurrency Value) {
+template <detail::MoneyElement T>
+void AppendValue2Vector(std::vector<T>& V, T Value) {
   detail::AppendElement(V, Value);
 }
-void AppendValue2Vector(TQENCurrencyVector& V, Currency Value) { detail::AppendElement(V, Value); }
 
-void AddValue2Vector(TQENCurrVector& V, TQENCurrency Value, LongInt Index) {
-  detail::InsertElement(V, Value, Index);
-}
-void AddValue2Vector(TQENLongCurrVector& V, TQENLongCurrency Value, LongInt Index) {
-  detail::InsertElement(V, Value, Index);
-}
-void AddValue2Vector(TQENCurrencyVector& V, Currency Value, LongInt Index) {
+template <detail::MoneyElement T>
+void AddValue2Vector(std::vector<T>& V, T Value, LongInt Index) {
   detail::InsertElement(V, Value, Index);
 }
 
-void DeleteValueFromVector(TQENCurrVector& V, LongInt Index) { detail::DeleteElement(V, Index); }
-void DeleteValueFromVector(TQENLongCurrVector& V, LongInt Index) {
-  detail::DeleteElement(V, Index);
-}
-void DeleteValueFromVector(TQENCurrencyVector& V, LongInt Index) {
+template <detail::MoneyElement T>
+void DeleteValueFromVector(std::vector<T>& V, LongInt Index) {
   detail::DeleteElement(V, Index);
 }
 
-TQENCurrency MaxVector(const TQENCurrVector& V) { return detail::LargestElement(V); }
-TQENLongCurrency MaxVector(const TQENLongCurrVector& V) { return detail::LargestElement(V); }
-Currency MaxVector(const TQENCurrencyVector& V) { return detail::LargestElement(V); }
-
-TQENCurrency MinVector(const TQENCurrVector& V) { return detail::SmallestElement(V); }
-TQENLongCurrency MinVector(const TQENLongCurrVector& V) { return detail::SmallestElement(V); }
-Currency MinVector(const TQENCurrencyVector& V) { return detail::SmallestElement(V); }
-
-void MinMaxVector(const TQENCurrVector& V, TQENCurrency& MinValue, TQENCurrency& MaxValue,
-                  LongWord& MinIndex, LongWord& MaxIndex, bool& MinUnique, bool& MaxUnique) {
-  detail::Extremes(V, MinValue, MaxValue, MinIndex, MaxIndex, MinUnique, MaxUnique);
+template <detail::MoneyElement T>
+T MaxVector(const std::vector<T>& V) {
+  return detail::LargestElement(V);
 }
-void MinMaxVector(const TQENLongCurrVector& V, TQENLongCurrency& MinValue,
-                  TQENLongCurrency& MaxValue, LongWord& MinIndex, LongWord& MaxIndex,
-                  bool& MinUnique, bool& MaxUnique) {
-  detail::Extremes(V, MinValue, MaxValue, MinIndex, MaxIndex, MinUnique, MaxUnique);
+
+template <detail::MoneyElement T>
+T MinVector(const std::vector<T>& V) {
+  return detail::SmallestElement(V);
 }
-void MinMaxVector(const TQENCurrencyVector& V, Currency& MinValue, Currency& MaxValue,
-                  LongWord& MinIndex, LongWord& MaxIndex, bool& MinUnique, bool& MaxUnique) {
+
+template <detail::MoneyElement T>
+void MinMaxVector(const std::vector<T>& V, T& MinValue, T& MaxValue, LongWord& MinIndex,
+                  LongWord& MaxIndex, bool& MinUnique, bool& MaxUnique) {
   detail::Extremes(V, MinValue, MaxValue, MinIndex, MaxIndex, MinUnique, MaxUnique);
 }
 
-TQENCurrency SumVector(const TQENCurrVector& V) { return SumOf(V); }
-TQENLongCurrency SumVector(const TQENLongCurrVector& V) { return SumOf(V); }
-Currency SumVector(const TQENCurrencyVector& V) { return SumOf(V); }
-
-bool VectorNonNegative(const TQENCurrVector& V) {
-  using R = MoneyRules<TQENCurrency>;
-  return detail::EveryElement(V, [](TQENCurrency x) { return !R::IsNegative(x); });
-}
-bool VectorNonNegative(const TQENLongCurrVector& V) {
-  using R = MoneyRules<TQENLongCurrency>;
-  return detail::EveryElement(V, [](TQENLongCurrency x) { return !R::IsNegative(x); });
-}
-bool VectorNonNegative(const TQENCurrencyVector& V) {
-  using R = MoneyRules<Currency>;
-  return detail::EveryElement(V, [](Currency x) { return !R::IsNegative(x); });
+template <detail::MoneyElement T>
+T SumVector(const std::vector<T>& V) {
+  return SumOf(V);
 }
 
-bool VectorNegative(const TQENCurrVector& V) {
-  using R = MoneyRules<TQENCurrency>;
-  return detail::EveryElement(V, [](TQENCurrency x) { return R::IsNegative(x); });
-}
-bool VectorNegative(const TQENLongCurrVector& V) {
-  using R = MoneyRules<TQENLongCurrency>;
-  return detail::EveryElement(V, [](TQENLongCurrency x) { return R::IsNegative(x); });
-}
-bool VectorNegative(const TQENCurrencyVector& V) {
-  using R = MoneyRules<Currency>;
-  return detail::EveryElement(V, [](Currency x) { return R::IsNegative(x); });
+template <detail::MoneyElement T>
+bool VectorNonNegative(const std::vector<T>& V) {
+  using R = MoneyRules<T>;
+  return detail::EveryElement(V, [](T x) { return !R::IsNegative(x); });
 }
 
-bool VectorNonPositive(const TQENCurrVector& V) {
-  using R = MoneyRules<TQENCurrency>;
-  return detail::EveryElement(V, [](TQENCurrency x) { return !R::IsPositive(x); });
-}
-bool VectorNonPositive(const TQENLongCurrVector& V) {
-  using R = MoneyRules<TQENLongCurrency>;
-  return detail::EveryElement(V, [](TQENLongCurrency x) { return !R::IsPositive(x); });
-}
-bool VectorNonPositive(const TQENCurrencyVector& V) {
-  using R = MoneyRules<Currency>;
-  return detail::EveryElement(V, [](Currency x) { return !R::IsPositive(x); });
+template <detail::MoneyElement T>
+bool VectorNegative(const std::vector<T>& V) {
+  using R = MoneyRules<T>;
+  return detail::EveryElement(V, [](T x) { return R::IsNegative(x); });
 }
 
-bool VectorNonZero(const TQENCurrVector& V) {
-  using R = MoneyRules<TQENCurrency>;
-  return detail::EveryElement(V, [](TQENCurrency x) { return !R::IsZero(x); });
-}
-bool VectorNonZero(const TQENLongCurrVector& V) {
-  using R = MoneyRules<TQENLongCurrency>;
-  return detail::EveryElement(V, [](TQENLongCurrency x) { return !R::IsZero(x); });
-}
-bool VectorNonZero(const TQENCurrencyVector& V) {
-  using R = MoneyRules<Currency>;
-  return detail::EveryElement(V, [](Currency x) { return !R::IsZero(x); });
+template <detail::MoneyElement T>
+bool VectorNonPositive(const std::vector<T>& V) {
+  using R = MoneyRules<T>;
+  return detail::EveryElement(V, [](T x) { return !R::IsPositive(x); });
 }
 
-bool VectorZero(const TQENCurrVector& V) {
-  using R = MoneyRules<TQENCurrency>;
-  return detail::EveryElement(V, [](TQENCurrency x) { return R::IsZero(x); });
-}
-bool VectorZero(const TQENLongCurrVector& V) {
-  using R = MoneyRules<TQENLongCurrency>;
-  return detail::EveryElement(V, [](TQENLongCurrency x) { return R::IsZero(x); });
-}
-bool VectorZero(const TQENCurrencyVector& V) {
-  using R = MoneyRules<Currency>;
-  return detail::EveryElement(V, [](Currency x) { return R::IsZero(x); });
+template <detail::MoneyElement T>
+bool VectorNonZero(const std::vector<T>& V) {
+  using R = MoneyRules<T>;
+  return detail::EveryElement(V, [](T x) { return !R::IsZero(x); });
 }
 
-bool VectorPositive(const TQENCurrVector& V) {
-  using R = MoneyRules<TQENCurrency>;
-  return detail::EveryElement(V, [](TQENCurrency x) { return R::IsPositive(x); });
-}
-bool VectorPositive(const TQENLongCurrVector& V) {
-  using R = MoneyRules<TQENLongCurrency>;
-  return detail::EveryElement(V, [](TQENLongCurrency x) { return R::IsPositive(x); });
-}
-bool VectorPositive(const TQENCurrencyVector& V) {
-  using R = MoneyRules<Currency>;
-  return detail::EveryElement(V, [](Currency x) { return R::IsPositive(x); });
+template <detail::MoneyElement T>
+bool VectorZero(const std::vector<T>& V) {
+  using R = MoneyRules<T>;
+  return detail::EveryElement(V, [](T x) { return R::IsZero(x); });
 }
 
-void QSortVector(TQENCurrVector& V, bool Ascending) { detail::QuickSortVector(V, Ascending); }
-void QSortVector(TQENLongCurrVector& V, bool Ascending) { detail::QuickSortVector(V, Ascending); }
-void QSortVector(TQENCurrencyVector& V, bool Ascending) { detail::QuickSortVector(V, Ascending); }
+template <detail::MoneyElement T>
+bool VectorPositive(const std::vector<T>& V) {
+  using R = MoneyRules<T>;
+  return detail::EveryElement(V, [](T x) { return R::IsPositive(x); });
+}
 
-void LinearTransformVector(TQENCurrVector& V, Extended A, Extended B) {
-  LinearTransformOf(V, A, B);
+template <detail::MoneyElement T>
+void QSortVector(std::vector<T>& V, bool Ascending) {
+  detail::QuickSortVector(V, Ascending);
 }
-void LinearTransformVector(TQENLongCurrVector& V, Extended A, Extended B) {
-  LinearTransformOf(V, A, B);
-}
-void LinearTransformVector(TQENCurrencyVector& V, Extended A, Extended B) {
+
+template <detail::MoneyElement T>
+void LinearTransformVector(std::vector<T>& V, Extended A, Extended B) {
   LinearTransformOf(V, A, B);
 }
 
-TQENFloatVector Vector2FloatVector(const TQENCurrVector& V) {
-  return ConvertedOf<PackedExtended>(V, [](auto x) { return FloatOf(x); });
-}
-TQENFloatVector Vector2FloatVector(const TQENLongCurrVector& V) {
-  return ConvertedOf<PackedExtended>(V, [](auto x) { return FloatOf(x); });
-}
-TQENFloatVector Vector2FloatVector(const TQENCurrencyVector& V) {
+template <detail::MoneyElement T>
+TQENFloatVector Vector2FloatVector(const std::vector<T>& V) {
   return ConvertedOf<PackedExtended>(V, [](auto x) { return FloatOf(x); });
 }
 
-TQENCurrVector AddVectors(const TQENCurrVector& V1, const TQENCurrVector& V2) {
-  return detail::Combined(V1, V2, &MoneyRules<TQENCurrency>::Add);
-}
-TQENLongCurrVector AddVectors(const TQENLongCurrVector& V1, const TQENLongCurrVector& V2) {
-  return detail::Combined(V1, V2, &MoneyRules<TQENLongCurrency>::Add);
-}
-TQENCurrencyVector AddVectors(const TQENCurrencyVector& V1, const TQENCurrencyVector& V2) {
-  return detail::Combined(V1, V2, &MoneyRules<Currency>::Add);
+template <detail::MoneyElement T>
+std::vector<T> AddVectors(const std::vector<T>& V1, const std::vector<T>& V2) {
+  return detail::Combined(V1, V2, &MoneyRules<T>::Add);
 }
 
-void AddToVector(TQENCurrVector& V1, const TQENCurrVector& V2) {
-  detail::CombineInto(V1, V2, &MoneyRules<TQENCurrency>::Add);
-}
-void AddToVector(TQENLongCurrVector& V1, const TQENLongCurrVector& V2) {
-  detail::CombineInto(V1, V2, &MoneyRules<TQENLongCurrency>::Add);
-}
-void AddToVector(TQENCurrencyVector& V1, const TQENCurrencyVector& V2) {
-  detail::CombineInto(V1, V2, &MoneyRules<Currency>::Add);
+template <detail::MoneyElement T>
+void AddToVector(std::vector<T>& V1, const std::vector<T>& V2) {
+  detail::CombineInto(V1, V2, &MoneyRules<T>::Add);
 }
 
-TQENCurrVector SubtractVectors(const TQENCurrVector& V1, const TQENCurrVector& V2) {
-  return detail::Combined(V1, V2, &MoneyRules<TQENCurrency>::Sub);
-}
-TQENLongCurrVector SubtractVectors(const TQENLongCurrVector& V1, const TQENLongCurrVector& V2) {
-  return detail::Combined(V1, V2, &MoneyRules<TQENLongCurrency>::Sub);
-}
-TQENCurrencyVector SubtractVectors(const TQENCurrencyVector& V1, const TQENCurrencyVector& V2) {
-  return detail::Combined(V1, V2, &MoneyRules<Currency>::Sub);
+template <detail::MoneyElement T>
+std::vector<T> SubtractVectors(const std::vector<T>& V1, const std::vector<T>& V2) {
+  return detail::Combined(V1, V2, &MoneyRules<T>::Sub);
 }
 
-void SubtractFromVector(TQENCurrVector& V1, const TQENCurrVector& V2) {
-  detail::CombineInto(V1, V2, &MoneyRules<TQENCurrency>::Sub);
-}
-void SubtractFromVector(TQENLongCurrVector& V1, const TQENLongCurrVector& V2) {
-  detail::CombineInto(V1, V2, &MoneyRules<TQENLongCurrency>::Sub);
-}
-void SubtractFromVector(TQENCurrencyVector& V1, const TQENCurrencyVector& V2) {
-  detail::CombineInto(V1, V2, &MoneyRules<Currency>::Sub);
+template <detail::MoneyElement T>
+void SubtractFromVector(std::vector<T>& V1, const std::vector<T>& V2) {
+  detail::CombineInto(V1, V2, &MoneyRules<T>::Sub);
 }
 
-void FillVector(TQENCurrVector& V, TQENCurrency Value) { detail::FillElements(V, Value); }
-void FillVector(TQENLongCurrVector& V, TQENLongCurrency Value) { detail::FillElements(V, Value); }
-void FillVector(TQENCurrencyVector& V, Currency Value) { detail::FillElements(V, Value); }
-
-void ClearVector(TQENCurrVector& V) { detail::ClearElements(V); }
-void ClearVector(TQENLongCurrVector& V) { detail::ClearElements(V); }
-void ClearVector(TQENCurrencyVector& V) { detail::ClearElements(V); }
-
-TQENCurrVector ReverseVector(const TQENCurrVector& V) { return detail::Reversed(V); }
-TQENLongCurrVector ReverseVector(const TQENLongCurrVector& V) { return detail::Reversed(V); }
-TQENCurrencyVector ReverseVector(const TQENCurrencyVector& V) { return detail::Reversed(V); }
-
-TQENCurrVector CopyVector(const TQENCurrVector& V) { return detail::CopyOf(V); }
-TQENLongCurrVector CopyVector(const TQENLongCurrVector& V) { return detail::CopyOf(V); }
-TQENCurrencyVector CopyVector(const TQENCurrencyVector& V) { return detail::CopyOf(V); }
-
-TQENLIntVector Vector2RankVector(const TQENCurrVector& V, bool Ascending) {
-  return detail::RankVector(V, Ascending, detail::MoneyRankEquals{});
+template <detail::MoneyElement T>
+void FillVector(std::vector<T>& V, T Value) {
+  detail::FillElements(V, Value);
 }
-TQENLIntVector Vector2RankVector(const TQENLongCurrVector& V, bool Ascending) {
-  return detail::RankVector(V, Ascending, detail::MoneyRankEquals{});
+
+template <detail::MoneyElement T>
+void ClearVector(std::vector<T>& V) {
+  detail::ClearElements(V);
 }
-TQENLIntVector Vector2RankVector(const TQENCurrencyVector& V, bool Ascending) {
+
+template <detail::MoneyElement T>
+std::vector<T> ReverseVector(const std::vector<T>& V) {
+  return detail::Reversed(V);
+}
+
+template <detail::MoneyElement T>
+std::vector<T> CopyVector(const std::vector<T>& V) {
+  return detail::CopyOf(V);
+}
+
+template <detail::MoneyElement T>
+TQENLIntVector Vector2RankVector(const std::vector<T>& V, bool Ascending) {
   return detail::RankVector(V, Ascending, detail::MoneyRankEquals{});
 }
 
-LongInt Vector2Rank(const TQENCurrVector& V, LongWord Index, bool Ascending) {
-  return detail::RankOfElement(V, Index, Ascending, detail::MoneyRankEquals{});
-}
-LongInt Vector2Rank(const TQENLongCurrVector& V, LongWord Index, bool Ascending) {
-  return detail::RankOfElement(V, Index, Ascending, detail::MoneyRankEquals{});
-}
-LongInt Vector2Rank(const TQENCurrencyVector& V, LongWord Index, bool Ascending) {
+template <detail::MoneyElement T>
+LongInt Vector2Rank(const std::vector<T>& V, LongWord Index, bool Ascending) {
   return detail::RankOfElement(V, Index, Ascending, detail::MoneyRankEquals{});
 }
 
-LongInt Vector2RankValue(const TQENCurrVector& V, TQENCurrency Value, bool Ascending) {
-  return detail::RankOfValue(V, Value, Ascending, detail::MoneyRankEquals{});
-}
-LongInt Vector2RankValue(const TQENLongCurrVector& V, TQENLongCurrency Value, bool Ascending) {
-  return detail::RankOfValue(V, Value, Ascending, detail::MoneyRankEquals{});
-}
-LongInt Vector2RankValue(const TQENCurrencyVector& V, Currency Value, bool Ascending) {
+template <detail::MoneyElement T>
+LongInt Vector2RankValue(const std::vector<T>& V, T Value, bool Ascending) {
   return detail::RankOfValue(V, Value, Ascending, detail::MoneyRankEquals{});
 }
 
@@ -322,5 +226,38 @@ TQENCurrencyVector Vector2QENCurrencyVector(const TQENCurrencyVector& V) {
 TQENCurrencyVector Vector2QENCurrencyVector(const TQENFloatVector& V) {
   return ConvertedOf<Currency>(V, CurrencyFromFloat);
 }
+
+using detail::MatrixOf;
+
+#define TOVRIN_INSTANTIATE(T)                                                                    \
+  template void AppendValue2Vector(std::vector<T>&, T);                                          \
+  template void AddValue2Vector(std::vector<T>&, T, LongInt);                                    \
+  template void DeleteValueFromVector(std::vector<T>&, LongInt);                                 \
+  template T MaxVector(const std::vector<T>&);                                                   \
+  template T MinVector(const std::vector<T>&);                                                   \
+  template void MinMaxVector(const std::vector<T>&, T&, T&, LongWord&, LongWord&, bool&, bool&); \
+  template T SumVector(const std::vector<T>&);                                                   \
+  template bool VectorNonNegative(const std::vector<T>&);                                        \
+  template bool VectorNegative(const std::vector<T>&);                                           \
+  template bool VectorNonPositive(const std::vector<T>&);                                        \
+  template bool VectorNonZero(const std::vector<T>&);                                            \
+  template bool VectorZero(const std::vector<T>&);                                               \
+  template bool VectorPositive(const std::vector<T>&);                                           \
+  template void QSortVector(std::vector<T>&, bool);                                              \
+  template void LinearTransformVector(std::vector<T>&, Extended, Extended);                      \
+  template TQENFloatVector Vector2FloatVector(const std::vector<T>&);                            \
+  template std::vector<T> AddVectors(const std::vector<T>&, const std::vector<T>&);              \
+  template void AddToVector(std::vector<T>&, const std::vector<T>&);                             \
+  template std::vector<T> SubtractVectors(const std::vector<T>&, const std::vector<T>&);         \
+  template void SubtractFromVector(std::vector<T>&, const std::vector<T>&);                      \
+  template void FillVector(std::vector<T>&, T);                                                  \
+  template void ClearVector(std::vector<T>&);                                                    \
+  template std::vector<T> ReverseVector(const std::vector<T>&);                                  \
+  template std::vector<T> CopyVector(const std::vector<T>&);                                     \
+  template TQENLIntVector Vector2RankVector(const std::vector<T>&, bool);                        \
+  template LongInt Vector2Rank(const std::vector<T>&, LongWord, bool);                           \
+  template LongInt Vector2RankValue(const std::vector<T>&, T, bool);
+TOVRIN_MONEY_ELEMENTS(TOVRIN_INSTANTIATE)
+#undef TOVRIN_INSTANTIATE
 
 }  // namespace tovrin

@@ -35,6 +35,8 @@
 // The row and column sums: all ten but LongInt.
 #define TOVRIN_ROW_SUM_ELEMENTS(X) \
   TOVRIN_SIGNED_ELEMENTS(X) X(LongWord) X(Word) X(SmallInt) X(Byte) X(ShortInt)
+// The three money types: TQENCurrency, TQENLongCurrency and Currency.
+#define TOVRIN_MONEY_ELEMENTS(X) X(TQENCurrency) X(TQENLongCurrency) X(Currency)
 
 namespace tovrin::detail {
 
@@ -58,6 +60,8 @@ template <typename T>
 concept LongIntSourceElement = false TOVRIN_LONGINT_SOURCE_ELEMENTS(TOVRIN_DETAIL_OR_IS);
 template <typename T>
 concept RowSumElement = false TOVRIN_ROW_SUM_ELEMENTS(TOVRIN_DETAIL_OR_IS);
+template <typename T>
+concept MoneyElement = false TOVRIN_MONEY_ELEMENTS(TOVRIN_DETAIL_OR_IS);
 
 #undef TOVRIN_DETAIL_OR_IS
 

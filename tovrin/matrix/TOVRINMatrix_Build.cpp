@@ -142,66 +142,26 @@ Extended GrandMeanOf(const MatrixOf<T>& M, LongWord& N) {
 }  // namespace
 
 // --- Creation ---
-TQENFloatMatrix CreateFloatMatrix(LongWord Rows, LongWord Cols) {
-  return detail::CreateMatrixOf<PackedExtended>(Rows, Cols);
-}
-TQENDoubleMatrix CreateDoubleMatrix(LongWord Rows, LongWord Cols) {
-  return detail::CreateMatrixOf<Double>(Rows, Cols);
-}
-TQENSingleMatrix CreateSingleMatrix(LongWord Rows, LongWord Cols) {
-  return detail::CreateMatrixOf<Single>(Rows, Cols);
-}
-TQENInt64Matrix CreateInt64Matrix(LongWord Rows, LongWord Cols) {
-  return detail::CreateMatrixOf<Int64>(Rows, Cols);
-}
-TQENLWordMatrix CreateLWordMatrix(LongWord Rows, LongWord Cols) {
-  return detail::CreateMatrixOf<LongWord>(Rows, Cols);
-}
-TQENLIntMatrix CreateLIntMatrix(LongWord Rows, LongWord Cols) {
-  return detail::CreateMatrixOf<LongInt>(Rows, Cols);
-}
-TQENWordMatrix CreateWordMatrix(LongWord Rows, LongWord Cols) {
-  return detail::CreateMatrixOf<Word>(Rows, Cols);
-}
-TQENSmallIntMatrix CreateSmallIntMatrix(LongWord Rows, LongWord Cols) {
-  return detail::CreateMatrixOf<SmallInt>(Rows, Cols);
-}
-TQENByteMatrix CreateByteMatrix(LongWord Rows, LongWord Cols) {
-  return detail::CreateMatrixOf<Byte>(Rows, Cols);
-}
-TQENSIntMatrix CreateSIntMatrix(LongWord Rows, LongWord Cols) {
-  return detail::CreateMatrixOf<ShortInt>(Rows, Cols);
-}
-TQENFloatMatrix CreateFloatIdentityMatrix(LongWord N) {
-  return detail::CreateIdentityOf<PackedExtended>(N, PackedExtended(1));
-}
-TQENDoubleMatrix CreateDoubleIdentityMatrix(LongWord N) {
-  return detail::CreateIdentityOf<Double>(N, Double(1));
-}
-TQENSingleMatrix CreateSingleIdentityMatrix(LongWord N) {
-  return detail::CreateIdentityOf<Single>(N, Single(1));
-}
-TQENInt64Matrix CreateInt64IdentityMatrix(LongWord N) {
-  return detail::CreateIdentityOf<Int64>(N, Int64(1));
-}
-TQENLWordMatrix CreateLWordIdentityMatrix(LongWord N) {
-  return detail::CreateIdentityOf<LongWord>(N, LongWord(1));
-}
-TQENLIntMatrix CreateLIntIdentityMatrix(LongWord N) {
-  return detail::CreateIdentityOf<LongInt>(N, LongInt(1));
-}
-TQENWordMatrix CreateWordIdentityMatrix(LongWord N) {
-  return detail::CreateIdentityOf<Word>(N, Word(1));
-}
-TQENSmallIntMatrix CreateSmallIntIdentityMatrix(LongWord N) {
-  return detail::CreateIdentityOf<SmallInt>(N, SmallInt(1));
-}
-TQENByteMatrix CreateByteIdentityMatrix(LongWord N) {
-  return detail::CreateIdentityOf<Byte>(N, Byte(1));
-}
-TQENSIntMatrix CreateSIntIdentityMatrix(LongWord N) {
-  return detail::CreateIdentityOf<ShortInt>(N, ShortInt(1));
-}
+// The creation functions carry the type in their names: one pair per element type, the name
+// beside the stored element type in the order of the type list.
+#define TOVRIN_DEFINE_CREATION(T, Name)                                   \
+  TQEN##Name##Matrix Create##Name##Matrix(LongWord Rows, LongWord Cols) { \
+    return detail::CreateMatrixOf<T>(Rows, Cols);                         \
+  }                                                                       \
+  TQEN##Name##Matrix Create##Name##IdentityMatrix(LongWord N) {           \
+    return detail::CreateIdentityOf<T>(N, T(1));                          \
+  }
+TOVRIN_DEFINE_CREATION(PackedExtended, Float)
+TOVRIN_DEFINE_CREATION(Double, Double)
+TOVRIN_DEFINE_CREATION(Single, Single)
+TOVRIN_DEFINE_CREATION(Int64, Int64)
+TOVRIN_DEFINE_CREATION(LongWord, LWord)
+TOVRIN_DEFINE_CREATION(LongInt, LInt)
+TOVRIN_DEFINE_CREATION(Word, Word)
+TOVRIN_DEFINE_CREATION(SmallInt, SmallInt)
+TOVRIN_DEFINE_CREATION(Byte, Byte)
+TOVRIN_DEFINE_CREATION(ShortInt, SInt)
+#undef TOVRIN_DEFINE_CREATION
 
 // --- Shape queries ---
 template <detail::AnyElement T>
