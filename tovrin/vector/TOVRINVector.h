@@ -234,8 +234,7 @@ namespace detail {
 // one non-template overload per element type.
 template <typename R>
 concept ArraySource = std::ranges::contiguous_range<R> && std::ranges::sized_range<R> &&
-                      !std::is_same_v<std::remove_cvref_t<R>,
-                                      std::span<const std::ranges::range_value_t<R>>>;
+    !std::is_same_v<std::remove_cvref_t<R>, std::span<const std::ranges::range_value_t<R>>>;
 template <typename R>
 using ArraySpan = std::span<const std::ranges::range_value_t<R>>;
 }  // namespace detail
