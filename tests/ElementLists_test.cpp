@@ -2,6 +2,10 @@
 // element type does not compile. Checked at compile time, one family per list.
 #include "tovrin/tovrin.h"
 
+#include <array>
+#include <span>
+#include <vector>
+
 namespace tovrin {
 namespace {
 
@@ -39,6 +43,15 @@ static_assert(CanConvertToLInt<TQENWordVector> && !CanConvertToLInt<TQENLWordVec
 // Neither a vector of another element type nor a matrix is an element vector.
 static_assert(CanSort<TQENSIntVector> && !CanSort<std::vector<Int64*>>);
 static_assert(!CanSort<TQENFloatMatrix> && !CanSort<std::vector<long double>>);
+
+// The open-array conversions take a span, and what converts to one of a listed type.
+template <typename A>
+concept CanConvertArray = requires(const A& a) {
+  Array2FloatVector(a);
+};
+static_assert(CanConvertArray<std::span<const Word>> && CanConvertArray<TQENWordVector>);
+static_assert(CanConvertArray<std::array<Double, 3>> && CanConvertArray<std::span<Byte>>);
+static_assert(!CanConvertArray<std::vector<long long>> && !CanConvertArray<std::vector<char>>);
 
 template <typename M>
 concept CanInvert = requires(M& m) {

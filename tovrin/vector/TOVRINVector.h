@@ -12,7 +12,9 @@
 #pragma once
 
 #include <functional>
+#include <ranges>
 #include <span>
+#include <type_traits>
 #include <vector>
 
 #include "tovrin/foundation/TOVRINElementTypes.h"
@@ -225,6 +227,32 @@ template <detail::LongIntSourceElement T>
 TQENLIntVector Array2LIntVector(std::span<const T> A);
 template <detail::LongIntSourceElement T>
 TQENLIntVector Vector2LIntVector(const std::vector<T>& V);
+
+namespace detail {
+// A contiguous range of a listed element type other than the span itself (a vector, a
+// std::array, a C array, a span of non-const elements): it passes as its span, as it would to
+// one non-template overload per element type.
+template <typename R>
+concept ArraySource = std::ranges::contiguous_range<R> && std::ranges::sized_range<R> &&
+    !std::is_same_v<std::remove_cvref_t<R>, std::span<const std::ranges::range_value_t<R>>>;
+template <typename R>
+using ArraySpan = std::span<const std::ranges::range_value_t<R>>;
+}  // namespace detail
+template <detail::ArraySource R>
+requires detail::AnyElement<detail::StoredElementOf<std::ranges::range_value_t<R>>> TQENFloatVector
+Array2FloatVector(const R& A) {
+  return Array2FloatVector(detail::ArraySpan<R>(A));
+}
+template <detail::ArraySource R>
+requires detail::IntegerElement<std::ranges::range_value_t<R>> TQENInt64Vector
+Array2Int64Vector(const R& A) {
+  return Array2Int64Vector(detail::ArraySpan<R>(A));
+}
+template <detail::ArraySource R>
+requires detail::LongIntSourceElement<std::ranges::range_value_t<R>> TQENLIntVector
+Array2LIntVector(const R& A) {
+  return Array2LIntVector(detail::ArraySpan<R>(A));
+}
 
 // ============================================================================================
 // Polynomial

@@ -1,6 +1,7 @@
 // How the three money types add, scale, transform, test their sign and compare for ranking.
 // The money vector and matrix units pass these rules to the numeric unit's algorithm
-// templates, so each algorithm exists once.
+// templates in tovrin/detail, so each algorithm exists once; detail::ElementRules<T> is the
+// sibling that holds the rules of the ten numeric element types.
 //
 // Stored integers add and subtract with wrap-around at their own width (32 bits for
 // TQENCurrency, 64 for the others), done in unsigned arithmetic. Products by an Extended
