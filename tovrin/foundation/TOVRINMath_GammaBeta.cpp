@@ -26,7 +26,7 @@
 
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINMath.h"
-#include "tovrin/foundation/detail/SpecialTails.h"
+#include "tovrin/foundation/detail/IncompleteTails.h"
 
 namespace tovrin {
 namespace {

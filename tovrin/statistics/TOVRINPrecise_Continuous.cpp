@@ -6,7 +6,7 @@
 
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINMath.h"
-#include "tovrin/foundation/detail/SpecialTails.h"
+#include "tovrin/foundation/detail/IncompleteTails.h"
 #include "tovrin/statistics/TOVRINPrecise.h"
 #include "tovrin/statistics/TOVRINStatistics_Continuous.h"
 #include "tovrin/statistics/detail/PairArithmetic.h"

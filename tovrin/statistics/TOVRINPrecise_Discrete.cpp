@@ -11,7 +11,7 @@
 
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINMath.h"
-#include "tovrin/foundation/detail/SpecialTails.h"
+#include "tovrin/foundation/detail/IncompleteTails.h"
 #include "tovrin/statistics/TOVRINPrecise.h"
 #include "tovrin/statistics/detail/PairArithmetic.h"
 
