@@ -96,7 +96,8 @@ void ExpectRaisesBeforeDraw(TResStringId Ident, WithSource&& withSource,
 template <typename F>
 void ExpectPairsRaiseBeforeDraw(TResStringId Ident,
                                 std::initializer_list<std::array<Extended, 2>> bad, F f) {
-  for (const auto& [a, b] : bad) {
+  for (const std::array<Extended, 2>& pair : bad) {
+    const Extended a = pair[0], b = pair[1];
     ExpectRaisesBeforeDraw(
         Ident, [&](TRandomGenFunction g) { f(a, b, &g); }, [&] { f(a, b, nullptr); });
   }

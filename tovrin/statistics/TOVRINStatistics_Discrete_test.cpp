@@ -200,9 +200,9 @@ TEST(Discrete, TablesAndTheirChecks) {
             (std::vector<Extended>{1 / 16.0L, 0.25L, 0.375L, 0.25L, 1 / 16.0L}));
   const std::pair<LongInt, Extended> bad[] = {
       {4, -0.1L}, {4, 1.1L}, {4, kNaN}, {0, 0.5L}, {-3, 0.5L}};
-  for (const auto& [n, p] : bad) {
+  for (const auto& pair : bad) {
     v.assign(3, 1);
-    ExpectRaises(rsBinomDistInvalid, [&] { BinomialPDFValues(n, p, v); });
+    ExpectRaises(rsBinomDistInvalid, [&] { BinomialPDFValues(pair.first, pair.second, v); });
     EXPECT_TRUE(v.empty());
   }
   v.assign(3, 1);
