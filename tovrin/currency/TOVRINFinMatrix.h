@@ -12,7 +12,7 @@
 #include "tovrin/currency/TOVRINFinancials.h"
 #include "tovrin/foundation/TOVRINElementTypes.h"
 #include "tovrin/foundation/TOVRINFoundation.h"
-#include "tovrin/matrix/TOVRINMatrix.h"  // QENMatrixRectangularCheck
+#include "tovrin/matrix/TOVRINMatrix.h"
 
 namespace tovrin {
 
@@ -27,18 +27,13 @@ TQENCurrMatrix CreateCurrIdentityMatrix(LongWord N);
 TQENLongCurrMatrix CreateLongCurrIdentityMatrix(LongWord N);
 TQENCurrencyMatrix CreateCurrencyIdentityMatrix(LongWord N);
 
-// --- Shape queries ------------------------------------------------------------------------------
-// As the numeric matrices: MatrixIsRectangular ignores the switch; MatrixDimensions, and so
-// MatrixIsSquare and MatricesSameDimensions, follow QENMatrixRectangularCheck.
-template <detail::MoneyElement T>
-bool MatrixIsRectangular(const detail::MatrixOf<T>& M);
-template <detail::MoneyElement T>
-void MatrixDimensions(const detail::MatrixOf<T>& M, LongWord& Rows, LongWord& Cols,
-                      bool& Rectangular);
-template <detail::MoneyElement T>
-bool MatrixIsSquare(const detail::MatrixOf<T>& M);
-template <detail::MoneyElement T>
-bool MatricesSameDimensions(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2);
+// --- Shape queries, row and column moves, copy and transpose -----------------------------------
+// MatrixIsRectangular, MatrixDimensions, MatrixIsSquare, MatricesSameDimensions,
+// SwapMatrixRows, SwapMatrixCols, QSortMatrixRowsOnCol, QSortMatrixColsOnRow, ExtractMatrixRow,
+// ExtractMatrixCol, OverwriteMatrixRow, OverwriteMatrixCol, CopyMatrix and TransposeMatrix are
+// the templates of TOVRINMatrix.h, which take the money matrices too: they only compare, move
+// and copy elements, comparing stored integers exactly, with the checks and their order as
+// stated there.
 
 // --- Conversion -------------------------------------------------------------------------------
 // The amounts (Currency2Float of each element), keeping ragged shapes. Never raises.
@@ -79,40 +74,5 @@ void LinearTransformMatrix(detail::MatrixOf<T>& M, Extended A, Extended B);
 // only empty rows, raise rsMatrixIsEmpty.
 template <detail::MoneyElement T>
 T GrandMean(const detail::MatrixOf<T>& M, LongWord& N);
-
-// --- Row and column operations ----------------------------------------------------------------
-// Checks: rsMatrixIsEmpty, rsMatrixRect, then rsInvalidRow / rsInvalidCol; equal indices
-// return at once without any check.
-template <detail::MoneyElement T>
-void SwapMatrixRows(detail::MatrixOf<T>& M, LongWord Row1, LongWord Row2);
-template <detail::MoneyElement T>
-void SwapMatrixCols(detail::MatrixOf<T>& M, LongWord Col1, LongWord Col2);
-// Whole rows ordered by their element in column Col (columns by their element in row Row) by
-// the explicit-stack quick sort, comparing stored integers exactly. Nothing is checked or done
-// unless there are two rows and two columns; then rsMatrixRect, rsInvalidCol / rsInvalidRow.
-template <detail::MoneyElement T>
-void QSortMatrixRowsOnCol(detail::MatrixOf<T>& M, LongWord Col, bool Ascending);
-template <detail::MoneyElement T>
-void QSortMatrixColsOnRow(detail::MatrixOf<T>& M, LongWord Row, bool Ascending);
-// A copy of one row (column); empty for a matrix with no rows or columns; rsInvalidRow
-// (rsInvalidCol) past the end.
-template <detail::MoneyElement T>
-std::vector<T> ExtractMatrixRow(const detail::MatrixOf<T>& M, LongWord Row);
-template <detail::MoneyElement T>
-std::vector<T> ExtractMatrixCol(const detail::MatrixOf<T>& M, LongWord Col);
-// Row Row (column Col) becomes V, cut or padded with Fill to the matrix's width (height);
-// nothing happens for a matrix with no rows or columns; rsInvalidRow (rsInvalidCol) past the
-// end.
-template <detail::MoneyElement T>
-void OverwriteMatrixRow(detail::MatrixOf<T>& M, LongWord Row, const std::vector<T>& V, T Fill);
-template <detail::MoneyElement T>
-void OverwriteMatrixCol(detail::MatrixOf<T>& M, LongWord Col, const std::vector<T>& V, T Fill);
-// A deep copy keeping every row's own length; never raises.
-template <detail::MoneyElement T>
-detail::MatrixOf<T> CopyMatrix(const detail::MatrixOf<T>& M);
-// Cols x Rows; rsMatrixRect for a matrix that is not rectangular (under the switch also an
-// empty one); an empty result for no rows or columns.
-template <detail::MoneyElement T>
-detail::MatrixOf<T> TransposeMatrix(const detail::MatrixOf<T>& M);
 
 }  // namespace tovrin

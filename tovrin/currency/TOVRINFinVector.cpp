@@ -4,7 +4,6 @@
 #include <utility>
 
 #include "tovrin/currency/detail/MoneyRules.h"
-#include "tovrin/detail/QuickSort.h"
 #include "tovrin/detail/Ranking.h"
 #include "tovrin/detail/VectorAlgorithms.h"
 
@@ -40,42 +39,8 @@ T Same(T x) {
 TQENCurrency CurrFromFloat(PackedExtended x) { return Float2QENCurrency(x); }
 TQENLongCurrency LongCurrFromFloat(PackedExtended x) { return Float2QENLongCurrency(x); }
 Currency CurrencyFromFloat(PackedExtended x) { return detail::Float2Money<Currency>(x); }
-PackedExtended FloatOf(TQENCurrency x) { return Currency2Float(x); }
-PackedExtended FloatOf(TQENLongCurrency x) { return Currency2Float(x); }
-PackedExtended FloatOf(Currency x) { return Currency2Float(x); }
 
 }  // namespace
-
-template <detail::MoneyElement T>
-void AppendValue2Vector(std::vector<T>& V, T Value) {
-  detail::AppendElement(V, Value);
-}
-
-template <detail::MoneyElement T>
-void AddValue2Vector(std::vector<T>& V, T Value, LongInt Index) {
-  detail::InsertElement(V, Value, Index);
-}
-
-template <detail::MoneyElement T>
-void DeleteValueFromVector(std::vector<T>& V, LongInt Index) {
-  detail::DeleteElement(V, Index);
-}
-
-template <detail::MoneyElement T>
-T MaxVector(const std::vector<T>& V) {
-  return detail::LargestElement(V);
-}
-
-template <detail::MoneyElement T>
-T MinVector(const std::vector<T>& V) {
-  return detail::SmallestElement(V);
-}
-
-template <detail::MoneyElement T>
-void MinMaxVector(const std::vector<T>& V, T& MinValue, T& MaxValue, LongWord& MinIndex,
-                  LongWord& MaxIndex, bool& MinUnique, bool& MaxUnique) {
-  detail::Extremes(V, MinValue, MaxValue, MinIndex, MaxIndex, MinUnique, MaxUnique);
-}
 
 template <detail::MoneyElement T>
 T SumVector(const std::vector<T>& V) {
@@ -119,18 +84,13 @@ bool VectorPositive(const std::vector<T>& V) {
 }
 
 template <detail::MoneyElement T>
-void QSortVector(std::vector<T>& V, bool Ascending) {
-  detail::QuickSortVector(V, Ascending);
-}
-
-template <detail::MoneyElement T>
 void LinearTransformVector(std::vector<T>& V, Extended A, Extended B) {
   LinearTransformOf(V, A, B);
 }
 
 template <detail::MoneyElement T>
 TQENFloatVector Vector2FloatVector(const std::vector<T>& V) {
-  return ConvertedOf<PackedExtended>(V, [](auto x) { return FloatOf(x); });
+  return ConvertedOf<PackedExtended>(V, [](T x) { return PackedExtended(Currency2Float(x)); });
 }
 
 template <detail::MoneyElement T>
@@ -154,26 +114,6 @@ void SubtractFromVector(std::vector<T>& V1, const std::vector<T>& V2) {
 }
 
 template <detail::MoneyElement T>
-void FillVector(std::vector<T>& V, T Value) {
-  detail::FillElements(V, Value);
-}
-
-template <detail::MoneyElement T>
-void ClearVector(std::vector<T>& V) {
-  detail::ClearElements(V);
-}
-
-template <detail::MoneyElement T>
-std::vector<T> ReverseVector(const std::vector<T>& V) {
-  return detail::Reversed(V);
-}
-
-template <detail::MoneyElement T>
-std::vector<T> CopyVector(const std::vector<T>& V) {
-  return detail::CopyOf(V);
-}
-
-template <detail::MoneyElement T>
 TQENLIntVector Vector2RankVector(const std::vector<T>& V, bool Ascending) {
   return detail::RankVector(V, Ascending, detail::MoneyRankEquals{});
 }
@@ -188,74 +128,45 @@ LongInt Vector2RankValue(const std::vector<T>& V, T Value, bool Ascending) {
   return detail::RankOfValue(V, Value, Ascending, detail::MoneyRankEquals{});
 }
 
-TQENCurrVector Vector2QENCurrVector(const TQENCurrVector& V) {
-  return ConvertedOf<TQENCurrency>(V, Same<TQENCurrency>);
-}
-TQENCurrVector Vector2QENCurrVector(const TQENLongCurrVector& V) {
-  return ConvertedOf<TQENCurrency>(V, QENLongCurrency2QENCurrency);
-}
-TQENCurrVector Vector2QENCurrVector(const TQENCurrencyVector& V) {
-  return ConvertedOf<TQENCurrency>(V, Currency2QENCurrency);
-}
-TQENCurrVector Vector2QENCurrVector(const TQENFloatVector& V) {
-  return ConvertedOf<TQENCurrency>(V, CurrFromFloat);
-}
+// One row per target type; the columns are the conversions from TQENCurrency,
+// TQENLongCurrency, Currency and Extended elements.
+#define TOVRIN_DEFINE_CONVERSIONS(To, Name, FromCurr, FromLongCurr, FromCurrency, FromFloat) \
+  TQEN##Name##Vector Vector2QEN##Name##Vector(const TQENCurrVector& V) {                     \
+    return ConvertedOf<To>(V, FromCurr);                                                     \
+  }                                                                                          \
+  TQEN##Name##Vector Vector2QEN##Name##Vector(const TQENLongCurrVector& V) {                 \
+    return ConvertedOf<To>(V, FromLongCurr);                                                 \
+  }                                                                                          \
+  TQEN##Name##Vector Vector2QEN##Name##Vector(const TQENCurrencyVector& V) {                 \
+    return ConvertedOf<To>(V, FromCurrency);                                                 \
+  }                                                                                          \
+  TQEN##Name##Vector Vector2QEN##Name##Vector(const TQENFloatVector& V) {                    \
+    return ConvertedOf<To>(V, FromFloat);                                                    \
+  }
+TOVRIN_DEFINE_CONVERSIONS(TQENCurrency, Curr, Same<TQENCurrency>, QENLongCurrency2QENCurrency,
+                          Currency2QENCurrency, CurrFromFloat)
+TOVRIN_DEFINE_CONVERSIONS(TQENLongCurrency, LongCurr, QENCurrency2QENLongCurrency,
+                          Same<TQENLongCurrency>, Currency2QENLongCurrency, LongCurrFromFloat)
+TOVRIN_DEFINE_CONVERSIONS(Currency, Currency, QENCurrency2Currency, QENLongCurrency2Currency,
+                          Same<Currency>, CurrencyFromFloat)
+#undef TOVRIN_DEFINE_CONVERSIONS
 
-TQENLongCurrVector Vector2QENLongCurrVector(const TQENCurrVector& V) {
-  return ConvertedOf<TQENLongCurrency>(V, QENCurrency2QENLongCurrency);
-}
-TQENLongCurrVector Vector2QENLongCurrVector(const TQENLongCurrVector& V) {
-  return ConvertedOf<TQENLongCurrency>(V, Same<TQENLongCurrency>);
-}
-TQENLongCurrVector Vector2QENLongCurrVector(const TQENCurrencyVector& V) {
-  return ConvertedOf<TQENLongCurrency>(V, Currency2QENLongCurrency);
-}
-TQENLongCurrVector Vector2QENLongCurrVector(const TQENFloatVector& V) {
-  return ConvertedOf<TQENLongCurrency>(V, LongCurrFromFloat);
-}
-
-TQENCurrencyVector Vector2QENCurrencyVector(const TQENCurrVector& V) {
-  return ConvertedOf<Currency>(V, QENCurrency2Currency);
-}
-TQENCurrencyVector Vector2QENCurrencyVector(const TQENLongCurrVector& V) {
-  return ConvertedOf<Currency>(V, QENLongCurrency2Currency);
-}
-TQENCurrencyVector Vector2QENCurrencyVector(const TQENCurrencyVector& V) {
-  return ConvertedOf<Currency>(V, Same<Currency>);
-}
-TQENCurrencyVector Vector2QENCurrencyVector(const TQENFloatVector& V) {
-  return ConvertedOf<Currency>(V, CurrencyFromFloat);
-}
-
-using detail::MatrixOf;
-
-#define TOVRIN_INSTANTIATE(T)                                                                    \
-  template void AppendValue2Vector(std::vector<T>&, T);                                          \
-  template void AddValue2Vector(std::vector<T>&, T, LongInt);                                    \
-  template void DeleteValueFromVector(std::vector<T>&, LongInt);                                 \
-  template T MaxVector(const std::vector<T>&);                                                   \
-  template T MinVector(const std::vector<T>&);                                                   \
-  template void MinMaxVector(const std::vector<T>&, T&, T&, LongWord&, LongWord&, bool&, bool&); \
-  template T SumVector(const std::vector<T>&);                                                   \
-  template bool VectorNonNegative(const std::vector<T>&);                                        \
-  template bool VectorNegative(const std::vector<T>&);                                           \
-  template bool VectorNonPositive(const std::vector<T>&);                                        \
-  template bool VectorNonZero(const std::vector<T>&);                                            \
-  template bool VectorZero(const std::vector<T>&);                                               \
-  template bool VectorPositive(const std::vector<T>&);                                           \
-  template void QSortVector(std::vector<T>&, bool);                                              \
-  template void LinearTransformVector(std::vector<T>&, Extended, Extended);                      \
-  template TQENFloatVector Vector2FloatVector(const std::vector<T>&);                            \
-  template std::vector<T> AddVectors(const std::vector<T>&, const std::vector<T>&);              \
-  template void AddToVector(std::vector<T>&, const std::vector<T>&);                             \
-  template std::vector<T> SubtractVectors(const std::vector<T>&, const std::vector<T>&);         \
-  template void SubtractFromVector(std::vector<T>&, const std::vector<T>&);                      \
-  template void FillVector(std::vector<T>&, T);                                                  \
-  template void ClearVector(std::vector<T>&);                                                    \
-  template std::vector<T> ReverseVector(const std::vector<T>&);                                  \
-  template std::vector<T> CopyVector(const std::vector<T>&);                                     \
-  template TQENLIntVector Vector2RankVector(const std::vector<T>&, bool);                        \
-  template LongInt Vector2Rank(const std::vector<T>&, LongWord, bool);                           \
+#define TOVRIN_INSTANTIATE(T)                                                            \
+  template T SumVector(const std::vector<T>&);                                           \
+  template bool VectorNonNegative(const std::vector<T>&);                                \
+  template bool VectorNegative(const std::vector<T>&);                                   \
+  template bool VectorNonPositive(const std::vector<T>&);                                \
+  template bool VectorNonZero(const std::vector<T>&);                                    \
+  template bool VectorZero(const std::vector<T>&);                                       \
+  template bool VectorPositive(const std::vector<T>&);                                   \
+  template void LinearTransformVector(std::vector<T>&, Extended, Extended);              \
+  template TQENFloatVector Vector2FloatVector(const std::vector<T>&);                    \
+  template std::vector<T> AddVectors(const std::vector<T>&, const std::vector<T>&);      \
+  template void AddToVector(std::vector<T>&, const std::vector<T>&);                     \
+  template std::vector<T> SubtractVectors(const std::vector<T>&, const std::vector<T>&); \
+  template void SubtractFromVector(std::vector<T>&, const std::vector<T>&);              \
+  template TQENLIntVector Vector2RankVector(const std::vector<T>&, bool);                \
+  template LongInt Vector2Rank(const std::vector<T>&, LongWord, bool);                   \
   template LongInt Vector2RankValue(const std::vector<T>&, T, bool);
 TOVRIN_MONEY_ELEMENTS(TOVRIN_INSTANTIATE)
 #undef TOVRIN_INSTANTIATE

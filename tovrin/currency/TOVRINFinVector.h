@@ -11,29 +11,17 @@
 #include "tovrin/currency/TOVRINFinancials.h"
 #include "tovrin/foundation/TOVRINElementTypes.h"
 #include "tovrin/foundation/TOVRINFoundation.h"
+#include "tovrin/vector/TOVRINVector.h"
 
 namespace tovrin {
 
-// --- Building ---------------------------------------------------------------------------------
-// Appends Value; inserts it at Index when Index is a position of V, else appends; deletes the
-// element at Index when Index is a position of V, else does nothing (raise nothing).
-template <detail::MoneyElement T>
-void AppendValue2Vector(std::vector<T>& V, T Value);
-template <detail::MoneyElement T>
-void AddValue2Vector(std::vector<T>& V, T Value, LongInt Index);
-template <detail::MoneyElement T>
-void DeleteValueFromVector(std::vector<T>& V, LongInt Index);
+// --- Building, extremes, fills, copies and the quick sort ---------------------------------------
+// AppendValue2Vector, AddValue2Vector, DeleteValueFromVector, MaxVector, MinVector,
+// MinMaxVector, FillVector, ClearVector, ReverseVector, CopyVector and QSortVector are the
+// templates of TOVRINVector.h, which take the money vectors too: they only move, compare and
+// copy elements, comparing stored integers exactly, with the checks stated there.
 
 // --- Aggregates -------------------------------------------------------------------------------
-// Extremes by the stored integers (first position of equals; unique flags as MinMaxVector of
-// the numeric vectors). All raise rsVectorIsEmpty for an empty V.
-template <detail::MoneyElement T>
-T MaxVector(const std::vector<T>& V);
-template <detail::MoneyElement T>
-T MinVector(const std::vector<T>& V);
-template <detail::MoneyElement T>
-void MinMaxVector(const std::vector<T>& V, T& MinValue, T& MaxValue, LongWord& MinIndex,
-                  LongWord& MaxIndex, bool& MinUnique, bool& MaxUnique);
 // The sum in the element type: a 32-bit wrapping sum for TQENCurrency, 64-bit for the others.
 template <detail::MoneyElement T>
 T SumVector(const std::vector<T>& V);
@@ -56,11 +44,6 @@ bool VectorZero(const std::vector<T>& V);
 template <detail::MoneyElement T>
 bool VectorPositive(const std::vector<T>& V);
 
-// --- Sorting ----------------------------------------------------------------------------------
-// The explicit-stack quick sort of QSortVector, comparing stored integers exactly.
-template <detail::MoneyElement T>
-void QSortVector(std::vector<T>& V, bool Ascending);
-
 // --- Arithmetic and transforms ----------------------------------------------------------------
 // Element := element x A + B in money terms; rsVectorIsEmpty for an empty V.
 // TQENCurrency and TQENLongCurrency: Float2QEN...(Currency2Float(element) x A + B). Currency:
@@ -80,16 +63,6 @@ template <detail::MoneyElement T>
 std::vector<T> SubtractVectors(const std::vector<T>& V1, const std::vector<T>& V2);
 template <detail::MoneyElement T>
 void SubtractFromVector(std::vector<T>& V1, const std::vector<T>& V2);
-// Every element := Value, or 0; the length is kept.
-template <detail::MoneyElement T>
-void FillVector(std::vector<T>& V, T Value);
-template <detail::MoneyElement T>
-void ClearVector(std::vector<T>& V);
-// A new vector: the elements in reverse order; an independent copy.
-template <detail::MoneyElement T>
-std::vector<T> ReverseVector(const std::vector<T>& V);
-template <detail::MoneyElement T>
-std::vector<T> CopyVector(const std::vector<T>& V);
 
 // --- Ranking ----------------------------------------------------------------------------------
 // 0-based ranks in a sorted copy, ties sharing the lowest rank; -1 for no rank (an Index past

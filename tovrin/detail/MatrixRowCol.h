@@ -1,19 +1,19 @@
 // Row and column operations shared by the numeric and the money matrix units: the common
 // checks of the in-place row and column operations, swaps, the two matrix sorts, extraction,
 // overwriting with padding and transposition. Element-type agnostic: elements are copied
-// whole and exchanged with SwapXY (found by argument-dependent lookup, so the money types'
-// overloads serve too); sort keys are compared with `<` on their value type.
+// and exchanged whole (as SwapXY does, for the numeric and the money types alike); sort keys
+// are compared with `<` on their value type.
 #pragma once
 
 #include <algorithm>
 #include <cstddef>
+#include <utility>
 #include <vector>
 
 #include "tovrin/detail/ElementRules.h"
 #include "tovrin/detail/MatrixShape.h"
 #include "tovrin/detail/QuickSort.h"
 #include "tovrin/foundation/TOVRINErrors.h"
-#include "tovrin/foundation/TOVRINSystem.h"
 
 namespace tovrin::detail {
 
@@ -49,13 +49,13 @@ template <typename T>
 void SwapRowElements(MatrixOf<T>& M, std::size_t Row1, std::size_t Row2, std::size_t Cols) {
   T* a = M[Row1].data();
   T* b = M[Row2].data();
-  for (std::size_t j = 0; j < Cols; ++j) SwapXY(a[j], b[j]);
+  for (std::size_t j = 0; j < Cols; ++j) std::swap(a[j], b[j]);
 }
 
 // Exchanges columns Col1 and Col2 in every row. No checks.
 template <typename T>
 void SwapColElements(MatrixOf<T>& M, std::size_t Col1, std::size_t Col2) {
-  for (auto& row : M) SwapXY(row[Col1], row[Col2]);
+  for (auto& row : M) std::swap(row[Col1], row[Col2]);
 }
 
 // SwapMatrixRows: equal indices return at once, before any check.

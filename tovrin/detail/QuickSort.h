@@ -24,7 +24,6 @@
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINGlobals.h"
 #include "tovrin/foundation/TOVRINMath.h"
-#include "tovrin/foundation/TOVRINSystem.h"
 
 namespace tovrin {
 
@@ -155,17 +154,17 @@ inline bool PackedKeysAreExact(const std::vector<PackedExtended>& V) {
   return true;
 }
 
-// Sorts a vector in place by the elements' own `<` (exact, also for floats), with SwapXY
-// exchanging elements (found by argument-dependent lookup, so the money types' overloads
-// serve too). PackedExtended elements are compared as Extended values. Where equal elements
-// are indistinguishable the result is the same as the plain algorithm's to the bit, but the
-// partitioning stops at short stretches and one straight insertion pass finishes them.
+// Sorts a vector in place by the elements' own `<` (exact, also for floats), exchanging
+// elements whole as SwapXY does, for the numeric and the money types alike. PackedExtended
+// elements are compared as Extended values. Where equal elements are indistinguishable the
+// result is the same as the plain algorithm's to the bit, but the partitioning stops at short
+// stretches and one straight insertion pass finishes them.
 template <typename T>
 void QuickSortVector(std::vector<T>& V, bool Ascending) {
   const LongInt n = static_cast<LongInt>(V.size());
   if (n < 2) return;
   T* const data = V.data();  // position p is data[p - 1]
-  auto swap = [data](LongInt p, LongInt q) { SwapXY(data[p - 1], data[q - 1]); };
+  auto swap = [data](LongInt p, LongInt q) { std::swap(data[p - 1], data[q - 1]); };
   if constexpr (std::is_same_v<T, PackedExtended>) {
     // The same comparisons through integer keys, which read the packed bytes directly.
     if (PackedKeysAreExact(V)) {

@@ -37,6 +37,11 @@
   TOVRIN_SIGNED_ELEMENTS(X) X(LongWord) X(Word) X(SmallInt) X(Byte) X(ShortInt)
 // The three money types: TQENCurrency, TQENLongCurrency and Currency.
 #define TOVRIN_MONEY_ELEMENTS(X) X(TQENCurrency) X(TQENLongCurrency) X(Currency)
+// The ten and the three money types: the families that only move, compare and copy elements
+// (extremes, fills, copies, the quick sort, the matrix shape queries and row and column moves).
+#define TOVRIN_ALL_AND_MONEY_ELEMENTS(X) TOVRIN_ALL_ELEMENTS(X) TOVRIN_MONEY_ELEMENTS(X)
+// The six buildable and the three money types: appending, inserting and deleting elements.
+#define TOVRIN_BUILDABLE_AND_MONEY_ELEMENTS(X) TOVRIN_BUILDABLE_ELEMENTS(X) TOVRIN_MONEY_ELEMENTS(X)
 
 namespace tovrin::detail {
 
@@ -62,6 +67,10 @@ template <typename T>
 concept RowSumElement = false TOVRIN_ROW_SUM_ELEMENTS(TOVRIN_DETAIL_OR_IS);
 template <typename T>
 concept MoneyElement = false TOVRIN_MONEY_ELEMENTS(TOVRIN_DETAIL_OR_IS);
+template <typename T>
+concept AnyOrMoneyElement = false TOVRIN_ALL_AND_MONEY_ELEMENTS(TOVRIN_DETAIL_OR_IS);
+template <typename T>
+concept BuildableOrMoneyElement = false TOVRIN_BUILDABLE_AND_MONEY_ELEMENTS(TOVRIN_DETAIL_OR_IS);
 
 #undef TOVRIN_DETAIL_OR_IS
 

@@ -6,7 +6,10 @@
 // that is too short for the columns an operation would touch raises rsMatrixRect instead of
 // being read past its end. Failed checks raise EMathError before anything is changed (the
 // element-wise functions stop where an element fails, keeping what they already wrote).
-// Floating-point work is done in Extended and rounded to the element type on store.
+// Floating-point work is done in Extended and rounded to the element type on store. The shape
+// queries (all but MatrixRows and MatrixCols) and the row and column moves, copies and
+// transposition also take the three money matrices of TOVRINFinMatrix.h, whose stored integers they
+// compare exactly.
 #pragma once
 
 #include <atomic>
@@ -60,23 +63,23 @@ LongInt MatrixCols(const detail::MatrixOf<T>& M);
 
 // True when there is at least one row and every row has the length of row 0. Ignores
 // QENMatrixRectangularCheck.
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 bool MatrixIsRectangular(const detail::MatrixOf<T>& M);
 
 // Rows is the row count and Cols the length of row 0 (0 without rows). With
 // QENMatrixRectangularCheck off, Rectangular is always True and the shape is row 0's. With it on,
 // an empty matrix or an empty row 0 gives Rectangular False; a row of another length gives
 // Cols 0 and Rectangular False.
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void MatrixDimensions(const detail::MatrixOf<T>& M, LongWord& Rows, LongWord& Cols,
                       bool& Rectangular);
 
 // Rectangular (as MatrixDimensions reports it) with Rows = Cols.
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 bool MatrixIsSquare(const detail::MatrixOf<T>& M);
 
 // Both rectangular (as MatrixDimensions reports it) with equal row and column counts.
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 bool MatricesSameDimensions(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2);
 
 // === Conversion =============================================================================
@@ -156,9 +159,9 @@ Extended GrandMean(const detail::MatrixOf<T>& M, LongWord& N);
 //
 // Swaps: equal indices return at once, without any check. Rows are exchanged element by element
 // over the column count (the row storage stays where it is).
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void SwapMatrixRows(detail::MatrixOf<T>& M, LongWord Row1, LongWord Row2);
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void SwapMatrixCols(detail::MatrixOf<T>& M, LongWord Col1, LongWord Col2);
 
 // Element := K x element along a row or a column. K exactly 1 returns at once, without any
@@ -181,35 +184,35 @@ void AddMatrixCols(detail::MatrixOf<T>& M, LongWord Col1, LongWord Col2, detail:
 // the switch a ragged matrix has none) nothing is checked or changed. Then rsMatrixRect, then
 // rsInvalidCol (rsInvalidRow); with the switch off a row shorter than the column count raises
 // rsMatrixRect.
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void QSortMatrixRowsOnCol(detail::MatrixOf<T>& M, LongWord Col, bool Ascending);
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void QSortMatrixColsOnRow(detail::MatrixOf<T>& M, LongWord Row, bool Ascending);
 
 // A copy of row Row (Cols elements) or column Col (Rows elements). An empty matrix, or one
 // with no columns, gives an empty vector without error; otherwise rsInvalidRow / rsInvalidCol.
 // The rectangular flag is not tested (under the switch a ragged matrix reports no columns).
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 std::vector<T> ExtractMatrixRow(const detail::MatrixOf<T>& M, LongWord Row);
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 std::vector<T> ExtractMatrixCol(const detail::MatrixOf<T>& M, LongWord Col);
 
 // Row Row (column Col) becomes V, cut to the column (row) count or padded with Fill. Nothing
 // happens for a matrix with no rows or no columns; otherwise rsInvalidRow / rsInvalidCol.
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void OverwriteMatrixRow(detail::MatrixOf<T>& M, LongWord Row, const std::vector<T>& V,
                         detail::ValueOf<T> Fill);
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void OverwriteMatrixCol(detail::MatrixOf<T>& M, LongWord Col, const std::vector<T>& V,
                         detail::ValueOf<T> Fill);
 
 // A deep copy keeping every row's length; never raises.
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 detail::MatrixOf<T> CopyMatrix(const detail::MatrixOf<T>& M);
 
 // Cols x Rows with r[j][i] = M[i][j]. rsMatrixRect when M is not rectangular (under the switch
 // an empty matrix is not); an empty matrix gives an empty result when the switch is off.
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 detail::MatrixOf<T> TransposeMatrix(const detail::MatrixOf<T>& M);
 
 // The matrix product. Checks, in order: either operand not rectangular (rsMatrixRect); either

@@ -172,20 +172,20 @@ template <detail::AnyElement T>
 LongInt MatrixCols(const detail::MatrixOf<T>& M) {
   return ColsOf(M);
 }
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 bool MatrixIsRectangular(const detail::MatrixOf<T>& M) {
   return detail::IsRectangularOf(M);
 }
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void MatrixDimensions(const detail::MatrixOf<T>& M, LongWord& Rows, LongWord& Cols,
                       bool& Rectangular) {
   DimensionsOf(M, Rows, Cols, Rectangular);
 }
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 bool MatrixIsSquare(const detail::MatrixOf<T>& M) {
   return detail::IsSquareOf(M);
 }
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 bool MatricesSameDimensions(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
   return detail::SameDimensionsOf(M1, M2);
 }
@@ -262,12 +262,16 @@ using detail::SumOf;
 using detail::ValueOf;
 
 #define TOVRIN_INSTANTIATE(T)                                                      \
-  template LongInt MatrixRows(const MatrixOf<T>&);                                 \
-  template LongInt MatrixCols(const MatrixOf<T>&);                                 \
   template bool MatrixIsRectangular(const MatrixOf<T>&);                           \
   template void MatrixDimensions(const MatrixOf<T>&, LongWord&, LongWord&, bool&); \
   template bool MatrixIsSquare(const MatrixOf<T>&);                                \
-  template bool MatricesSameDimensions(const MatrixOf<T>&, const MatrixOf<T>&);    \
+  template bool MatricesSameDimensions(const MatrixOf<T>&, const MatrixOf<T>&);
+TOVRIN_ALL_AND_MONEY_ELEMENTS(TOVRIN_INSTANTIATE)
+#undef TOVRIN_INSTANTIATE
+
+#define TOVRIN_INSTANTIATE(T)                      \
+  template LongInt MatrixRows(const MatrixOf<T>&); \
+  template LongInt MatrixCols(const MatrixOf<T>&); \
   template TQENFloatMatrix Matrix2FloatMatrix(const MatrixOf<T>&);
 TOVRIN_ALL_ELEMENTS(TOVRIN_INSTANTIATE)
 #undef TOVRIN_INSTANTIATE

@@ -184,11 +184,11 @@ MatrixOf<T> MultiplyOf(const MatrixOf<T>& M1, const MatrixOf<T>& M2) {
 }  // namespace
 
 // --- Swaps ---
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void SwapMatrixRows(detail::MatrixOf<T>& M, LongWord Row1, LongWord Row2) {
   detail::SwapRowsOf(M, Row1, Row2);
 }
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void SwapMatrixCols(detail::MatrixOf<T>& M, LongWord Col1, LongWord Col2) {
   detail::SwapColsOf(M, Col1, Col2);
 }
@@ -212,41 +212,41 @@ void AddMatrixCols(detail::MatrixOf<T>& M, LongWord Col1, LongWord Col2, detail:
 }
 
 // --- Sorts ---
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void QSortMatrixRowsOnCol(detail::MatrixOf<T>& M, LongWord Col, bool Ascending) {
   detail::QSortRowsOnColOf(M, Col, Ascending);
 }
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void QSortMatrixColsOnRow(detail::MatrixOf<T>& M, LongWord Row, bool Ascending) {
   detail::QSortColsOnRowOf(M, Row, Ascending);
 }
 
 // --- Extraction and overwriting ---
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 std::vector<T> ExtractMatrixRow(const detail::MatrixOf<T>& M, LongWord Row) {
   return detail::ExtractRowOf(M, Row);
 }
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 std::vector<T> ExtractMatrixCol(const detail::MatrixOf<T>& M, LongWord Col) {
   return detail::ExtractColOf(M, Col);
 }
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void OverwriteMatrixRow(detail::MatrixOf<T>& M, LongWord Row, const std::vector<T>& V,
                         detail::ValueOf<T> Fill) {
   detail::OverwriteRowOf(M, Row, V, Fill);
 }
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void OverwriteMatrixCol(detail::MatrixOf<T>& M, LongWord Col, const std::vector<T>& V,
                         detail::ValueOf<T> Fill) {
   detail::OverwriteColOf(M, Col, V, Fill);
 }
 
 // --- Copy, transpose, product ---
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 detail::MatrixOf<T> CopyMatrix(const detail::MatrixOf<T>& M) {
   return detail::CopyMatrixOf(M);
 }
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 detail::MatrixOf<T> TransposeMatrix(const detail::MatrixOf<T>& M) {
   return detail::TransposeOf(M);
 }
@@ -281,7 +281,7 @@ using detail::ValueOf;
   template void OverwriteMatrixCol(MatrixOf<T>&, LongWord, const std::vector<T>&, ValueOf<T>); \
   template MatrixOf<T> CopyMatrix(const MatrixOf<T>&);                                         \
   template MatrixOf<T> TransposeMatrix(const MatrixOf<T>&);
-TOVRIN_ALL_ELEMENTS(TOVRIN_INSTANTIATE)
+TOVRIN_ALL_AND_MONEY_ELEMENTS(TOVRIN_INSTANTIATE)
 #undef TOVRIN_INSTANTIATE
 
 #define TOVRIN_INSTANTIATE(T)                                                 \

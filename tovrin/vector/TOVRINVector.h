@@ -8,7 +8,9 @@
 // runs before any work, so a call that raises EMathError leaves its operands exactly as they were.
 // A value "of the element type" of a TQENFloatVector is an Extended. Integer sums, products and
 // squares wrap silently as stated per family; float work is done in Extended and rounded only when
-// stored.
+// stored. The families that only move, compare and copy elements (building, the extremes, fills,
+// reversal, copies and the quick sort) also take the three money vectors of TOVRINFinVector.h,
+// whose stored integers they compare exactly.
 #pragma once
 
 #include <functional>
@@ -37,18 +39,18 @@ using TransformFuncOf = std::function<ValueOf<T>(ValueOf<T>)>;
 // ============================================================================================
 
 // Appends Value as the new last element.
-template <detail::BuildableElement T>
+template <detail::BuildableOrMoneyElement T>
 void AppendValue2Vector(std::vector<T>& V, detail::ValueOf<T> Value);
 
 // Inserts Value at position Index, moving the later elements up one place. An Index that is
 // not a position of V (negative, at or past the end, any Index on an empty V) appends
 // instead; nothing is raised.
-template <detail::BuildableElement T>
+template <detail::BuildableOrMoneyElement T>
 void AddValue2Vector(std::vector<T>& V, detail::ValueOf<T> Value, LongInt Index);
 
 // Removes the element at position Index. An Index that is not a position of V does nothing;
 // removing the only element leaves the empty vector (its storage released).
-template <detail::BuildableElement T>
+template <detail::BuildableOrMoneyElement T>
 void DeleteValueFromVector(std::vector<T>& V, LongInt Index);
 
 // ============================================================================================
@@ -56,15 +58,15 @@ void DeleteValueFromVector(std::vector<T>& V, LongInt Index);
 // ============================================================================================
 
 // The largest and the smallest element, compared exactly (no tolerance, also for floats).
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 detail::ValueOf<T> MaxVector(const std::vector<T>& V);
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 detail::ValueOf<T> MinVector(const std::vector<T>& V);
 
 // Both extremes in one pass: their values, the first positions at which they occur, and
 // whether each occurs exactly once. Comparisons are exact. Outputs are written only after
 // the emptiness check.
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void MinMaxVector(const std::vector<T>& V, detail::ValueOf<T>& MinValue,
                   detail::ValueOf<T>& MaxValue, LongWord& MinIndex, LongWord& MaxIndex,
                   bool& MinUnique, bool& MaxUnique);
@@ -148,9 +150,9 @@ template <detail::FloatElement T>
 void TransformVector(std::vector<T>& V, const detail::TransformFuncOf<T>& Func);
 
 // Every element := Value, or 0; the length is kept (ClearVector does not empty V).
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void FillVector(std::vector<T>& V, detail::ValueOf<T> Value);
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void ClearVector(std::vector<T>& V);
 
 // ============================================================================================
@@ -166,9 +168,9 @@ template <detail::FloatElement T>
 std::vector<T> MovingAverage(const std::vector<T>& V, LongWord Window, LongWord Offset);
 
 // The elements of V in reverse order, and an independent copy of V.
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 std::vector<T> ReverseVector(const std::vector<T>& V);
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 std::vector<T> CopyVector(const std::vector<T>& V);
 
 // ============================================================================================
@@ -269,7 +271,7 @@ Extended QENPolynomial(const TQENFloatVector& Coeffs, Extended X);
 // Sorts V in place, ascending or descending, by exact comparison: a non-recursive quick sort
 // with an explicit stack of Round(log2 N) + 2 entries; not stable. Fewer than two elements are
 // left alone.
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void QSortVector(std::vector<T>& V, bool Ascending);
 
 // Ranks: the 0-based first position, in a copy of V sorted in the chosen order, of a value

@@ -95,12 +95,12 @@ void TransformVector(std::vector<T>& V, const detail::TransformFuncOf<T>& Func) 
   detail::ApplyInPlace(V, [&Func](ValueOf<T> x) { return Func(x); });
 }
 
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void FillVector(std::vector<T>& V, detail::ValueOf<T> Value) {
   detail::FillElements(V, Value);
 }
 
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void ClearVector(std::vector<T>& V) {
   detail::ClearElements(V);
 }
@@ -122,12 +122,12 @@ std::vector<T> MovingAverage(const std::vector<T>& V, LongWord Window, LongWord 
   return result;
 }
 
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 std::vector<T> ReverseVector(const std::vector<T>& V) {
   return detail::Reversed(V);
 }
 
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 std::vector<T> CopyVector(const std::vector<T>& V) {
   return detail::CopyOf(V);
 }
@@ -216,11 +216,15 @@ TQENLIntVector Vector2LIntVector(const std::vector<T>& V) {
 
 using detail::SumOf;
 
+#define TOVRIN_INSTANTIATE(T)                                   \
+  template void FillVector(std::vector<T>&, ValueOf<T>);        \
+  template void ClearVector(std::vector<T>&);                   \
+  template std::vector<T> ReverseVector(const std::vector<T>&); \
+  template std::vector<T> CopyVector(const std::vector<T>&);
+TOVRIN_ALL_AND_MONEY_ELEMENTS(TOVRIN_INSTANTIATE)
+#undef TOVRIN_INSTANTIATE
+
 #define TOVRIN_INSTANTIATE(T)                                              \
-  template void FillVector(std::vector<T>&, ValueOf<T>);                   \
-  template void ClearVector(std::vector<T>&);                              \
-  template std::vector<T> ReverseVector(const std::vector<T>&);            \
-  template std::vector<T> CopyVector(const std::vector<T>&);               \
   template Extended VectorMagnitude(const std::vector<T>&);                \
   template TQENFloatVector Array2FloatVector(std::span<const ValueOf<T>>); \
   template TQENFloatVector Vector2FloatVector(const std::vector<T>&);

@@ -19,32 +19,32 @@ detail::SumOf<T> SumOfRuleTerms(const std::vector<T>& V, Term term) {
 
 }  // namespace
 
-template <detail::BuildableElement T>
+template <detail::BuildableOrMoneyElement T>
 void AppendValue2Vector(std::vector<T>& V, detail::ValueOf<T> Value) {
   detail::AppendElement(V, Value);
 }
 
-template <detail::BuildableElement T>
+template <detail::BuildableOrMoneyElement T>
 void AddValue2Vector(std::vector<T>& V, detail::ValueOf<T> Value, LongInt Index) {
   detail::InsertElement(V, Value, Index);
 }
 
-template <detail::BuildableElement T>
+template <detail::BuildableOrMoneyElement T>
 void DeleteValueFromVector(std::vector<T>& V, LongInt Index) {
   detail::DeleteElement(V, Index);
 }
 
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 detail::ValueOf<T> MaxVector(const std::vector<T>& V) {
   return detail::LargestElement(V);
 }
 
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 detail::ValueOf<T> MinVector(const std::vector<T>& V) {
   return detail::SmallestElement(V);
 }
 
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void MinMaxVector(const std::vector<T>& V, detail::ValueOf<T>& MinValue,
                   detail::ValueOf<T>& MaxValue, LongWord& MinIndex, LongWord& MaxIndex,
                   bool& MinUnique, bool& MaxUnique) {
@@ -110,8 +110,12 @@ using detail::SumOf;
   template ValueOf<T> MaxVector(const std::vector<T>&);                                  \
   template ValueOf<T> MinVector(const std::vector<T>&);                                  \
   template void MinMaxVector(const std::vector<T>&, ValueOf<T>&, ValueOf<T>&, LongWord&, \
-                             LongWord&, bool&, bool&);                                   \
-  template SumOf<T> SumVector(const std::vector<T>&);                                    \
+                             LongWord&, bool&, bool&);
+TOVRIN_ALL_AND_MONEY_ELEMENTS(TOVRIN_INSTANTIATE)
+#undef TOVRIN_INSTANTIATE
+
+#define TOVRIN_INSTANTIATE(T)                         \
+  template SumOf<T> SumVector(const std::vector<T>&); \
   template SumOf<T> SumSqVector(const std::vector<T>&);
 TOVRIN_ALL_ELEMENTS(TOVRIN_INSTANTIATE)
 #undef TOVRIN_INSTANTIATE
@@ -119,8 +123,11 @@ TOVRIN_ALL_ELEMENTS(TOVRIN_INSTANTIATE)
 #define TOVRIN_INSTANTIATE(T)                                          \
   template void AppendValue2Vector(std::vector<T>&, ValueOf<T>);       \
   template void AddValue2Vector(std::vector<T>&, ValueOf<T>, LongInt); \
-  template void DeleteValueFromVector(std::vector<T>&, LongInt);       \
-  template SumOf<T> SumSqDiffVector(const std::vector<T>&, ValueOf<T>);
+  template void DeleteValueFromVector(std::vector<T>&, LongInt);
+TOVRIN_BUILDABLE_AND_MONEY_ELEMENTS(TOVRIN_INSTANTIATE)
+#undef TOVRIN_INSTANTIATE
+
+#define TOVRIN_INSTANTIATE(T) template SumOf<T> SumSqDiffVector(const std::vector<T>&, ValueOf<T>);
 TOVRIN_BUILDABLE_ELEMENTS(TOVRIN_INSTANTIATE)
 #undef TOVRIN_INSTANTIATE
 

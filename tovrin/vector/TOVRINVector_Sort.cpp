@@ -8,7 +8,7 @@ namespace tovrin {
 
 using detail::ValueOf;
 
-template <detail::AnyElement T>
+template <detail::AnyOrMoneyElement T>
 void QSortVector(std::vector<T>& V, bool Ascending) {
   detail::QuickSortVector(V, Ascending);
 }
@@ -28,8 +28,11 @@ LongInt Vector2RankValue(const std::vector<T>& V, detail::ValueOf<T> Value, bool
   return detail::RankOfValue(V, Value, Ascending);
 }
 
+#define TOVRIN_INSTANTIATE(T) template void QSortVector(std::vector<T>&, bool);
+TOVRIN_ALL_AND_MONEY_ELEMENTS(TOVRIN_INSTANTIATE)
+#undef TOVRIN_INSTANTIATE
+
 #define TOVRIN_INSTANTIATE(T)                                             \
-  template void QSortVector(std::vector<T>&, bool);                       \
   template TQENLIntVector Vector2RankVector(const std::vector<T>&, bool); \
   template LongInt Vector2Rank(const std::vector<T>&, LongWord, bool);    \
   template LongInt Vector2RankValue(const std::vector<T>&, ValueOf<T>, bool);
