@@ -723,6 +723,10 @@ Extended InverseBetaLowerHalf(Extended p, Extended q, Extended a, Extended b, Be
     }
     const Extended density = v.factor / (pt.x * pt.y);
     Extended next = kNaN;
+    // Converged once the step falls below the rounding of x. The precise family stops a step
+    // earlier: Newton doubles and Halley triples the correct digits, so after a Newton step
+    // below 1e-10 of x, or a Halley step below 1e-7, the next iterate is exact.
+    Extended last_step = start.precise_powers ? 1e-10L : 4.0L * kEpsilon;
     if (density > 0.0L && std::isfinite(density)) {
       const Extended tail = use_lower ? v.lower : v.upper;
       if (target < 0.01L && tail > 0.0L) {
@@ -737,12 +741,15 @@ Extended InverseBetaLowerHalf(Extended p, Extended q, Extended a, Extended b, Be
         // Halley's correction with f'' / f' = (a - 1)/x - (b - 1)/y.
         const Extended curvature = (a - 1.0L) / pt.x - (b - 1.0L) / pt.y;
         Extended denom = 1.0L - 0.5L * step * curvature;
-        if (!(denom > 0.5L && denom < 2.0L)) denom = 1.0L;
+        if (!(denom > 0.5L && denom < 2.0L)) {
+          denom = 1.0L;
+        } else if (start.precise_powers) {
+          last_step = 1e-7L;
+        }
         next = x - step / denom;
       }
     }
-    // Converged once the step falls below the rounding of x.
-    if (std::fabs(next - x) <= 4.0L * kEpsilon * x) return std::fmin(std::fmax(next, lo), hi);
+    if (std::fabs(next - x) <= last_step * x) return std::fmin(std::fmax(next, lo), hi);
     if (next > hi && !hi_evaluated) {
       // The root may sit on the end of the half (I_{1/2} = p exactly): try the end itself.
       next = hi;
@@ -1125,7 +1132,8 @@ Extended BetaPowerFactor(Extended X, Extended XLo, Extended Y, Extended YLo, Ext
   return tovrin::BetaPowerFactor(p, A, B, BetaLambda(p, A, B));
 }
 
-BetaRoot InverseIncompleteBetaTails(Extended P, Extended Q, Extended A, Extended B) {
+BetaRoot InverseIncompleteBetaTails(Extended P, Extended Q, Extended A, Extended B,
+                                    const BetaRoot* Start) {
   if (AnyNaN(P, A, B) || std::isnan(Q)) return {kNaN, kNaN};
   if (P <= 0.0L) return {0.0L, 1.0L};
   if (Q <= 0.0L) return {1.0L, 0.0L};
@@ -1137,7 +1145,9 @@ BetaRoot InverseIncompleteBetaTails(Extended P, Extended Q, Extended A, Extended
     const Extended level = A < kTinyShape ? (B < kTinyShape ? B / (A + B) : 1.0L) : 0.0L;
     return P <= level ? BetaRoot{0.0L, 1.0L} : BetaRoot{1.0L, 0.0L};
   }
-  BetaPoint start = InverseBetaEstimate(P, Q, A, B);
+  BetaPoint start = Start != nullptr && Start->x > 0.0L && Start->y > 0.0L
+                        ? BetaPoint{Start->x, Start->y}
+                        : InverseBetaEstimate(P, Q, A, B);
   start.precise_powers = true;
   bool beyond_half = false;
   if (start.x <= 0.5L) {
