@@ -370,6 +370,12 @@ Extended PowerOfPair(Extended x_hi, Extended x_lo, Extended a, bool precise_powe
   return power * (1.0L + a * (x_lo / x_hi));
 }
 
+// Below this exponent E the precise family takes e^-E in one piece (an error of E times the
+// rounding of E); beyond the other, e^-E times any factor below sqrt(min(a, b)) is below the
+// smallest subnormal number.
+constexpr Extended kDirectExponent = 16.0L;
+constexpr Extended kBeyondRangeExponent = 11450.0L;
+
 // x^a y^b / B(a, b), the factor shared by the incomplete beta and its derivative (the density
 // is this divided by x y), for lambda = a y - b x. For large shapes it is written as
 //   (x c / a)^a (y c / b)^b sqrt(a b / (2 pi c)) exp(Delta(c) - Delta(a) - Delta(b)),  c = a + b.
@@ -385,6 +391,28 @@ Extended BetaPowerFactor(const BetaPoint& p, Extended a, Extended b, Extended la
   const Extended c = a + b;
   const Extended correction = StirlingRemainder(c) - StirlingRemainder(a) - StirlingRemainder(b);
   const Extended scale = std::sqrt(a) * std::sqrt(b / c) / kSqrt2Pi;
+  if (p.precise_powers) {
+    // The precise family forms the exponent E = a phi(ta) + b phi(tb) of the form below first:
+    // near the mean, where E is small, e^-E in one piece carries only E times the rounding of
+    // E, far inside the bound, at the cost of one exp instead of two powers; far beyond the
+    // range the result is 0. Where a t falls below -1/2 its term is a ln(x c / a) (or
+    // b ln(y c / b)), here only estimated.
+    const Extended ta = -lambda / a;
+    const Extended tb = lambda / b;
+    Extended exponent;
+    if (ta >= -0.5L && tb >= -0.5L) {
+      exponent = ShapeTimesPhi(a, ta, -lambda) + ShapeTimesPhi(b, tb, lambda);
+      if (exponent <= kDirectExponent) return scale * Exp80(correction - exponent);
+    } else if (ta < -0.5L) {
+      exponent = ShapeTimesPhi(b, tb, lambda) - lambda - a * (std::log(p.x) + std::log1p(b / a));
+    } else {
+      exponent = ShapeTimesPhi(a, ta, -lambda) + lambda - b * (std::log(p.y) + std::log1p(a / b));
+    }
+    if (exponent > kBeyondRangeExponent &&
+        exponent > kBeyondRangeExponent + 0.5L * std::log(std::fmin(a, b))) {
+      return 0.0L;
+    }
+  }
   {
     // Both powers from exact bases: near the mean and far from it alike, the result carries
     // only pow's rounding of each.
@@ -629,10 +657,10 @@ BetaValues HugeShapeBeta(const BetaPoint& p, Extended a, Extended b, Extended la
   return {tail, 1.0L - tail, factor};
 }
 
-BetaValues IncompleteBetaBoth(const BetaPoint& p, Extended a, Extended b) {
+// lambda = BetaLambda(p, a, b), as the caller has it.
+BetaValues IncompleteBetaBoth(const BetaPoint& p, Extended a, Extended b, Extended lambda) {
   // Below the mean (lambda >= 0) I_x is the smaller tail and is computed directly; above it
   // the complement I_y(b, a) is.
-  const Extended lambda = BetaLambda(p, a, b);
   const bool swap = lambda < 0.0L;
   const BetaPoint q = swap ? Swapped(p) : p;
   const Extended sa = swap ? b : a;
@@ -641,12 +669,18 @@ BetaValues IncompleteBetaBoth(const BetaPoint& p, Extended a, Extended b) {
   const Extended factor = BetaPowerFactor(q, sa, sb, swap ? -lambda : lambda);
   Extended tail;
   Extended other;
-  if (!LowerTailSmallB(q, sa, sb, factor, tail)) {
+  if (p.precise_powers && factor == 0.0L) {
+    tail = 0.0L;
+  } else if (!LowerTailSmallB(q, sa, sb, factor, tail)) {
     tail = factor * BetaContinuedFraction(q, sa, sb, std::fabs(lambda));
   }
   other = 1.0L - tail;
   if (swap) return {other, tail, factor};
   return {tail, other, factor};
+}
+
+BetaValues IncompleteBetaBoth(const BetaPoint& p, Extended a, Extended b) {
+  return IncompleteBetaBoth(p, a, b, BetaLambda(p, a, b));
 }
 
 bool AnyNaN(Extended a, Extended b, Extended c) {
@@ -1004,8 +1038,7 @@ Extended BetaLargeShapes(Extended a, Extended b, Extended lambda) {
 // IncompleteBetaBoth with the expansion above for two shapes beyond kLargeShapes near the mean.
 constexpr Extended kLargeShapes = 1000.0L;
 
-BetaValues IncompleteBetaBothLarge(const BetaPoint& p, Extended a, Extended b) {
-  const Extended lambda = BetaLambda(p, a, b);
+BetaValues IncompleteBetaBothLarge(const BetaPoint& p, Extended a, Extended b, Extended lambda) {
   const Extended smaller = std::fmin(a, b);
   if (smaller >= kLargeShapes && smaller <= kHugeShape && std::fabs(lambda) <= 0.03L * smaller) {
     const bool swap = lambda < 0.0L;
@@ -1015,7 +1048,7 @@ BetaValues IncompleteBetaBothLarge(const BetaPoint& p, Extended a, Extended b) {
     if (swap) return {1.0L - tail, tail, factor};
     return {tail, 1.0L - tail, factor};
   }
-  return IncompleteBetaBoth(p, a, b);
+  return IncompleteBetaBoth(p, a, b, lambda);
 }
 
 // Temme's expansion, Q = erfc(s) / 2 + e^-E / sqrt(2 pi a) sum_k C_k(eta) a^-k with
@@ -1109,12 +1142,13 @@ Tails IncompleteBetaTails(Extended X, Extended XLo, Extended Y, Extended YLo, Ex
     return A < kTinyShape ? Tails{1.0L, 0.0L} : Tails{0.0L, 1.0L};
   }
   const BetaPoint p{X, Y, XLo, YLo, true};
-  BetaValues v = IncompleteBetaBothLarge(p, A, B);
+  const Extended lambda = BetaLambda(p, A, B);
+  BetaValues v = IncompleteBetaBothLarge(p, A, B, lambda);
   // The side is chosen by the mean; for a very skewed shape the complement can still be small,
   // and then it is computed directly where the expansion for a small second shape applies.
   constexpr Extended kDirectBelow = 0.25L;
   if (std::fmin(A, B) <= kHugeShape) {
-    const bool lower_derived = BetaLambda(p, A, B) < 0.0L;
+    const bool lower_derived = lambda < 0.0L;
     Extended direct;
     if (lower_derived && v.lower < kDirectBelow && LowerTailSmallB(p, A, B, v.factor, direct)) {
       v.lower = direct;
