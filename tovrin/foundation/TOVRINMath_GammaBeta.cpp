@@ -26,10 +26,15 @@
 
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINMath.h"
+#include "tovrin/foundation/detail/Elementary.h"
 #include "tovrin/foundation/detail/IncompleteTails.h"
 
 namespace tovrin {
 namespace {
+
+using detail::Exp80;
+using detail::Ln80;
+using detail::Pow80;
 
 static_assert(std::numeric_limits<Extended>::digits == 64, "80-bit Extended expected");
 
@@ -824,26 +829,26 @@ Extended ExpMinusShapePhi(Extended a, Extended x) {
       k *= 2.0L;
       ++m;
     }
-    Extended h = std::pow(q, a / k) * std::exp(d.hi / k);
+    Extended h = Pow80(q, a / k) * Exp80(d.hi / k);
     if (k < exponent && std::isnormal(h)) {
       for (int i = 0; i < m; ++i) h *= h;
       if (std::isnormal(h)) return h * (1.0L + a * (q_lo / q)) * (1.0L + d.lo);
     }
   }
-  return std::exp(-exponent);
+  return Exp80(-exponent);
 }
 
 Extended GammaFactor(Extended a, Extended x) {
   if (x == 0.0L || std::isinf(x)) return 0.0L;
   if (a < kStirlingStart) {
-    const Extended power = std::pow(x, a);
-    const Extended decay = std::exp(-x);
+    const Extended power = detail::PrecisePower(x, a);
+    const Extended decay = Exp80(-x);
     const Extended r = power / GammaFinite(a) * decay;
     if (std::isnormal(power) && std::isnormal(decay) && std::isnormal(r)) return r;
     return std::exp(a * std::log(x) - x - LnGammaFinite(a));
   }
   // r = (x / a)^a e^(a - x) sqrt(a / (2 pi)) e^-Delta(a).
-  return ExpMinusShapePhi(a, x) * (std::sqrt(a) * kInvSqrt2Pi * std::exp(-StirlingSeries(a)));
+  return ExpMinusShapePhi(a, x) * (std::sqrt(a) * kInvSqrt2Pi * Exp80(-StirlingSeries(a)));
 }
 
 // 1 + x/(a+1) + x^2/((a+1)(a+2)) + ..., so that P(a, x) = r / a times it.
@@ -1023,12 +1028,14 @@ detail::Tails TemmeGammaTails(Extended a, Extended x, const ExactPair& t) {
   const Extended decay = ExpMinusShapePhi(a, x);
   const Extended half_erfc = 0.5L * decay * ScaledErfc(std::fabs(s));
   const Extended r = decay * kInvSqrt2Pi / std::sqrt(a) * sum;
+  // The density factor, as GammaFactor forms it.
+  const Extended factor = decay * (std::sqrt(a) * kInvSqrt2Pi * Exp80(-StirlingSeries(a)));
   if (eta >= 0.0L) {
     const Extended q = half_erfc + r;
-    return {1.0L - q, q};
+    return {1.0L - q, q, factor};
   }
   const Extended p = half_erfc - r;
-  return {p, 1.0L - p};
+  return {p, 1.0L - p, factor};
 }
 
 }  // namespace
@@ -1037,9 +1044,9 @@ namespace detail {
 
 Extended PrecisePower(Extended X, Extended A) {
   if (A == 0.5L) return std::sqrt(X);
-  const Extended e = A * std::log(X);
-  if (std::fabs(e) <= kExpLogPowerLimit) return std::exp(e);
-  return std::pow(X, A);
+  const Extended e = A * Ln80(X);
+  if (std::fabs(e) <= kExpLogPowerLimit) return Exp80(e);
+  return Pow80(X, A);
 }
 
 Extended GammaPowerFactor(Extended A, Extended X) {
@@ -1060,7 +1067,8 @@ Tails IncompleteGammaTails(Extended A, Extended X) {
     // bottom of the range, r / a would lose its digits to the subnormals).
     const Extended q = A == 0.5L ? ErfcOfSqrt(X) : ScaledUpperGamma(A, X, 0.0L);
     if (q <= 0.5L) return {1.0L - q, q};
-    return {GammaFactor(A, X) / A * LowerGammaSeries(A, X), q};
+    const Extended r = GammaFactor(A, X);
+    return {r / A * LowerGammaSeries(A, X), q, r};
   }
   if (A == 0.5L) {
     const Extended q = ErfcOfSqrt(X);
@@ -1070,14 +1078,14 @@ Tails IncompleteGammaTails(Extended A, Extended X) {
   if (A <= 1.0L) {
     // Legendre's fraction (or erfc for a = 1/2) scaled by r: Q / r.
     const Extended q = r * ScaledUpperGamma(A, X, std::log(r));
-    return {1.0L - q, q};
+    return {1.0L - q, q, r};
   }
   if (X < A + 1.0L) {
     const Extended p = r / A * LowerGammaSeries(A, X);
-    return {p, 1.0L - p};
+    return {p, 1.0L - p, r};
   }
   const Extended q = r * UpperGammaFraction(A, X);
-  return {1.0L - q, q};
+  return {1.0L - q, q, r};
 }
 
 Tails IncompleteBetaTails(Extended X, Extended XLo, Extended Y, Extended YLo, Extended A,
@@ -1108,7 +1116,7 @@ Tails IncompleteBetaTails(Extended X, Extended XLo, Extended Y, Extended YLo, Ex
       v.upper = direct;
     }
   }
-  return {v.lower, v.upper};
+  return {v.lower, v.upper, v.factor};
 }
 
 Extended BetaPowerFactor(Extended X, Extended XLo, Extended Y, Extended YLo, Extended A,

@@ -106,29 +106,47 @@ Extended InverseNormalLess(Extended P) {
 
 // --- Gamma inverse ----------------------------------------------------------------------------
 
-// The x with P(a, x) = p and Q(a, x) = q (q = 1 - p, each exact where it is the smaller):
-// Wilson and Hilferty's or the power-law first estimate, then Halley steps (Newton on the
-// logarithm far in a tail) kept inside a shrinking bracket.
+// First estimate of the x with P(a, x) = p and Q(a, x) = q: for a = 1/2, Q = 2 P(Z > sqrt(2x))
+// exactly; for a >= 1 Wilson and Hilferty's cube; otherwise, or where that fails, the lower
+// tail's power law x^a / Gamma(a + 1) (with its first correction, e^-x ~ 1 - a x / (a + 1))
+// while x is small, and the upper tail's x^(a - 1) e^-x / Gamma(a) (1 + (a - 1) / x) beyond,
+// solved by two fixed-point steps.
+Extended InverseGammaStart(Extended a, Extended p, Extended q) {
+  const bool use_lower = p <= q;
+  if (a == 0.5L && !use_lower) {
+    const Extended z = InverseNormalUpper(0.5L * q);
+    return 0.5L * z * z;
+  }
+  if (a >= 1.0L) {
+    // The classic inverse (good to about 1e-16) is enough for a start.
+    const Extended z = use_lower ? tovrin::InvNormalLess(p) : -tovrin::InvNormalLess(q);
+    const Extended base = 1.0L - 1.0L / (9.0L * a) + z / (3.0L * std::sqrt(a));
+    if (base > 0.1L) return a * base * base * base;
+  }
+  Extended x = std::exp((std::log(p) + LnGamma(a + 1.0L)) / a);
+  if (x < 0.5L || (use_lower && !(x > 1.0L))) {
+    x *= std::exp(x / (a + 1.0L));
+  } else {
+    const Extended level = -std::log(q) - LnGamma(a);
+    x = std::fmax(1.0L, level);
+    for (int i = 0; i < 2; ++i) {
+      x = std::fmax(1.0L, level + (a - 1.0L) * std::log(x) + std::log1p((a - 1.0L) / x));
+    }
+  }
+  if (!(x > 0.0L)) x = std::numeric_limits<Extended>::min();
+  if (std::isinf(x)) x = std::numeric_limits<Extended>::max();
+  return x;
+}
+
+// The x with P(a, x) = p and Q(a, x) = q (q = 1 - p, each exact where it is the smaller): the
+// first estimate above, then Halley steps (Newton on the logarithm far in a tail) kept inside a
+// shrinking bracket, each reusing the density factor that the tails formed.
 Extended InverseGamma(Extended a, Extended p, Extended q) {
   if (p <= 0.0L) return 0.0L;
   if (q <= 0.0L) return kInf;
   const bool use_lower = p <= q;
   const Extended target = use_lower ? p : q;
-  const Extended z = use_lower ? -InverseNormalUpper(p) : InverseNormalUpper(q);
-  Extended x = kNaN;
-  if (a >= 1.0L) {
-    const Extended base = 1.0L - 1.0L / (9.0L * a) + z / (3.0L * std::sqrt(a));
-    if (base > 0.1L) x = a * base * base * base;
-  }
-  if (!(x > 0.0L)) {
-    if (use_lower) {
-      x = std::exp((std::log(p) + LnGamma(a + 1.0L)) / a);
-    } else {
-      x = std::fmax(1.0L, -std::log(q) - LnGamma(a));
-    }
-    if (!(x > 0.0L)) x = std::numeric_limits<Extended>::min();
-    if (std::isinf(x)) x = std::numeric_limits<Extended>::max();
-  }
+  Extended x = InverseGammaStart(a, p, q);
   Extended lo = 0.0L;
   Extended hi = kInf;
   for (int i = 0; i < 400; ++i) {
@@ -140,9 +158,12 @@ Extended InverseGamma(Extended a, Extended p, Extended q) {
     } else {
       hi = x;
     }
-    const Extended density = detail::GammaPowerFactor(a, x) / x;
+    const Extended density = (std::isnan(t.factor) ? detail::GammaPowerFactor(a, x) : t.factor) / x;
     const Extended tail = use_lower ? t.lower : t.upper;
     Extended next = kNaN;
+    // Newton doubles and Halley triples the correct digits: a Newton step below 1e-10 of x, or a
+    // Halley step below 1e-7, leaves the next iterate exact to the working precision.
+    Extended last_step = 1e-10L;
     if (density > 0.0L && std::isfinite(density)) {
       if (target < 0.01L && tail > 0.0L) {
         const Extended g = use_lower ? std::log(tail / p) : std::log(q / tail);
@@ -151,13 +172,15 @@ Extended InverseGamma(Extended a, Extended p, Extended q) {
       } else {
         const Extended step = f / density;
         Extended denom = 1.0L - 0.5L * step * ((a - 1.0L) / x - 1.0L);
-        if (!(denom > 0.5L && denom < 2.0L)) denom = 1.0L;
+        if (denom > 0.5L && denom < 2.0L) {
+          last_step = 1e-7L;
+        } else {
+          denom = 1.0L;
+        }
         next = x - step / denom;
       }
     }
-    // Newton doubles and Halley triples the correct digits: a step below 1e-10 of x leaves the
-    // next iterate exact to the working precision.
-    if (std::fabs(next - x) <= 1e-10L * x) return std::fmin(std::fmax(next, lo), hi);
+    if (std::fabs(next - x) <= last_step * x) return std::fmin(std::fmax(next, lo), hi);
     if (!(next > lo && next < hi)) {
       if (std::isinf(hi)) {
         next = x * 16.0L;

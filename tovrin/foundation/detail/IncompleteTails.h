@@ -6,15 +6,20 @@
 // domain (NaN in, NaN out).
 #pragma once
 
+#include <limits>
+
 #include "tovrin/foundation/TOVRINGlobals.h"
 
 namespace tovrin::detail {
 
 // A probability and its complement, each computed directly where it is the smaller one (the
-// larger is 1 - the smaller, which loses nothing).
+// larger is 1 - the smaller, which loses nothing), and the factor of the density at the point
+// (X^A e^-X / Gamma(A), or x^A y^B / B(A, B)) where the tails formed it on the way, NaN where
+// they did not.
 struct Tails {
   Extended lower;
   Extended upper;
+  Extended factor = std::numeric_limits<Extended>::quiet_NaN();
 };
 
 // P(A, X) and Q(A, X), the regularised lower and upper incomplete gamma functions, for A > 0
