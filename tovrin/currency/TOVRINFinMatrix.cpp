@@ -5,24 +5,17 @@
 
 #include "tovrin/currency/detail/MoneyRules.h"
 #include "tovrin/detail/MatrixArithmetic.h"
+#include "tovrin/detail/MatrixShape.h"
 
 namespace tovrin {
 
 using detail::MatrixOf;
 using detail::MoneyRules;
 
-// The three pairs of creators, named for their matrix types.
-#define TOVRIN_DEFINE_CREATION(T, Name)                                   \
-  TQEN##Name##Matrix Create##Name##Matrix(LongWord Rows, LongWord Cols) { \
-    return detail::CreateMatrixOf<T>(Rows, Cols);                         \
-  }                                                                       \
-  TQEN##Name##Matrix Create##Name##IdentityMatrix(LongWord N) {           \
-    return detail::CreateIdentityOf(N, T{detail::kMoneyScale<T>});        \
-  }
-TOVRIN_DEFINE_CREATION(TQENCurrency, Curr)
-TOVRIN_DEFINE_CREATION(TQENLongCurrency, LongCurr)
-TOVRIN_DEFINE_CREATION(Currency, Currency)
-#undef TOVRIN_DEFINE_CREATION
+// The identity holds the amount 1 as its stored integer.
+TOVRIN_DEFINE_MATRIX_CREATION(TQENCurrency, Curr, detail::kMoneyScale<TQENCurrency>)
+TOVRIN_DEFINE_MATRIX_CREATION(TQENLongCurrency, LongCurr, detail::kMoneyScale<TQENLongCurrency>)
+TOVRIN_DEFINE_MATRIX_CREATION(Currency, Currency, detail::kMoneyScale<Currency>)
 
 template <detail::MoneyElement T>
 TQENFloatMatrix Matrix2FloatMatrix(const MatrixOf<T>& M) {

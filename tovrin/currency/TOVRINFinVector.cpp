@@ -47,41 +47,14 @@ T SumVector(const std::vector<T>& V) {
   return SumOf(V);
 }
 
-template <detail::MoneyElement T>
-bool VectorNonNegative(const std::vector<T>& V) {
-  using R = MoneyRules<T>;
-  return detail::EveryElement(V, [](T x) { return !R::IsNegative(x); });
-}
-
-template <detail::MoneyElement T>
-bool VectorNegative(const std::vector<T>& V) {
-  using R = MoneyRules<T>;
-  return detail::EveryElement(V, [](T x) { return R::IsNegative(x); });
-}
-
-template <detail::MoneyElement T>
-bool VectorNonPositive(const std::vector<T>& V) {
-  using R = MoneyRules<T>;
-  return detail::EveryElement(V, [](T x) { return !R::IsPositive(x); });
-}
-
-template <detail::MoneyElement T>
-bool VectorNonZero(const std::vector<T>& V) {
-  using R = MoneyRules<T>;
-  return detail::EveryElement(V, [](T x) { return !R::IsZero(x); });
-}
-
-template <detail::MoneyElement T>
-bool VectorZero(const std::vector<T>& V) {
-  using R = MoneyRules<T>;
-  return detail::EveryElement(V, [](T x) { return R::IsZero(x); });
-}
-
-template <detail::MoneyElement T>
-bool VectorPositive(const std::vector<T>& V) {
-  using R = MoneyRules<T>;
-  return detail::EveryElement(V, [](T x) { return R::IsPositive(x); });
-}
+#define TOVRIN_DEFINE_SIGN_PREDICATE(Name, Test)              \
+  template <detail::MoneyElement T>                           \
+  bool Name(const std::vector<T>& V) {                        \
+    using R = MoneyRules<T>;                                  \
+    return detail::EveryElement(V, [](T x) { return Test; }); \
+  }
+TOVRIN_SIGN_PREDICATES(TOVRIN_DEFINE_SIGN_PREDICATE)
+#undef TOVRIN_DEFINE_SIGN_PREDICATE
 
 template <detail::MoneyElement T>
 void LinearTransformVector(std::vector<T>& V, Extended A, Extended B) {

@@ -61,14 +61,7 @@ void CombineIntoMatrix(MatrixOf<T>& M1, const MatrixOf<T>& M2, OpFn Op) {
 template <typename T, typename OpFn>
 MatrixOf<T> MapMatrix(const MatrixOf<T>& M, OpFn Op) {
   if (M.empty()) RaiseMathError(rsMatrixIsEmpty);
-  MatrixOf<T> r(M.size());
-  for (std::size_t i = 0; i < M.size(); ++i) {
-    const auto& src = M[i];
-    auto& dst = r[i];
-    dst.resize(src.size());
-    for (std::size_t j = 0; j < src.size(); ++j) dst[j] = Op(src[j]);
-  }
-  return r;
+  return ConvertMatrixOf<T>(M, Op);
 }
 
 // M[i][j] := Op(M[i][j]) in place, every row at its own length; rsMatrixIsEmpty for no rows.

@@ -50,23 +50,6 @@ MatrixShape ShapeOf(const MatrixOf<T>& M) {
   return s;
 }
 
-// Every row has the length of row 0 (at least one row needed); the switch is not consulted.
-template <typename T>
-bool IsRectangularOf(const MatrixOf<T>& M) {
-  if (M.empty()) return false;
-  const std::size_t cols = M[0].size();
-  for (std::size_t i = 1; i < M.size(); ++i) {
-    if (M[i].size() != cols) return false;
-  }
-  return true;
-}
-
-template <typename T>
-bool IsSquareOf(const MatrixOf<T>& M) {
-  const MatrixShape s = ShapeOf(M);
-  return s.Rectangular && s.Rows == s.Cols;
-}
-
 template <typename T, typename U>
 bool SameDimensionsOf(const MatrixOf<T>& M1, const MatrixOf<U>& M2) {
   const MatrixShape s1 = ShapeOf(M1);
@@ -103,11 +86,16 @@ MatrixOf<T> CreateIdentityOf(LongWord N, T One) {
   return r;
 }
 
-// A deep copy keeping every row's own length.
-template <typename T>
-MatrixOf<T> CopyMatrixOf(const MatrixOf<T>& M) {
-  return M;
-}
+// The creators of one matrix type, which carry the type in their names: CreateNameMatrix
+// (Rows x Cols zeros) and CreateNameIdentityMatrix (One, the stored form of 1, on the
+// diagonal of N x N zeros) returning TQENNameMatrix, of element type T.
+#define TOVRIN_DEFINE_MATRIX_CREATION(T, Name, One)                       \
+  TQEN##Name##Matrix Create##Name##Matrix(LongWord Rows, LongWord Cols) { \
+    return detail::CreateMatrixOf<T>(Rows, Cols);                         \
+  }                                                                       \
+  TQEN##Name##Matrix Create##Name##IdentityMatrix(LongWord N) {           \
+    return detail::CreateIdentityOf<T>(N, T(One));                        \
+  }
 
 // A matrix of the same ragged shape whose elements are Convert(element).
 template <typename R, typename T, typename ConvertFn>

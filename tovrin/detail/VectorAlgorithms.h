@@ -54,26 +54,15 @@ void RequireElements(const std::vector<T>& V) {
   if (V.empty()) RaiseMathError(rsVectorIsEmpty);
 }
 
-// The largest element (the first of equals), compared exactly. Raises rsVectorIsEmpty.
-template <typename T>
-ValueOf<T> LargestElement(const std::vector<T>& V) {
+// The first element that no later one displaces: in index order, x replaces the one held when
+// Displaces(held, x). Raises rsVectorIsEmpty.
+template <typename T, typename DisplacesFn>
+ValueOf<T> ExtremeElement(const std::vector<T>& V, DisplacesFn Displaces) {
   RequireElements(V);
   ValueOf<T> result = V[0];
   for (std::size_t i = 1; i < V.size(); ++i) {
     const ValueOf<T> x = V[i];
-    if (result < x) result = x;
-  }
-  return result;
-}
-
-// The smallest element (the first of equals), compared exactly. Raises rsVectorIsEmpty.
-template <typename T>
-ValueOf<T> SmallestElement(const std::vector<T>& V) {
-  RequireElements(V);
-  ValueOf<T> result = V[0];
-  for (std::size_t i = 1; i < V.size(); ++i) {
-    const ValueOf<T> x = V[i];
-    if (x < result) result = x;
+    if (Displaces(result, x)) result = x;
   }
   return result;
 }
@@ -135,6 +124,18 @@ bool EveryElement(const std::vector<T>& V, Passes passes) {
   }
   return true;
 }
+
+// The six sign predicates, written once for the numeric and the money vectors: X(Name, Test)
+// for each, Test being what every element x must pass under the element rules R. A predicate
+// is true when every element passes (EveryElement: the visit stops at the first that fails,
+// rsVectorIsEmpty for an empty vector).
+#define TOVRIN_SIGN_PREDICATES(X)         \
+  X(VectorNonNegative, !R::IsNegative(x)) \
+  X(VectorNegative, R::IsNegative(x))     \
+  X(VectorNonZero, R::IsNonZero(x))       \
+  X(VectorZero, R::IsZero(x))             \
+  X(VectorNonPositive, !R::IsPositive(x)) \
+  X(VectorPositive, R::IsPositive(x))
 
 // --- Element-wise forms ----------------------------------------------------------------------
 

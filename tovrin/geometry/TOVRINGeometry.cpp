@@ -24,6 +24,11 @@ void CheckLengths(std::initializer_list<Extended> Lengths) {
 }
 
 Extended Sqr(Extended X) { return X * X; }
+// The perimeter of a regular polygon of Sides sides.
+Extended RegularPerimeter(int Sides, Extended Side) {
+  CheckLengths({Side});
+  return Sides * Side;
+}
 Extended Cube(Extended X) { return X * X * X; }
 
 // Heron's product s(s - a)(s - b)(s - c); below 0 the sides make no triangle.
@@ -166,25 +171,10 @@ Extended PerimeterSector(Extended R, Extended Angle) {
   return ArcLength(R, Angle) + 2 * R;
 }
 
-Extended PerimeterPentagon(Extended Side) {
-  CheckLengths({Side});
-  return 5 * Side;
-}
-
-Extended PerimeterHexagon(Extended Side) {
-  CheckLengths({Side});
-  return 6 * Side;
-}
-
-Extended PerimeterOctagon(Extended Side) {
-  CheckLengths({Side});
-  return 8 * Side;
-}
-
-Extended PerimeterDecagon(Extended Side) {
-  CheckLengths({Side});
-  return 10 * Side;
-}
+Extended PerimeterPentagon(Extended Side) { return RegularPerimeter(5, Side); }
+Extended PerimeterHexagon(Extended Side) { return RegularPerimeter(6, Side); }
+Extended PerimeterOctagon(Extended Side) { return RegularPerimeter(8, Side); }
+Extended PerimeterDecagon(Extended Side) { return RegularPerimeter(10, Side); }
 
 // --- Volumes ------------------------------------------------------------------------------------
 

@@ -19,69 +19,6 @@ using detail::MatrixOf;
 template <typename T>
 using Rules = detail::ElementRules<T>;
 
-// --- Shape queries ---
-
-template <typename T>
-void DimensionsOf(const MatrixOf<T>& M, LongWord& Rows, LongWord& Cols, bool& Rectangular) {
-  const detail::MatrixShape s = detail::ShapeOf(M);
-  Rows = s.Rows;
-  Cols = s.Cols;
-  Rectangular = s.Rectangular;
-}
-
-template <typename T>
-LongInt RowsOf(const MatrixOf<T>& M) {
-  return static_cast<LongInt>(M.size());
-}
-
-template <typename T>
-LongInt ColsOf(const MatrixOf<T>& M) {
-  return M.empty() ? 0 : static_cast<LongInt>(M[0].size());
-}
-
-template <typename T>
-TQENFloatMatrix ToFloatMatrix(const MatrixOf<T>& M) {
-  return detail::ConvertMatrixOf<PackedExtended>(
-      M, [](T x) { return PackedExtended(static_cast<Extended>(detail::ValueOf<T>(x))); });
-}
-
-// --- Arithmetic ---
-
-template <typename T>
-MatrixOf<T> AddOf(const MatrixOf<T>& M1, const MatrixOf<T>& M2) {
-  return detail::CombineMatrices(M1, M2, [](T a, T b) { return Rules<T>::Add(a, b); });
-}
-
-template <typename T>
-MatrixOf<T> SubtractOf(const MatrixOf<T>& M1, const MatrixOf<T>& M2) {
-  return detail::CombineMatrices(M1, M2, [](T a, T b) { return Rules<T>::Sub(a, b); });
-}
-
-template <typename T>
-void AddToOf(MatrixOf<T>& M1, const MatrixOf<T>& M2) {
-  detail::CombineIntoMatrix(M1, M2, [](T a, T b) { return Rules<T>::Add(a, b); });
-}
-
-template <typename T>
-void SubtractFromOf(MatrixOf<T>& M1, const MatrixOf<T>& M2) {
-  detail::CombineIntoMatrix(M1, M2, [](T a, T b) { return Rules<T>::Sub(a, b); });
-}
-
-template <typename T, typename K>
-MatrixOf<T> MultiplyByConstOf(const MatrixOf<T>& M, K k) {
-  return detail::MapMatrix(M, [k](T x) { return Rules<T>::Mul(k, x); });
-}
-
-template <typename T, typename K>
-void MultiplyByConstInPlaceOf(MatrixOf<T>& M, K k) {
-  detail::MapMatrixInPlace(M, [k](T x) { return Rules<T>::Mul(k, x); });
-}
-
-template <typename T, typename K>
-void LinearTransformOf(MatrixOf<T>& M, K a, K b) {
-  detail::MapMatrixInPlace(M, [a, b](T x) { return Rules<T>::Linear(x, a, b); });
-}
-
 // --- Element-wise functions ---
 
 // Visits every element in row-major order; an element outside the domain raises Ident at
@@ -100,90 +37,52 @@ void ElementWiseOf(MatrixOf<T>& M, TResStringId Ident, DomainFn InDomain, ValueF
 
 constexpr auto kAnyValue = [](Extended) { return true; };
 
-template <typename T>
-void SquareOf(MatrixOf<T>& M) {
-  ElementWiseOf(M, rsMatrixIsEmpty, kAnyValue, [](Extended x) { return x * x; });
-}
-
-template <typename T>
-void SqrtOf(MatrixOf<T>& M) {
-  ElementWiseOf(
-      M, rsMatrixNeg, [](Extended x) { return !(x < 0); }, [](Extended x) { return std::sqrt(x); });
-}
-
-template <typename T>
-void InvOf(MatrixOf<T>& M) {
-  ElementWiseOf(
-      M, rsMatrixZero, [](Extended x) { return x != 0; }, [](Extended x) { return 1 / x; });
-}
-
-template <typename T>
-void LnOf(MatrixOf<T>& M) {
-  ElementWiseOf(
-      M, rsMatrixNotPos, [](Extended x) { return !(x <= 0); },
-      [](Extended x) { return std::log(x); });
-}
-
-template <typename T>
-void Log10Of(MatrixOf<T>& M) {
-  ElementWiseOf(
-      M, rsMatrixNotPos, [](Extended x) { return !(x <= 0); },
-      [](Extended x) { return QENLog10(x); });
-}
-
-template <typename T>
-Extended GrandMeanOf(const MatrixOf<T>& M, LongWord& N) {
-  const Extended sum = detail::GrandSumOf(M, N, Extended{0}, [](Extended s, T x) {
-    return s + static_cast<Extended>(detail::ValueOf<T>(x));
-  });
-  return sum / static_cast<Extended>(N);
-}
-
 }  // namespace
 
 // --- Creation ---
-// The creation functions carry the type in their names: one pair per element type, the name
-// beside the stored element type in the order of the type list.
-#define TOVRIN_DEFINE_CREATION(T, Name)                                   \
-  TQEN##Name##Matrix Create##Name##Matrix(LongWord Rows, LongWord Cols) { \
-    return detail::CreateMatrixOf<T>(Rows, Cols);                         \
-  }                                                                       \
-  TQEN##Name##Matrix Create##Name##IdentityMatrix(LongWord N) {           \
-    return detail::CreateIdentityOf<T>(N, T(1));                          \
-  }
-TOVRIN_DEFINE_CREATION(PackedExtended, Float)
-TOVRIN_DEFINE_CREATION(Double, Double)
-TOVRIN_DEFINE_CREATION(Single, Single)
-TOVRIN_DEFINE_CREATION(Int64, Int64)
-TOVRIN_DEFINE_CREATION(LongWord, LWord)
-TOVRIN_DEFINE_CREATION(LongInt, LInt)
-TOVRIN_DEFINE_CREATION(Word, Word)
-TOVRIN_DEFINE_CREATION(SmallInt, SmallInt)
-TOVRIN_DEFINE_CREATION(Byte, Byte)
-TOVRIN_DEFINE_CREATION(ShortInt, SInt)
-#undef TOVRIN_DEFINE_CREATION
+// One pair per element type, the name beside the stored element type in the order of the type
+// list.
+TOVRIN_DEFINE_MATRIX_CREATION(PackedExtended, Float, 1)
+TOVRIN_DEFINE_MATRIX_CREATION(Double, Double, 1)
+TOVRIN_DEFINE_MATRIX_CREATION(Single, Single, 1)
+TOVRIN_DEFINE_MATRIX_CREATION(Int64, Int64, 1)
+TOVRIN_DEFINE_MATRIX_CREATION(LongWord, LWord, 1)
+TOVRIN_DEFINE_MATRIX_CREATION(LongInt, LInt, 1)
+TOVRIN_DEFINE_MATRIX_CREATION(Word, Word, 1)
+TOVRIN_DEFINE_MATRIX_CREATION(SmallInt, SmallInt, 1)
+TOVRIN_DEFINE_MATRIX_CREATION(Byte, Byte, 1)
+TOVRIN_DEFINE_MATRIX_CREATION(ShortInt, SInt, 1)
 
 // --- Shape queries ---
 template <detail::AnyElement T>
 LongInt MatrixRows(const detail::MatrixOf<T>& M) {
-  return RowsOf(M);
+  return static_cast<LongInt>(M.size());
 }
 template <detail::AnyElement T>
 LongInt MatrixCols(const detail::MatrixOf<T>& M) {
-  return ColsOf(M);
+  return M.empty() ? 0 : static_cast<LongInt>(M[0].size());
 }
 template <detail::AnyOrMoneyElement T>
 bool MatrixIsRectangular(const detail::MatrixOf<T>& M) {
-  return detail::IsRectangularOf(M);
+  if (M.empty()) return false;
+  const std::size_t cols = M[0].size();
+  for (std::size_t i = 1; i < M.size(); ++i) {
+    if (M[i].size() != cols) return false;
+  }
+  return true;
 }
 template <detail::AnyOrMoneyElement T>
 void MatrixDimensions(const detail::MatrixOf<T>& M, LongWord& Rows, LongWord& Cols,
                       bool& Rectangular) {
-  DimensionsOf(M, Rows, Cols, Rectangular);
+  const detail::MatrixShape s = detail::ShapeOf(M);
+  Rows = s.Rows;
+  Cols = s.Cols;
+  Rectangular = s.Rectangular;
 }
 template <detail::AnyOrMoneyElement T>
 bool MatrixIsSquare(const detail::MatrixOf<T>& M) {
-  return detail::IsSquareOf(M);
+  const detail::MatrixShape s = detail::ShapeOf(M);
+  return s.Rectangular && s.Rows == s.Cols;
 }
 template <detail::AnyOrMoneyElement T>
 bool MatricesSameDimensions(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
@@ -193,67 +92,77 @@ bool MatricesSameDimensions(const detail::MatrixOf<T>& M1, const detail::MatrixO
 // --- Conversion ---
 template <detail::AnyElement T>
 TQENFloatMatrix Matrix2FloatMatrix(const detail::MatrixOf<T>& M) {
-  return ToFloatMatrix(M);
+  return detail::ConvertMatrixOf<PackedExtended>(
+      M, [](T x) { return PackedExtended(static_cast<Extended>(detail::ValueOf<T>(x))); });
 }
 
 // --- Two-matrix arithmetic ---
 template <detail::ArithmeticElement T>
 detail::MatrixOf<T> AddMatrices(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
-  return AddOf(M1, M2);
+  return detail::CombineMatrices(M1, M2, [](T a, T b) { return Rules<T>::Add(a, b); });
 }
 template <detail::ArithmeticElement T>
 detail::MatrixOf<T> SubtractMatrices(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
-  return SubtractOf(M1, M2);
+  return detail::CombineMatrices(M1, M2, [](T a, T b) { return Rules<T>::Sub(a, b); });
 }
 template <detail::ArithmeticElement T>
 void AddToMatrix(detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
-  AddToOf(M1, M2);
+  detail::CombineIntoMatrix(M1, M2, [](T a, T b) { return Rules<T>::Add(a, b); });
 }
 template <detail::ArithmeticElement T>
 void SubtractFromMatrix(detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
-  SubtractFromOf(M1, M2);
+  detail::CombineIntoMatrix(M1, M2, [](T a, T b) { return Rules<T>::Sub(a, b); });
 }
 
 // --- Scalar arithmetic ---
 template <detail::ArithmeticElement T>
 detail::MatrixOf<T> MultiplyMatrixByConst(const detail::MatrixOf<T>& M, detail::ScalarOf<T> K) {
-  return MultiplyByConstOf(M, K);
+  return detail::MapMatrix(M, [K](T x) { return Rules<T>::Mul(K, x); });
 }
 template <detail::ArithmeticElement T>
 void MultiplyMatrixByConst2(detail::MatrixOf<T>& M, detail::ScalarOf<T> K) {
-  MultiplyByConstInPlaceOf(M, K);
+  detail::MapMatrixInPlace(M, [K](T x) { return Rules<T>::Mul(K, x); });
 }
 template <detail::ArithmeticElement T>
 void LinearTransformMatrix(detail::MatrixOf<T>& M, detail::ScalarOf<T> A, detail::ScalarOf<T> B) {
-  LinearTransformOf(M, A, B);
+  detail::MapMatrixInPlace(M, [A, B](T x) { return Rules<T>::Linear(x, A, B); });
 }
 
 // --- Element-wise functions ---
 template <detail::FloatElement T>
 void SquareMatrix(detail::MatrixOf<T>& M) {
-  SquareOf(M);
+  ElementWiseOf(M, rsMatrixIsEmpty, kAnyValue, [](Extended x) { return x * x; });
 }
 template <detail::FloatElement T>
 void SqrtMatrix(detail::MatrixOf<T>& M) {
-  SqrtOf(M);
+  ElementWiseOf(
+      M, rsMatrixNeg, [](Extended x) { return !(x < 0); }, [](Extended x) { return std::sqrt(x); });
 }
 template <detail::FloatElement T>
 void InvMatrix(detail::MatrixOf<T>& M) {
-  InvOf(M);
+  ElementWiseOf(
+      M, rsMatrixZero, [](Extended x) { return x != 0; }, [](Extended x) { return 1 / x; });
 }
 template <detail::FloatElement T>
 void LnMatrix(detail::MatrixOf<T>& M) {
-  LnOf(M);
+  ElementWiseOf(
+      M, rsMatrixNotPos, [](Extended x) { return !(x <= 0); },
+      [](Extended x) { return std::log(x); });
 }
 template <detail::FloatElement T>
 void Log10Matrix(detail::MatrixOf<T>& M) {
-  Log10Of(M);
+  ElementWiseOf(
+      M, rsMatrixNotPos, [](Extended x) { return !(x <= 0); },
+      [](Extended x) { return QENLog10(x); });
 }
 
 // --- Aggregate ---
 template <detail::ArithmeticElement T>
 Extended GrandMean(const detail::MatrixOf<T>& M, LongWord& N) {
-  return GrandMeanOf(M, N);
+  const Extended sum = detail::GrandSumOf(M, N, Extended{0}, [](Extended s, T x) {
+    return s + static_cast<Extended>(detail::ValueOf<T>(x));
+  });
+  return sum / static_cast<Extended>(N);
 }
 
 using detail::MatrixOf;

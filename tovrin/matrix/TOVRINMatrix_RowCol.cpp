@@ -7,6 +7,7 @@
 #include "tovrin/detail/ElementRules.h"
 #include "tovrin/detail/MatrixRowCol.h"
 #include "tovrin/detail/MatrixShape.h"
+#include "tovrin/detail/QuickSort.h"
 #include "tovrin/matrix/TOVRINMatrix.h"
 
 namespace tovrin {
@@ -17,68 +18,91 @@ using detail::MatrixOf;
 template <typename T>
 using Rules = detail::ElementRules<T>;
 
+enum class Line { kRow, kCol };
+
+// The index checks of the operations on rows (columns): rsInvalidRow (rsInvalidCol) unless both
+// indices are below the row (column) count of s; then, with the shape switch off, a row too
+// short for the columns touched raises rsMatrixRect (memory guard).
+template <typename T>
+void CheckIndices(const MatrixOf<T>& M, const detail::MatrixShape& s, Line On, LongWord Index1,
+                  LongWord Index2) {
+  if (On == Line::kRow) {
+    if (Index1 >= s.Rows || Index2 >= s.Rows) detail::RaiseMathError(rsInvalidRow);
+    detail::RequireRowReaches(M[Index1], s.Cols);
+    detail::RequireRowReaches(M[Index2], s.Cols);
+  } else {
+    if (Index1 >= s.Cols || Index2 >= s.Cols) detail::RaiseMathError(rsInvalidCol);
+    detail::RequireRowsReach(M, std::size_t{std::max(Index1, Index2)} + 1);
+  }
+}
+
+// The checks of the in-place row and column operations and the sums, in order:
+// rsMatrixIsEmpty, rsMatrixRect, then the index checks.
+template <typename T>
+detail::MatrixShape CheckOperation(const MatrixOf<T>& M, Line On, LongWord Index1,
+                                   LongWord Index2) {
+  const detail::MatrixShape s = detail::ShapeOf(M);
+  if (s.Rows == 0 || s.Cols == 0) detail::RaiseMathError(rsMatrixIsEmpty);
+  if (!s.Rectangular) detail::RaiseMathError(rsMatrixRect);
+  CheckIndices(M, s, On, Index1, Index2);
+  return s;
+}
+
+// The shape extraction and overwriting work on: none (Cols 0, nothing checked) for a matrix
+// with no rows or columns, else the shape after the index checks.
+template <typename T>
+detail::MatrixShape LineShape(const MatrixOf<T>& M, Line On, LongWord Index) {
+  const detail::MatrixShape s = detail::ShapeOf(M);
+  if (s.Rows == 0 || s.Cols == 0) return detail::MatrixShape{};
+  CheckIndices(M, s, On, Index, Index);
+  return s;
+}
+
 // Exactly 1: for Int64 both 32-bit halves are compared with those of 1, which is the same.
 template <typename K>
 bool IsExactlyOne(K k) {
   return k == K(1);
 }
 
-template <typename T, typename K>
-void ScaleRowOf(MatrixOf<T>& M, LongWord Row, K k) {
-  if (IsExactlyOne(k)) return;
-  const detail::MatrixShape s = detail::CheckRowOperation(M, Row, Row);
-  T* row = M[Row].data();
-  for (std::size_t j = 0; j < s.Cols; ++j) row[j] = Rules<T>::Mul(k, row[j]);
-}
-
-template <typename T, typename K>
-void ScaleColOf(MatrixOf<T>& M, LongWord Col, K k) {
-  if (IsExactlyOne(k)) return;
-  detail::CheckColOperation(M, Col, Col);
-  for (auto& row : M) row[Col] = Rules<T>::Mul(k, row[Col]);
-}
-
-template <typename T, typename K>
-void AddRowsOf(MatrixOf<T>& M, LongWord Row1, LongWord Row2, K k) {
-  const detail::MatrixShape s = detail::CheckRowOperation(M, Row1, Row2);
-  T* changed = M[Row1].data();
-  const T* added = M[Row2].data();
-  for (std::size_t j = 0; j < s.Cols; ++j) {
-    changed[j] = Rules<T>::AddScaled(changed[j], k, added[j]);
-  }
-}
-
-template <typename T, typename K>
-void AddColsOf(MatrixOf<T>& M, LongWord Col1, LongWord Col2, K k) {
-  detail::CheckColOperation(M, Col1, Col2);
-  for (auto& row : M) row[Col1] = Rules<T>::AddScaled(row[Col1], k, row[Col2]);
-}
-
 // Elements summed as SumVector sums them: in Extended for floats, in a wrapping Int64 (each
 // element sign- or zero-extended) for integers.
 template <typename T>
-using SumType = detail::SumOf<T>;
-
-template <typename T>
-SumType<T> Accumulate(SumType<T> sum, T x) {
+detail::SumOf<T> Accumulate(detail::SumOf<T> sum, T x) {
   return Rules<T>::SumAdd(sum, Rules<T>::SumTerm(x));
 }
 
-template <typename T>
-SumType<T> SumRowOf(const MatrixOf<T>& M, LongWord Row) {
-  const detail::MatrixShape s = detail::CheckRowOperation(M, Row, Row);
-  SumType<T> sum = 0;
-  const T* row = M[Row].data();
-  for (std::size_t j = 0; j < s.Cols; ++j) sum = Accumulate<T>(sum, row[j]);
-  return sum;
-}
+// --- Sorts ---
 
+// The two matrix sorts: whole rows ordered by their element in column Index, or whole
+// columns by their element in row Index, by the explicit-stack quick sort. Nothing is
+// checked or done unless there are at least two rows and two columns; then rsMatrixRect, then
+// rsInvalidCol (rsInvalidRow).
 template <typename T>
-SumType<T> SumColOf(const MatrixOf<T>& M, LongWord Col) {
-  detail::CheckColOperation(M, Col, Col);
-  SumType<T> sum = 0;
-  for (const auto& row : M) sum = Accumulate<T>(sum, row[Col]);
-  return sum;
+void QSortLinesOf(MatrixOf<T>& M, Line Sorted, LongWord Index, bool Ascending) {
+  using Value = detail::ValueOf<T>;
+  const detail::MatrixShape s = detail::ShapeOf(M);
+  if (!(s.Rows > 1 && s.Cols > 1)) return;
+  if (!s.Rectangular) detail::RaiseMathError(rsMatrixRect);
+  const bool sortRows = Sorted == Line::kRow;
+  if (Index >= (sortRows ? s.Cols : s.Rows))
+    detail::RaiseMathError(sortRows ? rsInvalidCol : rsInvalidRow);
+  detail::RequireRowsReach(M, s.Cols);
+  auto less = [](const Value& a, const Value& b) { return a < b; };
+  if (sortRows) {
+    const std::size_t cols = s.Cols;
+    auto key = [&M, Index](LongInt p) { return static_cast<Value>(M[p - 1][Index]); };
+    auto swap = [&M, cols](LongInt p, LongInt q) {
+      if (p != q) detail::SwapRowElements(M, p - 1, q - 1, cols);
+    };
+    detail::QuickSortPositions(static_cast<LongInt>(s.Rows), Ascending, key, less, swap);
+  } else {
+    const T* keys = M[Index].data();  // the key row's storage never moves during the sort
+    auto key = [keys](LongInt p) { return static_cast<Value>(keys[p - 1]); };
+    auto swap = [&M](LongInt p, LongInt q) {
+      if (p != q) detail::SwapColElements(M, p - 1, q - 1);
+    };
+    detail::QuickSortPositions(static_cast<LongInt>(s.Cols), Ascending, key, less, swap);
+  }
 }
 
 // --- Matrix product ---
@@ -186,69 +210,110 @@ MatrixOf<T> MultiplyOf(const MatrixOf<T>& M1, const MatrixOf<T>& M2) {
 // --- Swaps ---
 template <detail::AnyOrMoneyElement T>
 void SwapMatrixRows(detail::MatrixOf<T>& M, LongWord Row1, LongWord Row2) {
-  detail::SwapRowsOf(M, Row1, Row2);
+  if (Row1 == Row2) return;
+  const detail::MatrixShape s = CheckOperation(M, Line::kRow, Row1, Row2);
+  detail::SwapRowElements(M, Row1, Row2, s.Cols);
 }
 template <detail::AnyOrMoneyElement T>
 void SwapMatrixCols(detail::MatrixOf<T>& M, LongWord Col1, LongWord Col2) {
-  detail::SwapColsOf(M, Col1, Col2);
+  if (Col1 == Col2) return;
+  CheckOperation(M, Line::kCol, Col1, Col2);
+  detail::SwapColElements(M, Col1, Col2);
 }
 
 // --- Scaling and adding multiples ---
 template <detail::ArithmeticElement T>
 void ScaleMatrixRow(detail::MatrixOf<T>& M, LongWord Row, detail::ScalarOf<T> K) {
-  ScaleRowOf(M, Row, K);
+  if (IsExactlyOne(K)) return;
+  const detail::MatrixShape s = CheckOperation(M, Line::kRow, Row, Row);
+  T* row = M[Row].data();
+  for (std::size_t j = 0; j < s.Cols; ++j) row[j] = Rules<T>::Mul(K, row[j]);
 }
 template <detail::ArithmeticElement T>
 void ScaleMatrixCol(detail::MatrixOf<T>& M, LongWord Col, detail::ScalarOf<T> K) {
-  ScaleColOf(M, Col, K);
+  if (IsExactlyOne(K)) return;
+  CheckOperation(M, Line::kCol, Col, Col);
+  for (auto& row : M) row[Col] = Rules<T>::Mul(K, row[Col]);
 }
 template <detail::ArithmeticElement T>
 void AddMatrixRows(detail::MatrixOf<T>& M, LongWord Row1, LongWord Row2, detail::ScalarOf<T> K) {
-  AddRowsOf(M, Row1, Row2, K);
+  const detail::MatrixShape s = CheckOperation(M, Line::kRow, Row1, Row2);
+  T* changed = M[Row1].data();
+  const T* added = M[Row2].data();
+  for (std::size_t j = 0; j < s.Cols; ++j) {
+    changed[j] = Rules<T>::AddScaled(changed[j], K, added[j]);
+  }
 }
 template <detail::ArithmeticElement T>
 void AddMatrixCols(detail::MatrixOf<T>& M, LongWord Col1, LongWord Col2, detail::ScalarOf<T> K) {
-  AddColsOf(M, Col1, Col2, K);
+  CheckOperation(M, Line::kCol, Col1, Col2);
+  for (auto& row : M) row[Col1] = Rules<T>::AddScaled(row[Col1], K, row[Col2]);
 }
 
 // --- Sorts ---
 template <detail::AnyOrMoneyElement T>
 void QSortMatrixRowsOnCol(detail::MatrixOf<T>& M, LongWord Col, bool Ascending) {
-  detail::QSortRowsOnColOf(M, Col, Ascending);
+  QSortLinesOf(M, Line::kRow, Col, Ascending);
 }
 template <detail::AnyOrMoneyElement T>
 void QSortMatrixColsOnRow(detail::MatrixOf<T>& M, LongWord Row, bool Ascending) {
-  detail::QSortColsOnRowOf(M, Row, Ascending);
+  QSortLinesOf(M, Line::kCol, Row, Ascending);
 }
 
 // --- Extraction and overwriting ---
+// Empty for a matrix with no rows or columns (so also for a ragged matrix under the switch),
+// else the first Cols elements of the row.
 template <detail::AnyOrMoneyElement T>
 std::vector<T> ExtractMatrixRow(const detail::MatrixOf<T>& M, LongWord Row) {
-  return detail::ExtractRowOf(M, Row);
+  const detail::MatrixShape s = LineShape(M, Line::kRow, Row);
+  if (s.Cols == 0) return {};
+  return std::vector<T>(M[Row].begin(), M[Row].begin() + s.Cols);
 }
 template <detail::AnyOrMoneyElement T>
 std::vector<T> ExtractMatrixCol(const detail::MatrixOf<T>& M, LongWord Col) {
-  return detail::ExtractColOf(M, Col);
+  const detail::MatrixShape s = LineShape(M, Line::kCol, Col);
+  if (s.Cols == 0) return {};
+  std::vector<T> r(s.Rows);
+  for (std::size_t i = 0; i < s.Rows; ++i) r[i] = M[i][Col];
+  return r;
 }
 template <detail::AnyOrMoneyElement T>
 void OverwriteMatrixRow(detail::MatrixOf<T>& M, LongWord Row, const std::vector<T>& V,
                         detail::ValueOf<T> Fill) {
-  detail::OverwriteRowOf(M, Row, V, Fill);
+  const detail::MatrixShape s = LineShape(M, Line::kRow, Row);
+  if (s.Cols == 0) return;
+  const std::size_t kept = std::min<std::size_t>(V.size(), s.Cols);
+  T* dst = M[Row].data();
+  std::copy(V.begin(), V.begin() + kept, dst);
+  const T fill = Fill;
+  std::fill(dst + kept, dst + s.Cols, fill);
 }
 template <detail::AnyOrMoneyElement T>
 void OverwriteMatrixCol(detail::MatrixOf<T>& M, LongWord Col, const std::vector<T>& V,
                         detail::ValueOf<T> Fill) {
-  detail::OverwriteColOf(M, Col, V, Fill);
+  const detail::MatrixShape s = LineShape(M, Line::kCol, Col);
+  if (s.Cols == 0) return;
+  const T fill = Fill;
+  for (std::size_t i = 0; i < s.Rows; ++i) M[i][Col] = i < V.size() ? V[i] : fill;
 }
 
 // --- Copy, transpose, product ---
 template <detail::AnyOrMoneyElement T>
 detail::MatrixOf<T> CopyMatrix(const detail::MatrixOf<T>& M) {
-  return detail::CopyMatrixOf(M);
+  return M;
 }
 template <detail::AnyOrMoneyElement T>
 detail::MatrixOf<T> TransposeMatrix(const detail::MatrixOf<T>& M) {
-  return detail::TransposeOf(M);
+  const detail::MatrixShape s = detail::ShapeOf(M);
+  if (!s.Rectangular) detail::RaiseMathError(rsMatrixRect);
+  if (s.Rows == 0 || s.Cols == 0) return {};
+  detail::RequireRowsReach(M, s.Cols);
+  MatrixOf<T> r(s.Cols, std::vector<T>(s.Rows));
+  for (std::size_t i = 0; i < s.Rows; ++i) {
+    const T* src = M[i].data();
+    for (std::size_t j = 0; j < s.Cols; ++j) r[j][i] = src[j];
+  }
+  return r;
 }
 template <detail::FloatElement T>
 detail::MatrixOf<T> MultiplyMatrices(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
@@ -258,11 +323,18 @@ detail::MatrixOf<T> MultiplyMatrices(const detail::MatrixOf<T>& M1, const detail
 // --- Sums ---
 template <detail::RowSumElement T>
 detail::SumOf<T> SumMatrixRow(const detail::MatrixOf<T>& M, LongWord Row) {
-  return SumRowOf(M, Row);
+  const detail::MatrixShape s = CheckOperation(M, Line::kRow, Row, Row);
+  detail::SumOf<T> sum = 0;
+  const T* row = M[Row].data();
+  for (std::size_t j = 0; j < s.Cols; ++j) sum = Accumulate<T>(sum, row[j]);
+  return sum;
 }
 template <detail::RowSumElement T>
 detail::SumOf<T> SumMatrixCol(const detail::MatrixOf<T>& M, LongWord Col) {
-  return SumColOf(M, Col);
+  CheckOperation(M, Line::kCol, Col, Col);
+  detail::SumOf<T> sum = 0;
+  for (const auto& row : M) sum = Accumulate<T>(sum, row[Col]);
+  return sum;
 }
 
 using detail::MatrixOf;

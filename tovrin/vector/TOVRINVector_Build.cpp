@@ -36,12 +36,12 @@ void DeleteValueFromVector(std::vector<T>& V, LongInt Index) {
 
 template <detail::AnyOrMoneyElement T>
 detail::ValueOf<T> MaxVector(const std::vector<T>& V) {
-  return detail::LargestElement(V);
+  return detail::ExtremeElement(V, [](ValueOf<T> held, ValueOf<T> x) { return held < x; });
 }
 
 template <detail::AnyOrMoneyElement T>
 detail::ValueOf<T> MinVector(const std::vector<T>& V) {
-  return detail::SmallestElement(V);
+  return detail::ExtremeElement(V, [](ValueOf<T> held, ValueOf<T> x) { return x < held; });
 }
 
 template <detail::AnyOrMoneyElement T>
@@ -79,30 +79,14 @@ Extended SumSqDiffVector(const std::vector<T>& V, Extended Mean) {
       [](Extended s, Extended t) { return s + t; });
 }
 
-template <detail::SignedElement T>
-bool VectorNonNegative(const std::vector<T>& V) {
-  return detail::EveryElement(V, [](ValueOf<T> x) { return !ElementRules<T>::IsNegative(x); });
-}
-template <detail::SignedElement T>
-bool VectorNegative(const std::vector<T>& V) {
-  return detail::EveryElement(V, [](ValueOf<T> x) { return ElementRules<T>::IsNegative(x); });
-}
-template <detail::SignedElement T>
-bool VectorNonZero(const std::vector<T>& V) {
-  return detail::EveryElement(V, [](ValueOf<T> x) { return ElementRules<T>::IsNonZero(x); });
-}
-template <detail::SignedElement T>
-bool VectorZero(const std::vector<T>& V) {
-  return detail::EveryElement(V, [](ValueOf<T> x) { return ElementRules<T>::IsZero(x); });
-}
-template <detail::SignedElement T>
-bool VectorNonPositive(const std::vector<T>& V) {
-  return detail::EveryElement(V, [](ValueOf<T> x) { return !ElementRules<T>::IsPositive(x); });
-}
-template <detail::SignedElement T>
-bool VectorPositive(const std::vector<T>& V) {
-  return detail::EveryElement(V, [](ValueOf<T> x) { return ElementRules<T>::IsPositive(x); });
-}
+#define TOVRIN_DEFINE_SIGN_PREDICATE(Name, Test)                       \
+  template <detail::SignedElement T>                                   \
+  bool Name(const std::vector<T>& V) {                                 \
+    using R = ElementRules<T>;                                         \
+    return detail::EveryElement(V, [](ValueOf<T> x) { return Test; }); \
+  }
+TOVRIN_SIGN_PREDICATES(TOVRIN_DEFINE_SIGN_PREDICATE)
+#undef TOVRIN_DEFINE_SIGN_PREDICATE
 
 using detail::SumOf;
 

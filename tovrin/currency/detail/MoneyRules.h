@@ -12,6 +12,7 @@
 #pragma once
 
 #include <cstdint>
+#include <type_traits>
 
 #include "tovrin/currency/TOVRINFinancials.h"
 #include "tovrin/foundation/TOVRINFoundation.h"
@@ -21,67 +22,53 @@ namespace tovrin::detail {
 template <typename T>
 struct MoneyRules;
 
-template <>
-struct MoneyRules<TQENCurrency> {
-  using T = TQENCurrency;
-  static constexpr std::uint32_t U(T x) { return static_cast<std::uint32_t>(StoredOf(x)); }
-  static constexpr T FromBits(std::uint32_t x) { return T(static_cast<LongInt>(x)); }
+// What the three types share: the stored integers (as Bits, the unsigned type of their width)
+// add, subtract and sum with wrap-around; products by K are rounded with RoundWrapping and kept
+// to the width; the linear transform works on the amount through the conversion services; a
+// mean is the sum divided by N, rounded to the nearest unit, halves to even; the sign tests
+// compare the stored integer exactly with 0.
+template <typename T, typename Bits>
+struct WrappingMoneyRules {
+  using Stored = std::make_signed_t<Bits>;
+  static constexpr Bits U(T x) { return static_cast<Bits>(StoredOf(x)); }
+  static constexpr T FromBits(Bits x) { return T(static_cast<Stored>(x)); }
   static T Add(T a, T b) { return FromBits(U(a) + U(b)); }
   static T Sub(T a, T b) { return FromBits(U(a) - U(b)); }
-  static T Mul(Extended K, T x) { return WrapToCurr(RoundWrapping(K * StoredOf(x))); }
-  static T Linear(T x, Extended A, Extended B) {
-    return Float2QENCurrency(Currency2Float(x) * A + B);
+  static T Mul(Extended K, T x) {
+    return FromBits(static_cast<Bits>(RoundWrapping(K * StoredOf(x))));
   }
-  // Round(Sum / N) of the 32-bit wrapping sum.
-  using Sum = std::uint32_t;
+  static T Linear(T x, Extended A, Extended B) { return Float2Money<T>(Currency2Float(x) * A + B); }
+  using Sum = Bits;
   static Sum AddToSum(Sum s, T x) { return s + U(x); }
   static T MeanOf(Sum s, LongWord N) {
-    return T(static_cast<LongInt>(DivRoundHalfEven(static_cast<LongInt>(s), N)));
+    return T(static_cast<Stored>(DivRoundHalfEven(static_cast<Stored>(s), N)));
   }
   static bool IsNegative(T x) { return StoredOf(x) < 0; }
   static bool IsPositive(T x) { return StoredOf(x) > 0; }
   static bool IsZero(T x) { return StoredOf(x) == 0; }
+  static bool IsNonZero(T x) { return StoredOf(x) != 0; }
 };
 
+// 32-bit wrapping sums and products.
 template <>
-struct MoneyRules<TQENLongCurrency> {
-  using T = TQENLongCurrency;
-  static constexpr std::uint64_t U(T x) { return static_cast<std::uint64_t>(StoredOf(x)); }
-  static constexpr T FromBits(std::uint64_t x) { return T(static_cast<Int64>(x)); }
-  static T Add(T a, T b) { return FromBits(U(a) + U(b)); }
-  static T Sub(T a, T b) { return FromBits(U(a) - U(b)); }
-  static T Mul(Extended K, T x) { return T(RoundWrapping(K * StoredOf(x))); }
-  static T Linear(T x, Extended A, Extended B) {
-    return Float2QENLongCurrency(Currency2Float(x) * A + B);
-  }
-  using Sum = std::uint64_t;
-  static Sum AddToSum(Sum s, T x) { return s + U(x); }
-  static T MeanOf(Sum s, LongWord N) { return T(DivRoundHalfEven(static_cast<Int64>(s), N)); }
-  static bool IsNegative(T x) { return StoredOf(x) < 0; }
-  static bool IsPositive(T x) { return StoredOf(x) > 0; }
-  static bool IsZero(T x) { return StoredOf(x) == 0; }
-};
+struct MoneyRules<TQENCurrency> : WrappingMoneyRules<TQENCurrency, std::uint32_t> {};
 
 template <>
-struct MoneyRules<Currency> {
+struct MoneyRules<TQENLongCurrency> : WrappingMoneyRules<TQENLongCurrency, std::uint64_t> {};
+
+// Summed in 64 bits, exact while the sum stays within them (beyond, it wraps).
+template <>
+struct MoneyRules<Currency> : WrappingMoneyRules<Currency, std::uint64_t> {
   using T = Currency;
-  static constexpr std::uint64_t U(T x) { return static_cast<std::uint64_t>(StoredOf(x)); }
-  static constexpr T FromBits(std::uint64_t x) { return T(static_cast<Int64>(x)); }
-  static T Add(T a, T b) { return FromBits(U(a) + U(b)); }
-  static T Sub(T a, T b) { return FromBits(U(a) - U(b)); }
-  static T Mul(Extended K, T x) { return T(RoundWrapping(K * StoredOf(x))); }
   // stored x A + B x 10000: B is an amount, not a stored unit.
   static T Linear(T x, Extended A, Extended B) {
     return T(RoundWrapping(StoredOf(x) * A + B * kMoneyScale<Currency>));
   }
-  // Summed in 64 bits, exact while the sum stays within them (beyond, it wraps).
-  using Sum = std::uint64_t;
-  static Sum AddToSum(Sum s, T x) { return s + U(x); }
-  static T MeanOf(Sum s, LongWord N) { return T(DivRoundHalfEven(static_cast<Int64>(s), N)); }
   // The amount against the tolerance, as the float vectors do.
   static bool IsNegative(T x) { return FloatIsNegative(Currency2Float(x)); }
   static bool IsPositive(T x) { return FloatIsPositive(Currency2Float(x)); }
   static bool IsZero(T x) { return FloatIsZero(Currency2Float(x)); }
+  static bool IsNonZero(T x) { return !FloatIsZero(Currency2Float(x)); }
 };
 
 // Equality of ranking: SameCurrency on Currency values that carry the stored integers as
