@@ -22,25 +22,7 @@ TQENFloatMatrix Matrix2FloatMatrix(const MatrixOf<T>& M) {
   return detail::ConvertMatrixOf<PackedExtended>(M, [](T x) { return Currency2Float(x); });
 }
 
-template <detail::MoneyElement T>
-MatrixOf<T> AddMatrices(const MatrixOf<T>& M1, const MatrixOf<T>& M2) {
-  return detail::CombineMatrices(M1, M2, &MoneyRules<T>::Add);
-}
-
-template <detail::MoneyElement T>
-void AddToMatrix(MatrixOf<T>& M1, const MatrixOf<T>& M2) {
-  detail::CombineIntoMatrix(M1, M2, &MoneyRules<T>::Add);
-}
-
-template <detail::MoneyElement T>
-MatrixOf<T> SubtractMatrices(const MatrixOf<T>& M1, const MatrixOf<T>& M2) {
-  return detail::CombineMatrices(M1, M2, &MoneyRules<T>::Sub);
-}
-
-template <detail::MoneyElement T>
-void SubtractFromMatrix(MatrixOf<T>& M1, const MatrixOf<T>& M2) {
-  detail::CombineIntoMatrix(M1, M2, &MoneyRules<T>::Sub);
-}
+TOVRIN_DEFINE_MATRIX_COMBINATIONS(detail::MoneyElement, MoneyRules)
 
 template <detail::MoneyElement T>
 MatrixOf<T> MultiplyMatrixByConst(const MatrixOf<T>& M, Extended K) {
@@ -64,15 +46,12 @@ T GrandMean(const MatrixOf<T>& M, LongWord& N) {
   return R::MeanOf(sum, N);
 }
 
-#define TOVRIN_INSTANTIATE(T)                                                    \
-  template TQENFloatMatrix Matrix2FloatMatrix(const MatrixOf<T>&);               \
-  template MatrixOf<T> AddMatrices(const MatrixOf<T>&, const MatrixOf<T>&);      \
-  template void AddToMatrix(MatrixOf<T>&, const MatrixOf<T>&);                   \
-  template MatrixOf<T> SubtractMatrices(const MatrixOf<T>&, const MatrixOf<T>&); \
-  template void SubtractFromMatrix(MatrixOf<T>&, const MatrixOf<T>&);            \
-  template MatrixOf<T> MultiplyMatrixByConst(const MatrixOf<T>&, Extended);      \
-  template void MultiplyMatrixByConst2(MatrixOf<T>&, Extended);                  \
-  template void LinearTransformMatrix(MatrixOf<T>&, Extended, Extended);         \
+#define TOVRIN_INSTANTIATE(T)                                               \
+  TOVRIN_INSTANTIATE_MATRIX_COMBINATIONS(T)                                 \
+  template TQENFloatMatrix Matrix2FloatMatrix(const MatrixOf<T>&);          \
+  template MatrixOf<T> MultiplyMatrixByConst(const MatrixOf<T>&, Extended); \
+  template void MultiplyMatrixByConst2(MatrixOf<T>&, Extended);             \
+  template void LinearTransformMatrix(MatrixOf<T>&, Extended, Extended);    \
   template T GrandMean(const MatrixOf<T>&, LongWord&);
 TOVRIN_MONEY_ELEMENTS(TOVRIN_INSTANTIATE)
 #undef TOVRIN_INSTANTIATE

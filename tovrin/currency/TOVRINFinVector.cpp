@@ -47,14 +47,7 @@ T SumVector(const std::vector<T>& V) {
   return SumOf(V);
 }
 
-#define TOVRIN_DEFINE_SIGN_PREDICATE(Name, Test)              \
-  template <detail::MoneyElement T>                           \
-  bool Name(const std::vector<T>& V) {                        \
-    using R = MoneyRules<T>;                                  \
-    return detail::EveryElement(V, [](T x) { return Test; }); \
-  }
-TOVRIN_SIGN_PREDICATES(TOVRIN_DEFINE_SIGN_PREDICATE)
-#undef TOVRIN_DEFINE_SIGN_PREDICATE
+TOVRIN_DEFINE_SIGN_PREDICATES(detail::MoneyElement, MoneyRules)
 
 template <detail::MoneyElement T>
 void LinearTransformVector(std::vector<T>& V, Extended A, Extended B) {
@@ -66,25 +59,7 @@ TQENFloatVector Vector2FloatVector(const std::vector<T>& V) {
   return ConvertedOf<PackedExtended>(V, [](T x) { return PackedExtended(Currency2Float(x)); });
 }
 
-template <detail::MoneyElement T>
-std::vector<T> AddVectors(const std::vector<T>& V1, const std::vector<T>& V2) {
-  return detail::Combined(V1, V2, &MoneyRules<T>::Add);
-}
-
-template <detail::MoneyElement T>
-void AddToVector(std::vector<T>& V1, const std::vector<T>& V2) {
-  detail::CombineInto(V1, V2, &MoneyRules<T>::Add);
-}
-
-template <detail::MoneyElement T>
-std::vector<T> SubtractVectors(const std::vector<T>& V1, const std::vector<T>& V2) {
-  return detail::Combined(V1, V2, &MoneyRules<T>::Sub);
-}
-
-template <detail::MoneyElement T>
-void SubtractFromVector(std::vector<T>& V1, const std::vector<T>& V2) {
-  detail::CombineInto(V1, V2, &MoneyRules<T>::Sub);
-}
+TOVRIN_DEFINE_VECTOR_COMBINATIONS(detail::MoneyElement, MoneyRules)
 
 template <detail::MoneyElement T>
 TQENLIntVector Vector2RankVector(const std::vector<T>& V, bool Ascending) {
@@ -124,22 +99,14 @@ TOVRIN_DEFINE_CONVERSIONS(Currency, Currency, QENCurrency2Currency, QENLongCurre
                           Same<Currency>, CurrencyFromFloat)
 #undef TOVRIN_DEFINE_CONVERSIONS
 
-#define TOVRIN_INSTANTIATE(T)                                                            \
-  template T SumVector(const std::vector<T>&);                                           \
-  template bool VectorNonNegative(const std::vector<T>&);                                \
-  template bool VectorNegative(const std::vector<T>&);                                   \
-  template bool VectorNonPositive(const std::vector<T>&);                                \
-  template bool VectorNonZero(const std::vector<T>&);                                    \
-  template bool VectorZero(const std::vector<T>&);                                       \
-  template bool VectorPositive(const std::vector<T>&);                                   \
-  template void LinearTransformVector(std::vector<T>&, Extended, Extended);              \
-  template TQENFloatVector Vector2FloatVector(const std::vector<T>&);                    \
-  template std::vector<T> AddVectors(const std::vector<T>&, const std::vector<T>&);      \
-  template void AddToVector(std::vector<T>&, const std::vector<T>&);                     \
-  template std::vector<T> SubtractVectors(const std::vector<T>&, const std::vector<T>&); \
-  template void SubtractFromVector(std::vector<T>&, const std::vector<T>&);              \
-  template TQENLIntVector Vector2RankVector(const std::vector<T>&, bool);                \
-  template LongInt Vector2Rank(const std::vector<T>&, LongWord, bool);                   \
+#define TOVRIN_INSTANTIATE(T)                                               \
+  TOVRIN_INSTANTIATE_SIGN_PREDICATES(T)                                     \
+  TOVRIN_INSTANTIATE_VECTOR_COMBINATIONS(T)                                 \
+  template T SumVector(const std::vector<T>&);                              \
+  template void LinearTransformVector(std::vector<T>&, Extended, Extended); \
+  template TQENFloatVector Vector2FloatVector(const std::vector<T>&);       \
+  template TQENLIntVector Vector2RankVector(const std::vector<T>&, bool);   \
+  template LongInt Vector2Rank(const std::vector<T>&, LongWord, bool);      \
   template LongInt Vector2RankValue(const std::vector<T>&, T, bool);
 TOVRIN_MONEY_ELEMENTS(TOVRIN_INSTANTIATE)
 #undef TOVRIN_INSTANTIATE

@@ -9,6 +9,8 @@
 // precision for floats and exact for integers.
 #pragma once
 
+#include <functional>
+
 #include "tovrin/foundation/TOVRINElementTypes.h"
 #include "tovrin/foundation/TOVRINGlobals.h"
 #include "tovrin/foundation/TOVRINMath.h"
@@ -80,39 +82,39 @@ struct FloatRules {
   static bool IsNonZero(Value x) { return !FloatIsZero(x); }
 };
 
-template <>
-struct ElementRules<PackedExtended> : FloatRules<PackedExtended> {};
-template <>
-struct ElementRules<Extended> : FloatRules<Extended> {};
-template <>
-struct ElementRules<Double> : FloatRules<Double> {};
+// Extended (as stored and as a value), Double and, but for its non-zero test, Single.
+template <typename T>
+concept FloatValueElement = FloatElement<StoredElementOf<T>>;
+template <FloatValueElement T>
+struct ElementRules<T> : FloatRules<T> {};
 // The Single non-zero test compares with 0 exactly, unlike its Extended and Double siblings.
 template <>
 struct ElementRules<Single> : FloatRules<Single> {
   static bool IsNonZero(Single x) { return x != 0; }
 };
 
+// Int64 and LongInt: sums, differences, scaling and products wrap at the element's own width.
+template <typename T>
+struct WrappingIntegerRules : IntegerRules<T> {
+  using Scalar = T;
+  static constexpr T Add(T a, T b) { return Wrapping(a, b, std::plus<>{}); }
+  static constexpr T Sub(T a, T b) { return Wrapping(a, b, std::minus<>{}); }
+  static constexpr T Mul(T k, T x) { return Wrapping(k, x, std::multiplies<>{}); }
+  // a + k x b
+  static constexpr T AddScaled(T a, T k, T b) { return Add(a, Mul(k, b)); }
+  // x A + B
+  static constexpr T Linear(T x, T A, T B) { return Add(Mul(x, A), B); }
+  static constexpr Int64 Product(T a, T b) { return static_cast<Int64>(Mul(a, b)); }
+  static constexpr Extended PairSum(T a, T b) { return static_cast<Extended>(Add(a, b)); }
+};
+
 // Int64: everything wraps modulo 2^64; the sign tests are exact, except that the non-zero
 // test asks FloatIsZero of the widened element.
 template <>
-struct ElementRules<Int64> : IntegerRules<Int64> {
-  using Scalar = Int64;
+struct ElementRules<Int64> : WrappingIntegerRules<Int64> {
   static constexpr Int64 SquareTerm(Int64 x) { return WrappingMul64(x, x); }
   static constexpr Int64 Square(Int64 x) { return WrappingMul64(x, x); }
-  static constexpr Int64 Add(Int64 a, Int64 b) { return WrappingAdd64(a, b); }
-  static constexpr Int64 Sub(Int64 a, Int64 b) { return WrappingSub64(a, b); }
-  static constexpr Int64 Mul(Int64 k, Int64 x) { return WrappingMul64(k, x); }
-  static constexpr Int64 AddScaled(Int64 a, Int64 k, Int64 b) {
-    return WrappingAdd64(a, WrappingMul64(k, b));
-  }
-  static constexpr Int64 Linear(Int64 x, Int64 A, Int64 B) {
-    return WrappingAdd64(WrappingMul64(x, A), B);
-  }
-  static constexpr Int64 Product(Int64 a, Int64 b) { return WrappingMul64(a, b); }
   static constexpr Int64 DeviationSquare(Int64 x, Int64 Mean) { return SquaredDifference(x, Mean); }
-  static constexpr Extended PairSum(Int64 a, Int64 b) {
-    return static_cast<Extended>(WrappingAdd64(a, b));
-  }
   static constexpr bool kWrappingMoments = true;
   static constexpr bool IsNegative(Int64 x) { return x < 0; }
   static constexpr bool IsPositive(Int64 x) { return x > 0; }
@@ -143,27 +145,11 @@ struct ElementRules<LongWord> : IntegerRules<LongWord> {
 // LongInt: squares and products keep the low 32 bits, sign-extended; sums, differences and
 // scaling wrap in 32 bits.
 template <>
-struct ElementRules<LongInt> : IntegerRules<LongInt> {
-  using Scalar = LongInt;
+struct ElementRules<LongInt> : WrappingIntegerRules<LongInt> {
   static constexpr Int64 SquareTerm(LongInt x) { return WrappingSquare32(x); }
   static constexpr LongInt Square(LongInt x) { return static_cast<LongInt>(WrappingSquare32(x)); }
-  static constexpr LongInt Add(LongInt a, LongInt b) { return WrappingAdd32(a, b); }
-  static constexpr LongInt Sub(LongInt a, LongInt b) { return WrappingSub32(a, b); }
-  static constexpr LongInt Mul(LongInt k, LongInt x) { return WrappingMul32(k, x); }
-  static constexpr LongInt AddScaled(LongInt a, LongInt k, LongInt b) {
-    return WrappingAdd32(a, WrappingMul32(k, b));
-  }
-  static constexpr LongInt Linear(LongInt x, LongInt A, LongInt B) {
-    return WrappingAdd32(WrappingMul32(x, A), B);
-  }
-  static constexpr Int64 Product(LongInt a, LongInt b) {
-    return static_cast<Int64>(WrappingMul32(a, b));
-  }
   static constexpr Int64 DeviationSquare(LongInt x, LongInt Mean) {
     return WrappingSquare32(WrappingSub32(x, Mean));
-  }
-  static constexpr Extended PairSum(LongInt a, LongInt b) {
-    return static_cast<Extended>(Add(a, b));
   }
 };
 
@@ -173,14 +159,10 @@ template <typename T>
 struct NarrowIntegerRules : IntegerRules<T> {
   static constexpr Int64 SquareTerm(T x) { return WrappingSquare32(x); }
 };
-template <>
-struct ElementRules<Word> : NarrowIntegerRules<Word> {};
-template <>
-struct ElementRules<SmallInt> : NarrowIntegerRules<SmallInt> {};
-template <>
-struct ElementRules<Byte> : NarrowIntegerRules<Byte> {};
-template <>
-struct ElementRules<ShortInt> : NarrowIntegerRules<ShortInt> {};
+template <typename T>
+concept NarrowIntegerElement = IntegerElement<T> && !WideIntegerElement<T>;
+template <NarrowIntegerElement T>
+struct ElementRules<T> : NarrowIntegerRules<T> {};
 
 // Equality of two elements as ranking and the modal tests see it.
 template <typename T>

@@ -7,6 +7,7 @@
 #include <utility>
 
 #include "tovrin/detail/MatrixShape.h"
+#include "tovrin/detail/VectorAlgorithms.h"
 #include "tovrin/foundation/TOVRINErrors.h"
 
 namespace tovrin::detail {
@@ -33,7 +34,7 @@ std::size_t CheckTwoMatrixOperands(const MatrixOf<T>& M1, const MatrixOf<T>& M2)
 
 // r[i][j] = Op(M1[i][j], M2[i][j]) over M1's Rows x Cols.
 template <typename T, typename OpFn>
-MatrixOf<T> CombineMatrices(const MatrixOf<T>& M1, const MatrixOf<T>& M2, OpFn Op) {
+MatrixOf<T> Combined(const MatrixOf<T>& M1, const MatrixOf<T>& M2, OpFn Op) {
   const std::size_t cols = CheckTwoMatrixOperands(M1, M2);
   MatrixOf<T> r(M1.size(), std::vector<T>(cols));
   for (std::size_t i = 0; i < M1.size(); ++i) {
@@ -48,7 +49,7 @@ MatrixOf<T> CombineMatrices(const MatrixOf<T>& M1, const MatrixOf<T>& M2, OpFn O
 // M1[i][j] := Op(M1[i][j], M2[i][j]) over M1's Rows x Cols (elements of a longer row of M1
 // beyond Cols are left alone).
 template <typename T, typename OpFn>
-void CombineIntoMatrix(MatrixOf<T>& M1, const MatrixOf<T>& M2, OpFn Op) {
+void CombineInto(MatrixOf<T>& M1, const MatrixOf<T>& M2, OpFn Op) {
   const std::size_t cols = CheckTwoMatrixOperands(M1, M2);
   for (std::size_t i = 0; i < M1.size(); ++i) {
     T* a = M1[i].data();
@@ -89,3 +90,16 @@ Acc GrandSumOf(const MatrixOf<T>& M, LongWord& N, Acc Sum, AddFn Add) {
 }
 
 }  // namespace tovrin::detail
+
+// The two-matrix sums and differences, written once for the numeric and the money matrices
+// by the entry of the vector combinations (VectorAlgorithms.h):
+// TOVRIN_DEFINE_MATRIX_COMBINATIONS(Concept, Rules) defines AddMatrices, AddToMatrix,
+// SubtractMatrices and SubtractFromMatrix for the element types of Concept with the element
+// rules Rules<T>; TOVRIN_INSTANTIATE_MATRIX_COMBINATIONS(T) instantiates them for T.
+#define TOVRIN_MATRIX_COMBINATIONS(X, A, B)                \
+  X(A, B, detail::MatrixOf, AddMatrices, AddToMatrix, Add) \
+  X(A, B, detail::MatrixOf, SubtractMatrices, SubtractFromMatrix, Sub)
+#define TOVRIN_DEFINE_MATRIX_COMBINATIONS(Concept, Rules) \
+  TOVRIN_MATRIX_COMBINATIONS(TOVRIN_DETAIL_COMBINATION, Concept, Rules)
+#define TOVRIN_INSTANTIATE_MATRIX_COMBINATIONS(T) \
+  TOVRIN_MATRIX_COMBINATIONS(TOVRIN_DETAIL_COMBINATION_OF, T, )

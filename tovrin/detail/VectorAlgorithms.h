@@ -125,17 +125,57 @@ bool EveryElement(const std::vector<T>& V, Passes passes) {
   return true;
 }
 
-// The six sign predicates, written once for the numeric and the money vectors: X(Name, Test)
-// for each, Test being what every element x must pass under the element rules R. A predicate
-// is true when every element passes (EveryElement: the visit stops at the first that fails,
-// rsVectorIsEmpty for an empty vector).
-#define TOVRIN_SIGN_PREDICATES(X)         \
-  X(VectorNonNegative, !R::IsNegative(x)) \
-  X(VectorNegative, R::IsNegative(x))     \
-  X(VectorNonZero, R::IsNonZero(x))       \
-  X(VectorZero, R::IsZero(x))             \
-  X(VectorNonPositive, !R::IsPositive(x)) \
-  X(VectorPositive, R::IsPositive(x))
+// --- Families written once for the numeric and the money vectors --------------------------
+// TOVRIN_DEFINE_...(Concept, Rules) defines a family's public templates for the element types
+// of Concept with the element rules Rules<T> (ElementRules or MoneyRules);
+// TOVRIN_INSTANTIATE_...(T) instantiates them for T.
+
+// The six sign predicates: true when every element passes its test (EveryElement: the visit
+// stops at the first that fails, rsVectorIsEmpty for an empty vector).
+#define TOVRIN_SIGN_PREDICATES(X, A, B)         \
+  X(A, B, VectorNonNegative, !R::IsNegative(x)) \
+  X(A, B, VectorNegative, R::IsNegative(x))     \
+  X(A, B, VectorNonZero, R::IsNonZero(x))       \
+  X(A, B, VectorZero, R::IsZero(x))             \
+  X(A, B, VectorNonPositive, !R::IsPositive(x)) \
+  X(A, B, VectorPositive, R::IsPositive(x))
+#define TOVRIN_DETAIL_SIGN_PREDICATE(Concept, Rules, Name, Test)               \
+  template <Concept T>                                                         \
+  bool Name(const std::vector<T>& V) {                                         \
+    using R = Rules<T>;                                                        \
+    return detail::EveryElement(V, [](detail::ValueOf<T> x) { return Test; }); \
+  }
+#define TOVRIN_DETAIL_SIGN_PREDICATE_OF(T, Unused, Name, Test) \
+  template bool Name(const std::vector<T>&);
+#define TOVRIN_DEFINE_SIGN_PREDICATES(Concept, Rules) \
+  TOVRIN_SIGN_PREDICATES(TOVRIN_DETAIL_SIGN_PREDICATE, Concept, Rules)
+#define TOVRIN_INSTANTIATE_SIGN_PREDICATES(T) \
+  TOVRIN_SIGN_PREDICATES(TOVRIN_DETAIL_SIGN_PREDICATE_OF, T, )
+
+// Element-by-element sums and differences: a new vector, and in place into V1
+// (rsSameDimensions for unequal lengths). The matrix families (MatrixArithmetic.h) are
+// defined by the same entry, with Container detail::MatrixOf.
+#define TOVRIN_VECTOR_COMBINATIONS(X, A, B)          \
+  X(A, B, std::vector, AddVectors, AddToVector, Add) \
+  X(A, B, std::vector, SubtractVectors, SubtractFromVector, Sub)
+#define TOVRIN_DETAIL_COMBINATION(Concept, Rules, Container, Producer, InPlace, Op)             \
+  template <Concept T>                                                                          \
+  Container<T> Producer(const Container<T>& X1, const Container<T>& X2) {                       \
+    return detail::Combined(                                                                    \
+        X1, X2, [](detail::ValueOf<T> a, detail::ValueOf<T> b) { return Rules<T>::Op(a, b); }); \
+  }                                                                                             \
+  template <Concept T>                                                                          \
+  void InPlace(Container<T>& X1, const Container<T>& X2) {                                      \
+    detail::CombineInto(                                                                        \
+        X1, X2, [](detail::ValueOf<T> a, detail::ValueOf<T> b) { return Rules<T>::Op(a, b); }); \
+  }
+#define TOVRIN_DETAIL_COMBINATION_OF(T, Unused, Container, Producer, InPlace, Op) \
+  template Container<T> Producer(const Container<T>&, const Container<T>&);       \
+  template void InPlace(Container<T>&, const Container<T>&);
+#define TOVRIN_DEFINE_VECTOR_COMBINATIONS(Concept, Rules) \
+  TOVRIN_VECTOR_COMBINATIONS(TOVRIN_DETAIL_COMBINATION, Concept, Rules)
+#define TOVRIN_INSTANTIATE_VECTOR_COMBINATIONS(T) \
+  TOVRIN_VECTOR_COMBINATIONS(TOVRIN_DETAIL_COMBINATION_OF, T, )
 
 // --- Element-wise forms ----------------------------------------------------------------------
 

@@ -148,22 +148,26 @@ class EMathError : public std::exception {
   std::string message_;
 };
 
-class EConvertError : public std::exception {
+namespace detail {
+// An exception that carries the text what() returns.
+class MessageException : public std::exception {
  public:
-  explicit EConvertError(std::string Message) : message_(std::move(Message)) {}
+  explicit MessageException(std::string Message) : message_(std::move(Message)) {}
   const char* what() const noexcept override { return message_.c_str(); }
 
  private:
   std::string message_;
 };
+}  // namespace detail
 
-class EAccessViolation : public std::exception {
+class EConvertError : public detail::MessageException {
  public:
-  explicit EAccessViolation(std::string Message) : message_(std::move(Message)) {}
-  const char* what() const noexcept override { return message_.c_str(); }
+  using MessageException::MessageException;
+};
 
- private:
-  std::string message_;
+class EAccessViolation : public detail::MessageException {
+ public:
+  using MessageException::MessageException;
 };
 
 namespace detail {

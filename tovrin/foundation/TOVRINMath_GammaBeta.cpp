@@ -22,6 +22,7 @@
 #include <cmath>
 #include <cstdint>
 #include <limits>
+#include <optional>
 #include <utility>
 
 #include "tovrin/foundation/TOVRINErrors.h"
@@ -687,6 +688,22 @@ bool AnyNaN(Extended a, Extended b, Extended c) {
   return std::isnan(a) || std::isnan(b) || std::isnan(c);
 }
 
+// The edges IncompleteBeta and its inverse share, for their variable U in [0, 1] (X or P): a
+// NaN gives NaN; a shape <= 0 or U outside [0, 1] raises rsArgOutsideDomain; U = 0 and U = 1
+// give 0 and 1; an infinite A gives AtInfiniteA, an infinite B the other end, both NaN. Empty
+// when none of these decides the value.
+std::optional<Extended> BetaEdge(Extended U, Extended A, Extended B, Extended AtInfiniteA) {
+  if (AnyNaN(U, A, B)) return kNaN;
+  if (A <= 0.0L || B <= 0.0L || U < 0.0L || U > 1.0L) detail::RaiseMathError(rsArgOutsideDomain);
+  if (U == 0.0L) return 0.0L;
+  if (U == 1.0L) return 1.0L;
+  if (std::isinf(A) || std::isinf(B)) {
+    if (std::isinf(A) && std::isinf(B)) return kNaN;
+    return std::isinf(A) ? AtInfiniteA : 1.0L - AtInfiniteA;
+  }
+  return std::nullopt;
+}
+
 // First estimate of the x with I_x(a, b) = p, returned as the pair (x, 1 - x) so that a root
 // near 1 keeps its distance from 1.
 BetaPoint InverseBetaEstimate(Extended p, Extended q, Extended a, Extended b) {
@@ -1226,14 +1243,7 @@ Extended Beta(Extended A, Extended B) {
 }
 
 Extended IncompleteBeta(Extended X, Extended A, Extended B) {
-  if (AnyNaN(X, A, B)) return kNaN;
-  if (A <= 0.0L || B <= 0.0L || X < 0.0L || X > 1.0L) detail::RaiseMathError(rsArgOutsideDomain);
-  if (X == 0.0L) return 0.0L;
-  if (X == 1.0L) return 1.0L;
-  if (std::isinf(A) || std::isinf(B)) {
-    if (std::isinf(A) && std::isinf(B)) return kNaN;
-    return std::isinf(A) ? 0.0L : 1.0L;
-  }
+  if (const std::optional<Extended> edge = BetaEdge(X, A, B, 0.0L)) return *edge;
   if (A < kTinyShape || B < kTinyShape) {
     // The mass sits at the two ends, B / (A + B) of it at 0; anything else in I_x is below
     // A |ln x| + B |ln y| < 2^-64.
@@ -1244,14 +1254,7 @@ Extended IncompleteBeta(Extended X, Extended A, Extended B) {
 }
 
 Extended InverseIncompleteBeta(Extended P, Extended A, Extended B) {
-  if (AnyNaN(P, A, B)) return kNaN;
-  if (A <= 0.0L || B <= 0.0L || P < 0.0L || P > 1.0L) detail::RaiseMathError(rsArgOutsideDomain);
-  if (P == 0.0L) return 0.0L;
-  if (P == 1.0L) return 1.0L;
-  if (std::isinf(A) || std::isinf(B)) {
-    if (std::isinf(A) && std::isinf(B)) return kNaN;
-    return std::isinf(A) ? 1.0L : 0.0L;
-  }
+  if (const std::optional<Extended> edge = BetaEdge(P, A, B, 1.0L)) return *edge;
   if (A < kTinyShape || B < kTinyShape) {
     // I_x is constant on (0, 1) (see IncompleteBeta): the root is an end.
     const Extended level = A < kTinyShape ? (B < kTinyShape ? B / (A + B) : 1.0L) : 0.0L;

@@ -97,22 +97,7 @@ TQENFloatMatrix Matrix2FloatMatrix(const detail::MatrixOf<T>& M) {
 }
 
 // --- Two-matrix arithmetic ---
-template <detail::ArithmeticElement T>
-detail::MatrixOf<T> AddMatrices(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
-  return detail::CombineMatrices(M1, M2, [](T a, T b) { return Rules<T>::Add(a, b); });
-}
-template <detail::ArithmeticElement T>
-detail::MatrixOf<T> SubtractMatrices(const detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
-  return detail::CombineMatrices(M1, M2, [](T a, T b) { return Rules<T>::Sub(a, b); });
-}
-template <detail::ArithmeticElement T>
-void AddToMatrix(detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
-  detail::CombineIntoMatrix(M1, M2, [](T a, T b) { return Rules<T>::Add(a, b); });
-}
-template <detail::ArithmeticElement T>
-void SubtractFromMatrix(detail::MatrixOf<T>& M1, const detail::MatrixOf<T>& M2) {
-  detail::CombineIntoMatrix(M1, M2, [](T a, T b) { return Rules<T>::Sub(a, b); });
-}
+TOVRIN_DEFINE_MATRIX_COMBINATIONS(detail::ArithmeticElement, detail::ElementRules)
 
 // --- Scalar arithmetic ---
 template <detail::ArithmeticElement T>
@@ -185,14 +170,11 @@ TOVRIN_ALL_AND_MONEY_ELEMENTS(TOVRIN_INSTANTIATE)
 TOVRIN_ALL_ELEMENTS(TOVRIN_INSTANTIATE)
 #undef TOVRIN_INSTANTIATE
 
-#define TOVRIN_INSTANTIATE(T)                                                    \
-  template MatrixOf<T> AddMatrices(const MatrixOf<T>&, const MatrixOf<T>&);      \
-  template MatrixOf<T> SubtractMatrices(const MatrixOf<T>&, const MatrixOf<T>&); \
-  template void AddToMatrix(MatrixOf<T>&, const MatrixOf<T>&);                   \
-  template void SubtractFromMatrix(MatrixOf<T>&, const MatrixOf<T>&);            \
-  template MatrixOf<T> MultiplyMatrixByConst(const MatrixOf<T>&, ScalarOf<T>);   \
-  template void MultiplyMatrixByConst2(MatrixOf<T>&, ScalarOf<T>);               \
-  template void LinearTransformMatrix(MatrixOf<T>&, ScalarOf<T>, ScalarOf<T>);   \
+#define TOVRIN_INSTANTIATE(T)                                                  \
+  TOVRIN_INSTANTIATE_MATRIX_COMBINATIONS(T)                                    \
+  template MatrixOf<T> MultiplyMatrixByConst(const MatrixOf<T>&, ScalarOf<T>); \
+  template void MultiplyMatrixByConst2(MatrixOf<T>&, ScalarOf<T>);             \
+  template void LinearTransformMatrix(MatrixOf<T>&, ScalarOf<T>, ScalarOf<T>); \
   template Extended GrandMean(const MatrixOf<T>&, LongWord&);
 TOVRIN_ARITHMETIC_ELEMENTS(TOVRIN_INSTANTIATE)
 #undef TOVRIN_INSTANTIATE

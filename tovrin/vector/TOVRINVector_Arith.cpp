@@ -55,32 +55,22 @@ void SquareVector(std::vector<T>& V) {
   detail::ApplyInPlace(V, [](ValueOf<T> x) { return ElementRules<T>::Square(x); });
 }
 
-template <detail::FloatElement T>
-void SqrtVector(std::vector<T>& V) {
-  CheckedFloatTransform(V, VectorNonNegative(V), rsVectorNeg,
-                        [](Extended x) { return std::sqrt(x); });
-}
-
-template <detail::FloatElement T>
-void InvVector(std::vector<T>& V) {
-  CheckedFloatTransform(V, VectorNonZero(V), rsVectorZero, [](Extended x) { return 1 / x; });
-}
-
-template <detail::FloatElement T>
-void LnVector(std::vector<T>& V) {
-  CheckedFloatTransform(V, VectorPositive(V), rsVectorNotPos,
-                        [](Extended x) { return std::log(x); });
-}
-
-template <detail::FloatElement T>
-void Log10Vector(std::vector<T>& V) {
-  CheckedFloatTransform(V, VectorPositive(V), rsVectorNotPos, QENLog10);
-}
-
-template <detail::FloatElement T>
-void Log2Vector(std::vector<T>& V) {
-  CheckedFloatTransform(V, VectorPositive(V), rsVectorNotPos, QENLog2);
-}
+// The checked float transforms: Name applies Fn to every element once every element passes
+// the predicate Passes, else raises Ident.
+#define TOVRIN_DEFINE_FLOAT_TRANSFORM(Name, Passes, Ident, Fn) \
+  template <detail::FloatElement T>                            \
+  void Name(std::vector<T>& V) {                               \
+    CheckedFloatTransform(V, Passes(V), Ident, Fn);            \
+  }
+TOVRIN_DEFINE_FLOAT_TRANSFORM(SqrtVector, VectorNonNegative, rsVectorNeg,
+                              [](Extended x) { return std::sqrt(x); })
+TOVRIN_DEFINE_FLOAT_TRANSFORM(InvVector, VectorNonZero, rsVectorZero,
+                              [](Extended x) { return 1 / x; })
+TOVRIN_DEFINE_FLOAT_TRANSFORM(LnVector, VectorPositive, rsVectorNotPos,
+                              [](Extended x) { return std::log(x); })
+TOVRIN_DEFINE_FLOAT_TRANSFORM(Log10Vector, VectorPositive, rsVectorNotPos, QENLog10)
+TOVRIN_DEFINE_FLOAT_TRANSFORM(Log2Vector, VectorPositive, rsVectorNotPos, QENLog2)
+#undef TOVRIN_DEFINE_FLOAT_TRANSFORM
 
 template <detail::SignedElement T>
 void LinearTransformVector(std::vector<T>& V, detail::ValueOf<T> M, detail::ValueOf<T> C) {
@@ -132,25 +122,7 @@ std::vector<T> CopyVector(const std::vector<T>& V) {
   return detail::CopyOf(V);
 }
 
-template <detail::ArithmeticElement T>
-std::vector<T> AddVectors(const std::vector<T>& V1, const std::vector<T>& V2) {
-  return detail::Combined(V1, V2, ElementRules<T>::Add);
-}
-
-template <detail::ArithmeticElement T>
-std::vector<T> SubtractVectors(const std::vector<T>& V1, const std::vector<T>& V2) {
-  return detail::Combined(V1, V2, ElementRules<T>::Sub);
-}
-
-template <detail::ArithmeticElement T>
-void AddToVector(std::vector<T>& V1, const std::vector<T>& V2) {
-  detail::CombineInto(V1, V2, ElementRules<T>::Add);
-}
-
-template <detail::ArithmeticElement T>
-void SubtractFromVector(std::vector<T>& V1, const std::vector<T>& V2) {
-  detail::CombineInto(V1, V2, ElementRules<T>::Sub);
-}
+TOVRIN_DEFINE_VECTOR_COMBINATIONS(detail::ArithmeticElement, ElementRules)
 
 template <detail::BuildableElement T>
 detail::SumOf<T> DotProdVectors(const std::vector<T>& V1, const std::vector<T>& V2) {
@@ -194,25 +166,20 @@ TQENFloatVector Vector2FloatVector(const std::vector<T>& V) {
   return Converted<PackedExtended>(V);
 }
 
-template <detail::IntegerElement T>
-TQENInt64Vector Array2Int64Vector(std::span<const T> A) {
-  return Converted<Int64>(A);
-}
-
-template <detail::IntegerElement T>
-TQENInt64Vector Vector2Int64Vector(const std::vector<T>& V) {
-  return Converted<Int64>(V);
-}
-
-template <detail::LongIntSourceElement T>
-TQENLIntVector Array2LIntVector(std::span<const T> A) {
-  return Converted<LongInt>(A);
-}
-
-template <detail::LongIntSourceElement T>
-TQENLIntVector Vector2LIntVector(const std::vector<T>& V) {
-  return Converted<LongInt>(V);
-}
+// The integer conversions: Array2NameVector and Vector2NameVector into TQENNameVector, of
+// element type To, from the types of Concept.
+#define TOVRIN_DEFINE_CONVERSIONS(Concept, Name, To)                  \
+  template <Concept T>                                                \
+  TQEN##Name##Vector Array2##Name##Vector(std::span<const T> A) {     \
+    return Converted<To>(A);                                          \
+  }                                                                   \
+  template <Concept T>                                                \
+  TQEN##Name##Vector Vector2##Name##Vector(const std::vector<T>& V) { \
+    return Converted<To>(V);                                          \
+  }
+TOVRIN_DEFINE_CONVERSIONS(detail::IntegerElement, Int64, Int64)
+TOVRIN_DEFINE_CONVERSIONS(detail::LongIntSourceElement, LInt, LongInt)
+#undef TOVRIN_DEFINE_CONVERSIONS
 
 using detail::SumOf;
 
@@ -239,11 +206,7 @@ TOVRIN_ALL_ELEMENTS(TOVRIN_INSTANTIATE)
 TOVRIN_BUILDABLE_ELEMENTS(TOVRIN_INSTANTIATE)
 #undef TOVRIN_INSTANTIATE
 
-#define TOVRIN_INSTANTIATE(T)                                                            \
-  template std::vector<T> AddVectors(const std::vector<T>&, const std::vector<T>&);      \
-  template std::vector<T> SubtractVectors(const std::vector<T>&, const std::vector<T>&); \
-  template void AddToVector(std::vector<T>&, const std::vector<T>&);                     \
-  template void SubtractFromVector(std::vector<T>&, const std::vector<T>&);
+#define TOVRIN_INSTANTIATE(T) TOVRIN_INSTANTIATE_VECTOR_COMBINATIONS(T)
 TOVRIN_ARITHMETIC_ELEMENTS(TOVRIN_INSTANTIATE)
 #undef TOVRIN_INSTANTIATE
 

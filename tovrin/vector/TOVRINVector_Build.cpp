@@ -79,14 +79,7 @@ Extended SumSqDiffVector(const std::vector<T>& V, Extended Mean) {
       [](Extended s, Extended t) { return s + t; });
 }
 
-#define TOVRIN_DEFINE_SIGN_PREDICATE(Name, Test)                       \
-  template <detail::SignedElement T>                                   \
-  bool Name(const std::vector<T>& V) {                                 \
-    using R = ElementRules<T>;                                         \
-    return detail::EveryElement(V, [](ValueOf<T> x) { return Test; }); \
-  }
-TOVRIN_SIGN_PREDICATES(TOVRIN_DEFINE_SIGN_PREDICATE)
-#undef TOVRIN_DEFINE_SIGN_PREDICATE
+TOVRIN_DEFINE_SIGN_PREDICATES(detail::SignedElement, ElementRules)
 
 using detail::SumOf;
 
@@ -119,13 +112,7 @@ TOVRIN_BUILDABLE_ELEMENTS(TOVRIN_INSTANTIATE)
 TOVRIN_WIDE_INTEGER_ELEMENTS(TOVRIN_INSTANTIATE)
 #undef TOVRIN_INSTANTIATE
 
-#define TOVRIN_INSTANTIATE(T)                             \
-  template bool VectorNonNegative(const std::vector<T>&); \
-  template bool VectorNegative(const std::vector<T>&);    \
-  template bool VectorNonZero(const std::vector<T>&);     \
-  template bool VectorZero(const std::vector<T>&);        \
-  template bool VectorNonPositive(const std::vector<T>&); \
-  template bool VectorPositive(const std::vector<T>&);
+#define TOVRIN_INSTANTIATE(T) TOVRIN_INSTANTIATE_SIGN_PREDICATES(T)
 TOVRIN_SIGNED_ELEMENTS(TOVRIN_INSTANTIATE)
 #undef TOVRIN_INSTANTIATE
 
