@@ -40,7 +40,9 @@ constexpr Extended kStirlingErrorOfCount[] = {
 Extended StirlingError(Extended n) {
   if (n < 12.0L) {
     if (!(n > 0.0L)) return 0.0L;
-    if (n == std::floor(n)) return kStirlingErrorOfCount[static_cast<int>(n) - 1];
+    // Truncated through double: SSE's conversion needs no switch of the x87 rounding mode.
+    const int k = static_cast<int>(static_cast<double>(n));
+    if (k == n) return kStirlingErrorOfCount[k - 1];
   }
   return detail::StirlingRemainder(n);
 }
