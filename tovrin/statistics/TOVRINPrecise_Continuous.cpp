@@ -54,27 +54,33 @@ Pair Standardized(Extended Mean, Extended StdDev, Extended X) {
   return detail::Quotient(detail::ExactSum(X, -Mean), Pair{StdDev});
 }
 
-// The z >= 0 with P(Z > z) = p, for 0 < p <= 1/2: Wichura's AS 241 (the classic InvNormalLess,
-// good to about 1e-16) as the first estimate, then Halley steps on erf near the centre and on
-// the upper tail beyond. Halley's method triples the correct digits, so once a step is below
-// 1e-7 relative the result is exact to the working precision and no further step is needed.
+#include "tovrin/statistics/TOVRINPrecise_InvNormal.inc"
+
+// c[0] + c[1] t + ... + c[N-1] t^(N-1) as Horner's rule in t^2 over the pairs c[i] + c[i+1] t:
+// half the dependent steps of the plain rule, the same rounding for coefficients of one sign.
+template <int N>
+Extended Polynomial(const Extended (&c)[N], Extended t) {
+  const Extended t2 = t * t;
+  Extended v = N % 2 == 1 ? c[N - 1] : c[N - 2] + c[N - 1] * t;
+  for (int i = N % 2 == 1 ? N - 3 : N - 4; i >= 0; i -= 2) v = v * t2 + (c[i] + c[i + 1] * t);
+  return v;
+}
+
+// The z >= 0 with P(Z > z) = p, for 0 < p <= 1/2, from the rational approximations fitted by
+// TOVRINPrecise_InvNormal.py (about 1e-20 relative): in q = 1/2 - p for p >= 0.075, beyond in
+// r = sqrt(-ln p) on six intervals up to the smallest subnormal p. No correction step follows:
+// the rounding of ln p moves z by about one unit in the last place.
 Extended InverseNormalUpper(Extended p) {
-  if (p == 0.5L) return 0.0L;
-  const bool central = p > 0.3L;
-  Extended z = -tovrin::InvNormalLess(p);
-  for (int i = 0; i < 20; ++i) {
-    // The tail and density need no argument carried to twice the precision here: an error of
-    // z^2 eps in Q(z) moves the root by only z eps.
-    const Extended density = kInvSqrt2Pi * std::exp(-0.5L * z * z);
-    // u = f / f' for f increasing in z (0.5 erf(z / sqrt 2) - (0.5 - p), or p - Q(z)).
-    const Extended x = z * kInvSqrt2;
-    const Extended f = central ? 0.5L * std::erf(x) - (0.5L - p) : p - 0.5L * std::erfc(x);
-    const Extended u = f / density;
-    const Extended step = u / (1.0L + 0.5L * u * z);
-    z -= step;
-    if (!(std::fabs(step) > 1e-7L * std::fabs(z))) break;
+  if (p >= 0.075L) {
+    const Extended q = 0.5L - p;
+    const Extended v = kInvNormalCentralEdge - q * q;
+    return q * Polynomial(kInvNormalCentralP, v) / Polynomial(kInvNormalCentralQ, v);
   }
-  return z;
+  const Extended r = std::sqrt(-std::log(p));
+  int k = 0;
+  while (k + 1 < kInvNormalTailRegions && r >= kInvNormalTailStart[k + 1]) ++k;
+  const Extended s = r - kInvNormalTailStart[k];
+  return r * Polynomial(kInvNormalTailP[k], s) / Polynomial(kInvNormalTailQ[k], s);
 }
 
 // The z with P(Z < z) = P for 0 < P < 1 (1 - P is exact where it is used).
