@@ -418,6 +418,9 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
   bool haveW0 = false;
   Extended tLnT = 0;
   bool haveTLnT = false;
+  BoundedLog logT{};  // ln t in double, formed on first use like t ln t
+  bool haveLogT = false;
+  bool logTValid = false;
   for (;;) {
     const Extended u = gen();
     if (u >= 1) continue;
@@ -428,8 +431,11 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
     if (tail) {
       x = t - std::log((1 - u) / (1 - p));
       BoundedLog logX;
-      BoundedLog logT;
-      if (DoubleLog(x, logX) && DoubleLog(t, logT)) {
+      if (!haveLogT) {
+        logTValid = DoubleLog(t, logT);
+        haveLogT = true;
+      }
+      if (DoubleLog(x, logX) && logTValid) {
         const Extended lnX = logX.value;
         const Extended lnT = logT.value;
         w = t * lnX - t * lnT;
