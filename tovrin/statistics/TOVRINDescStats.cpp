@@ -24,7 +24,7 @@ Int64 RoundToInt64(Extended X) {
   return static_cast<Int64>(r);
 }
 
-std::string Labelled(TResStringId Label, const std::string& Value) {
+std::string Labelled(TDescStatsStringId Label, const std::string& Value) {
   std::string line = LoadResString(Label);
   line += '\t';
   line += Value;
