@@ -66,10 +66,7 @@ constexpr std::array<detail::ResString, rsResStringCount> kResStrings{{
 }};
 #undef TOVRIN_RS
 
-detail::ResStringTable<rsResStringCount>& Table() {
-  static detail::ResStringTable<rsResStringCount> table(kResStrings);
-  return table;
-}
+constexpr auto Table = detail::TableOf<rsResStringCount, kResStrings>;
 
 }  // namespace
 

@@ -63,11 +63,11 @@ constexpr std::array<detail::ResString, rsDescStatsStringCount> kDescStatsString
     TOVRIN_RS(rsDSMeanY, "Mean of Y Values:"),
 }};
 #undef TOVRIN_RS
+// The published interface of the report labels: 25 for the component's report, 22 for reports
+// of paired data and of hypothesis tests.
+static_assert(rsDSUpperFence - rsDSNoOfValues + 1 == 25 && rsDescStatsStringCount == 47);
 
-detail::ResStringTable<rsDescStatsStringCount>& Table() {
-  static detail::ResStringTable<rsDescStatsStringCount> table(kDescStatsStrings);
-  return table;
-}
+constexpr auto Table = detail::TableOf<rsDescStatsStringCount, kDescStatsStrings>;
 
 }  // namespace
 

@@ -1,7 +1,7 @@
 // The mechanism behind a set of resource strings: the library's own texts, fixed at compile time,
 // and the replacements installed at run time (for translation). The foundation's message table
-// and the statistics report labels each own one table, held in a function-local static, so no
-// table depends on the order in which the library's objects are initialised.
+// and the statistics report labels each own one table, held in a function-local static (TableOf),
+// so no table depends on the order in which the library's objects are initialised.
 #pragma once
 
 #include <array>
@@ -54,5 +54,12 @@ class ResStringTable {
   mutable std::shared_mutex mutex_;
   std::array<std::optional<std::string>, N> overrides_;
 };
+
+// The one table of Strings, made on first use.
+template <std::size_t N, const std::array<ResString, N>& Strings>
+ResStringTable<N>& TableOf() {
+  static ResStringTable<N> table(Strings);
+  return table;
+}
 
 }  // namespace tovrin::detail
