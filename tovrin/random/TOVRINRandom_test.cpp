@@ -78,30 +78,33 @@ class EngineSource {
   std::size_t draws_ = 0;
 };
 
-// Raises Ident through the scripted overload without drawing, and through the overload without
-// a source without moving the thread's stream.
-template <typename WithSource, typename WithoutSource>
-void ExpectRaisesBeforeDraw(TResStringId Ident, WithSource&& withSource,
-                            WithoutSource&& withoutSource) {
+// One generator call, through the caller's source g or, for g null, through the overload
+// without a source (the thread's stream). EITHER(Random_Gamma, 2) writes it for a generator.
+using Draw = std::function<Extended(TRandomGenFunction*)>;
+#define EITHER(F, ...)                                                       \
+  [=](TRandomGenFunction* g) {                                               \
+    return Extended(g ? F(__VA_ARGS__ __VA_OPT__(, ) * g) : F(__VA_ARGS__)); \
+  }
+
+// Raises Ident through a scripted source without drawing, and through the overload without a
+// source without moving the thread's stream.
+void ExpectRaisesBeforeDraw(TResStringId Ident, const Draw& draw) {
   ScriptedSource script{0.5L, 0.5L, 0.5L, 0.5L};
-  ExpectRaises(Ident, [&] { withSource(TRandomGenFunction(script)); });
+  TRandomGenFunction source(script);
+  ExpectRaises(Ident, [&] { draw(&source); });
   EXPECT_EQ(script.Draws(), 0u) << ResStringName(Ident);
   SetRandSeed(77);
   const Extended first = VerdanRandom();
   SetRandSeed(77);
-  ExpectRaises(Ident, withoutSource);
+  ExpectRaises(Ident, [&] { draw(nullptr); });
   EXPECT_EQ(VerdanRandom(), first) << ResStringName(Ident);
 }
-// The same for a family with two parameters over a table of bad pairs.
-template <typename F>
-void ExpectPairsRaiseBeforeDraw(TResStringId Ident,
-                                std::initializer_list<std::array<Extended, 2>> bad, F f) {
-  for (const std::array<Extended, 2>& pair : bad) {
-    const Extended a = pair[0], b = pair[1];
-    ExpectRaisesBeforeDraw(
-        Ident, [&](TRandomGenFunction g) { f(a, b, &g); }, [&] { f(a, b, nullptr); });
-  }
+// The same for a family over a table of bad parameters.
+template <typename Param, typename F>
+void ExpectEachRaisesBeforeDraw(TResStringId Ident, std::initializer_list<Param> bad, F draw) {
+  for (const Param& p : bad) ExpectRaisesBeforeDraw(Ident, draw(p));
 }
+using Pair = std::array<Extended, 2>;
 
 Extended ScriptedGlobalValue() { return 0.25L; }
 
@@ -201,39 +204,30 @@ TEST(VerdanRandom, StreamsPerThread) {
 }
 
 TEST(VerdanRandom, OverloadsWithoutSourceDrawAsVerdanRandomDoes) {
-  Extended mu = 37.5L;
-  const std::vector<std::function<Extended(bool)>> pairs = {
-      [](bool v) { return v ? Random_Normal(2, 3, VerdanRandom) : Random_Normal(2, 3); },
-      [](bool v) { return v ? Random_LogNormal(2, 3, VerdanRandom) : Random_LogNormal(2, 3); },
-      [](bool v) { return v ? Random_Gamma(0.4L, VerdanRandom) : Random_Gamma(0.4L); },
-      [](bool v) { return v ? Random_Gamma(3.5L, VerdanRandom) : Random_Gamma(3.5L); },
-      [](bool v) { return v ? Random_ChiSq(7, VerdanRandom) : Random_ChiSq(7); },
-      [](bool v) { return v ? Random_Weibull(1.5L, VerdanRandom) : Random_Weibull(1.5L); },
-      [](bool v) { return v ? Random_Beta(0.5L, 2, VerdanRandom) : Random_Beta(0.5L, 2); },
-      [](bool v) { return v ? Random_T(4, VerdanRandom) : Random_T(4); },
-      [](bool v) { return v ? Random_Inv_Gauss(1, 2, VerdanRandom) : Random_Inv_Gauss(1, 2); },
-      [](bool v) {
-        return Extended(v ? Random_Binomial1(40, 0.3L, VerdanRandom) : Random_Binomial1(40, 0.3L));
-      },
-      [](bool v) {
-        return Extended(v ? Random_Binomial2(400, 0.3L, VerdanRandom)
-                          : Random_Binomial2(400, 0.3L));
-      },
-      [](bool v) {
-        return Extended(v ? Random_Neg_Binomial(2.5L, 0.8L, VerdanRandom)
-                          : Random_Neg_Binomial(2.5L, 0.8L));
-      },
-      [](bool v) { return v ? Random_von_Mises(3, VerdanRandom) : Random_von_Mises(3); },
-      [](bool v) { return v ? Random_Cauchy(VerdanRandom) : Random_Cauchy(); },
-      [&mu](bool v) { return Extended(v ? Random_Poisson(mu, VerdanRandom) : Random_Poisson(mu)); },
-  };
-  for (std::size_t i = 0; i < pairs.size(); ++i) {
+  const Draw draws[] = {EITHER(Random_Normal, 2, 3),
+                        EITHER(Random_LogNormal, 2, 3),
+                        EITHER(Random_Gamma, 0.4L),
+                        EITHER(Random_Gamma, 3.5L),
+                        EITHER(Random_ChiSq, 7),
+                        EITHER(Random_Weibull, 1.5L),
+                        EITHER(Random_Beta, 0.5L, 2),
+                        EITHER(Random_T, 4),
+                        EITHER(Random_Inv_Gauss, 1, 2),
+                        EITHER(Random_Binomial1, 40, 0.3L),
+                        EITHER(Random_Binomial2, 400, 0.3L),
+                        EITHER(Random_Neg_Binomial, 2.5L, 0.8L),
+                        EITHER(Random_von_Mises, 3),
+                        EITHER(Random_Cauchy),
+                        EITHER(Random_Poisson, 37.5L)};
+  TRandomGenFunction verdan(VerdanRandom);
+  for (std::size_t i = 0; i < std::size(draws); ++i) {
     SetRandSeed(1000 + i);
     std::vector<Extended> with;
-    for (int k = 0; k < 50; ++k) with.push_back(pairs[i](true));
+    for (int k = 0; k < 50; ++k) with.push_back(draws[i](&verdan));
     const Extended nextWith = VerdanRandom();
     SetRandSeed(1000 + i);
-    for (int k = 0; k < 50; ++k) EXPECT_EQ(pairs[i](false), with[static_cast<std::size_t>(k)]) << i;
+    for (int k = 0; k < 50; ++k)
+      EXPECT_EQ(draws[i](nullptr), with[static_cast<std::size_t>(k)]) << i;
     EXPECT_EQ(VerdanRandom(), nextWith) << i;  // the same number of draws
   }
   TQENFloatVector means{1, 2}, cov{4, 1, 3}, factor, variate1, variate2;
@@ -281,11 +275,9 @@ TEST(RandomNormal, LevaDrawOrderRoundingAndRedraws) {
   ScriptedSource logNormal{0.5L, 0.6L};
   EXPECT_TRUE(testing::Near(std::log(Random_LogNormal(1, 1, logNormal)),
                             -0.5L * std::log(2.0L) + std::sqrt(std::log(2.0L)) * kZ, 1e-15L));
-  const auto logNormalCall = [](Extended m, Extended s, TRandomGenFunction* g) {
-    return g ? Random_LogNormal(m, s, *g) : Random_LogNormal(m, s);
-  };
-  ExpectPairsRaiseBeforeDraw(rsInvalidMean, {{0, 1}, {-1, -1}}, logNormalCall);
-  ExpectPairsRaiseBeforeDraw(rsInvalidStdDev, {{1, 0}, {1, -2}}, logNormalCall);
+  const auto logNormalDraw = [](Pair p) { return EITHER(Random_LogNormal, p[0], p[1]); };
+  ExpectEachRaisesBeforeDraw<Pair>(rsInvalidMean, {{0, 1}, {-1, -1}}, logNormalDraw);
+  ExpectEachRaisesBeforeDraw<Pair>(rsInvalidStdDev, {{1, 0}, {1, -2}}, logNormalDraw);
 }
 
 TEST(RandomGamma, ExponentialShapesAndDrawOrder) {
@@ -315,18 +307,11 @@ TEST(RandomGamma, ExponentialShapesAndDrawOrder) {
   EXPECT_NEAR(x, 2.150035L, 1e-6L);
   EXPECT_EQ(large.Draws(), 3u);
   EXPECT_EQ(Random_ChiSq(4, chi), 2 * x);
-  for (Extended shape : {0.0L, -1e-30L, kNaN}) {
-    ExpectRaisesBeforeDraw(
-        rsInvalidShape, [=](TRandomGenFunction g) { Random_Gamma(shape, g); },
-        [=] { Random_Gamma(shape); });
-  }
-  ExpectRaisesBeforeDraw(
-      rsInvalidShape, [](TRandomGenFunction g) { Random_ChiSq(0, g); }, [] { Random_ChiSq(-3); });
-  for (Extended shape : {1e-4000L, 4.9E-324L}) {
-    ExpectRaisesBeforeDraw(
-        rsShapeTooSmall, [=](TRandomGenFunction g) { Random_Gamma(shape, g); },
-        [=] { Random_Gamma(shape); });
-  }
+  const auto gamma = [](Extended shape) { return EITHER(Random_Gamma, shape); };
+  ExpectEachRaisesBeforeDraw(rsInvalidShape, {0.0L, -1e-30L, kNaN}, gamma);
+  ExpectEachRaisesBeforeDraw(rsInvalidShape, {0, -3},
+                             [](int df) { return EITHER(Random_ChiSq, df); });
+  ExpectEachRaisesBeforeDraw(rsShapeTooSmall, {1e-4000L, 4.9E-324L}, gamma);
   ScriptedSource atTiny{0.5L, 0.5L};
   EXPECT_GE(Random_Gamma(5.0E-324L, atTiny), 0.0L);  // Tiny itself is allowed
 }
@@ -335,11 +320,8 @@ TEST(RandomWeibullBetaAndT, DrawsAndChecks) {
   ScriptedSource negative{0.25L}, positive{0.25L};  // E = ln 4; a negative shape is accepted
   EXPECT_NEAR(Random_Weibull(-2, negative), 0.849321800288019042721502834103L, 1e-18L);
   EXPECT_NEAR(Random_Weibull(2, positive), 1.17741002251547469101156932646L, 1e-18L);
-  for (Extended shape : {0.0L, 5.0E-324L, -5.0E-324L, 1e-4000L, kNaN}) {
-    ExpectRaisesBeforeDraw(
-        rsInvalidValue, [=](TRandomGenFunction g) { Random_Weibull(shape, g); },
-        [=] { Random_Weibull(shape); });
-  }
+  ExpectEachRaisesBeforeDraw(rsInvalidValue, {0.0L, 5.0E-324L, -5.0E-324L, 1e-4000L, kNaN},
+                             [](Extended shape) { return EITHER(Random_Weibull, shape); });
   // Swapped beta parameters reflect on the same uniforms: the smaller first parameter gives
   // 1 - x of the other's x.
   const std::array<Extended, 2> shapes[] = {{2, 3}, {0.5L, 0.7L}, {3, 0.4L}, {0.05L, 0.01L}};
@@ -351,10 +333,8 @@ TEST(RandomWeibullBetaAndT, DrawsAndChecks) {
       ASSERT_TRUE(x >= 0 && x <= 1);
     }
   }
-  ExpectPairsRaiseBeforeDraw(rsInvalidValue, {{0, 1}, {1, 0}, {-1, 2}, {2, -0.5L}, {kNaN, 1}},
-                             [](Extended a, Extended b, TRandomGenFunction* g) {
-                               return g ? Random_Beta(a, b, *g) : Random_Beta(a, b);
-                             });
+  ExpectEachRaisesBeforeDraw<Pair>(rsInvalidValue, {{0, 1}, {1, 0}, {-1, 2}, {2, -0.5L}, {kNaN, 1}},
+                                   [](Pair p) { return EITHER(Random_Beta, p[0], p[1]); });
   // u1 = 0 (z = 0) and u1 = 4E-324 (below Tiny) are redrawn before any test.
   EngineSource reference(9), engine(9);
   const Extended expected = Random_Beta(2, 3, reference);
@@ -370,10 +350,8 @@ TEST(RandomWeibullBetaAndT, DrawsAndChecks) {
   EXPECT_EQ(Random_T(1, t1), 1.0L);
   EXPECT_EQ(t1.Draws(), 3u);
   EXPECT_NEAR(Random_T(2, t2), 2 * std::pow(3.0L, -0.75L), 1e-18L);
-  for (LongInt df : {0, -100}) {
-    ExpectRaisesBeforeDraw(
-        rsInvalidValue, [=](TRandomGenFunction g) { Random_T(df, g); }, [=] { Random_T(df); });
-  }
+  ExpectEachRaisesBeforeDraw(rsInvalidValue, {0, -100},
+                             [](int df) { return EITHER(Random_T, df); });
 }
 
 TEST(RandomT, QuickRejectionKeepsDrawsFromThreeDegreesOn) {
@@ -387,14 +365,9 @@ TEST(RandomT, QuickRejectionKeepsDrawsFromThreeDegreesOn) {
   for (const auto& [df, hash] : expected) {
     std::mt19937_64 engine(20261124u + static_cast<std::uint64_t>(df));
     const auto source = [&] { return static_cast<Extended>(engine() >> 11) * 0x1p-53L; };
-    std::uint64_t h = 1469598103934665603u;
-    for (int i = 0; i < 20000; ++i) {
-      const Extended x = Random_T(df, source);
-      unsigned char bytes[10];
-      std::memcpy(bytes, &x, sizeof bytes);
-      for (unsigned char b : bytes) h = (h ^ b) * 1099511628211u;
-    }
-    EXPECT_EQ(h, hash) << "DF " << df;
+    testing::ValueHash h(1469598103934665603u);
+    for (int i = 0; i < 20000; ++i) h.Add(Random_T(df, source));
+    EXPECT_EQ(h.Value(), hash) << "DF " << df;
   }
 }
 
@@ -452,10 +425,11 @@ TEST(RandomMVNorm, ErrorsAndChecks) {
     TResStringId ident;
   } bad[] = {{{}, {1, 2, 3}, rsVectorEmpty}, {{1, 2}, {1, 0}, rsVectorTooSmall}};
   for (const auto& b : bad) {
-    ExpectRaisesBeforeDraw(
-        b.ident,
-        [&](TRandomGenFunction g) { Random_MVNorm(b.means, b.covariance, f, v, error, g); },
-        [&] { Random_MVNorm(b.means, b.covariance, f, v, error); });
+    ExpectRaisesBeforeDraw(b.ident, [&](TRandomGenFunction* g) {
+      g ? Random_MVNorm(b.means, b.covariance, f, v, error, *g)
+        : Random_MVNorm(b.means, b.covariance, f, v, error);
+      return 0;
+    });
     EXPECT_EQ(f.size() * 10 + v.size(), 32u);
     EXPECT_EQ(error, 42);
   }
@@ -516,11 +490,9 @@ TEST(RandomBinomial, ModeShortcutOutwardWalkAndInversion) {
   EXPECT_EQ(Random_Binomial2(5, 0.7L, reflected), 4);
   ExpectRaises(rsInvalidValue, [&] { Random_Binomial2(5, 0.3L, beyond); });
   EXPECT_EQ(beyond.Draws(), 1u);
-  ExpectPairsRaiseBeforeDraw(rsInvalidValue, {{0, 0.3L}, {10, 0}, {10, 1}, {-5, 0.3L}, {10, kNaN}},
-                             [](Extended n, Extended p, TRandomGenFunction* g) {
-                               return g ? Random_Binomial2(Int64(n), p, *g)
-                                        : Random_Binomial2(Int64(n), p);
-                             });
+  ExpectEachRaisesBeforeDraw<Pair>(
+      rsInvalidValue, {{0, 0.3L}, {10, 0}, {10, 1}, {-5, 0.3L}, {10, kNaN}},
+      [](Pair p) { return EITHER(Random_Binomial2, Int64(p[0]), p[1]); });
 }
 
 TEST(RandomDiscrete, NegativeBinomialPoissonAndCauchy) {
@@ -531,12 +503,10 @@ TEST(RandomDiscrete, NegativeBinomialPoissonAndCauchy) {
   EXPECT_EQ(Random_Neg_Binomial(2, 0.8L, geometric), 8);
   EXPECT_EQ(geometric.Draws(), 4u);
   EXPECT_GE(Random_Neg_Binomial(1000, 0.5L, near), 0);  // 0.5^1000 is still above the guard
-  ExpectPairsRaiseBeforeDraw(
+  ExpectEachRaisesBeforeDraw<Pair>(
       rsInvalidValue,
       {{0, 0.5L}, {1, 0}, {1, 1}, {1, -0.1L}, {1, 1.5L}, {kNaN, 0.5L}, {1100, 0.5L}},
-      [](Extended r, Extended p, TRandomGenFunction* g) {
-        return g ? Random_Neg_Binomial(r, p, *g) : Random_Neg_Binomial(r, p);
-      });
+      [](Pair p) { return EITHER(Random_Neg_Binomial, p[0], p[1]); });
   // Poisson: the table up to a mean of 10 (one uniform), the normal method above; the mean is
   // left alone; a mean that is not positive gives 0.
   const struct {
@@ -570,19 +540,14 @@ TEST(RandomDiscrete, NegativeBinomialPoissonAndCauchy) {
 
 TEST(RandomInvGaussAndVonMises, DrawsAndChecks) {
   // Lambda > Omega sqrt(Huge) / 4, and a falling to 0, are refused too.
-  ExpectPairsRaiseBeforeDraw(rsInvalidValue,
-                             {{-1, 1}, {1, 0}, {1, -2}, {1e160L, 1}, {0, 1e-200L}, {kNaN, 1}},
-                             [](Extended l, Extended o, TRandomGenFunction* g) {
-                               return g ? Random_Inv_Gauss(l, o, *g) : Random_Inv_Gauss(l, o);
-                             });
+  ExpectEachRaisesBeforeDraw<Pair>(rsInvalidValue,
+                                   {{-1, 1}, {1, 0}, {1, -2}, {1e160L, 1}, {0, 1e-200L}, {kNaN, 1}},
+                                   [](Pair p) { return EITHER(Random_Inv_Gauss, p[0], p[1]); });
   ScriptedSource script{0.0L, 0.5L, 0.5L};  // u = 0 is redrawn
   EXPECT_GT(Random_Inv_Gauss(1, 1, script), 0.0L);
   EXPECT_EQ(script.Draws(), 3u);
-  for (Extended k : {-0.1L, 10.0L, kInf, kNaN}) {
-    ExpectRaisesBeforeDraw(
-        rsInvalidValue, [=](TRandomGenFunction g) { Random_von_Mises(k, g); },
-        [=] { Random_von_Mises(k); });
-  }
+  ExpectEachRaisesBeforeDraw(rsInvalidValue, {-0.1L, 10.0L, kInf, kNaN},
+                             [](Extended k) { return EITHER(Random_von_Mises, k); });
   // K = 0: one interval [0, pi]; the selecting uniform places the angle (s = 1 - u), the
   // uniform that ends the comparison run gives the sign.
   ScriptedSource plus{0.25L, 0.6L}, minus{0.25L, 0.3L};
@@ -595,95 +560,46 @@ TEST(RandomInvGaussAndVonMises, DrawsAndChecks) {
   EXPECT_EQ(run.Draws(), 5u);
 }
 
-class StreamHash {
- public:
-  void Add(Extended x) {
-    unsigned char bytes[sizeof(Extended)] = {};
-    std::memcpy(bytes, &x, sizeof(Extended));
-    AddBytes(bytes, 10);
-  }
-  void Add(Int64 k) {
-    unsigned char bytes[sizeof(Int64)];
-    std::memcpy(bytes, &k, sizeof(Int64));
-    AddBytes(bytes, sizeof(Int64));
-  }
-  std::uint64_t Value() const { return hash_; }
-
- private:
-  void AddBytes(const unsigned char* bytes, std::size_t n) {
-    for (std::size_t i = 0; i < n; ++i) hash_ = (hash_ ^ bytes[i]) * 0x100000001B3ULL;
-  }
-  std::uint64_t hash_ = 0xCBF29CE484222325ULL;
-};
-
 TEST(RandomStreams, FixedSeedsGiveTheRecordedDraws) {
   // The generators are evaluated with shortcuts that must not change a single decision: each
   // row hashes 20000 draws, through a caller's source and through the thread's own stream,
-  // against the hash recorded from the plain evaluation of the methods.
-  struct Row {
+  // against the hash recorded from the plain evaluation of the methods (counts hash as Int64).
+  const struct {
     const char* name;
-    std::function<void(StreamHash&, TRandomGenFunction)> draw;
-    std::function<void(StreamHash&)> drawOwn;
-    std::uint64_t withSource;
-    std::uint64_t withoutSource;
-  };
-  const std::vector<Row> rows = {
-      {"Normal", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Normal(g)); },
-       [](StreamHash& h) { h.Add(Random_Normal()); }, 0xC2613C5A7626F554ULL, 0xE58B31373893FCCULL},
-      {"Exponential", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Exponential(g)); },
-       [](StreamHash& h) { h.Add(Random_Exponential()); }, 0x812F68D58DCEB87ULL,
+    Draw draw;
+    bool count;
+    std::uint64_t withSource, withoutSource;
+  } rows[] = {
+      {"Normal", EITHER(Random_Normal), false, 0xC2613C5A7626F554ULL, 0xE58B31373893FCCULL},
+      {"Exponential", EITHER(Random_Exponential), false, 0x812F68D58DCEB87ULL,
        0x80FC6416F81A1A12ULL},
-      {"Gamma_5", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Gamma(5, g)); },
-       [](StreamHash& h) { h.Add(Random_Gamma(5)); }, 0xBC98F655F235FFBBULL, 0x25F504E6AB77C72ULL},
-      {"Gamma_2_5", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Gamma(2.5L, g)); },
-       [](StreamHash& h) { h.Add(Random_Gamma(2.5L)); }, 0xAB47C815F4EB25D5ULL,
-       0xD3F667094552BFEULL},
-      {"Gamma_0_5", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Gamma(0.5L, g)); },
-       [](StreamHash& h) { h.Add(Random_Gamma(0.5L)); }, 0x6F1ECAEE6CF6C11DULL,
+      {"Gamma_5", EITHER(Random_Gamma, 5), false, 0xBC98F655F235FFBBULL, 0x25F504E6AB77C72ULL},
+      {"Gamma_2_5", EITHER(Random_Gamma, 2.5L), false, 0xAB47C815F4EB25D5ULL, 0xD3F667094552BFEULL},
+      {"Gamma_0_5", EITHER(Random_Gamma, 0.5L), false, 0x6F1ECAEE6CF6C11DULL,
        0x9C891ED8A23097CCULL},
-      {"Gamma_0_3", [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Gamma(0.3L, g)); },
-       [](StreamHash& h) { h.Add(Random_Gamma(0.3L)); }, 0x95E9C5A2A2BE70D7ULL,
+      {"Gamma_0_3", EITHER(Random_Gamma, 0.3L), false, 0x95E9C5A2A2BE70D7ULL,
        0xB59F9418A6E9AC0BULL},
-      {"Binomial2_1000_0_3",
-       [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Binomial2(1000, 0.3L, g)); },
-       [](StreamHash& h) { h.Add(Random_Binomial2(1000, 0.3L)); }, 0xCE1CC84225D3A83CULL,
+      {"Binomial2_1000_0_3", EITHER(Random_Binomial2, 1000, 0.3L), true, 0xCE1CC84225D3A83CULL,
        0xE0BE97114E21444AULL},
-      {"Binomial2_20_0_3",
-       [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Binomial2(20, 0.3L, g)); },
-       [](StreamHash& h) { h.Add(Random_Binomial2(20, 0.3L)); }, 0xBDB9D402795CCC21ULL,
+      {"Binomial2_20_0_3", EITHER(Random_Binomial2, 20, 0.3L), true, 0xBDB9D402795CCC21ULL,
        0x329F919F09C92B03ULL},
-      {"Binomial2_100000_0_6",
-       [](StreamHash& h, TRandomGenFunction g) { h.Add(Random_Binomial2(100000, 0.6L, g)); },
-       [](StreamHash& h) { h.Add(Random_Binomial2(100000, 0.6L)); }, 0xCDC59516ACE941F4ULL,
+      {"Binomial2_100000_0_6", EITHER(Random_Binomial2, 100000, 0.6L), true, 0xCDC59516ACE941F4ULL,
        0x645B5781DBC79630ULL},
-      {"Poisson_100",
-       [](StreamHash& h, TRandomGenFunction g) {
-         Extended mu = 100;
-         h.Add(Random_Poisson(mu, g));
-       },
-       [](StreamHash& h) {
-         Extended mu = 100;
-         h.Add(Random_Poisson(mu));
-       },
-       0x1A789606E9D90A19ULL, 0x94CEF0893552773FULL},
-      {"Poisson_12_5",
-       [](StreamHash& h, TRandomGenFunction g) {
-         Extended mu = 12.5L;
-         h.Add(Random_Poisson(mu, g));
-       },
-       [](StreamHash& h) {
-         Extended mu = 12.5L;
-         h.Add(Random_Poisson(mu));
-       },
-       0x7321250B33791A32ULL, 0x78D834214F0DCB22ULL},
+      {"Poisson_100", EITHER(Random_Poisson, 100), true, 0x1A789606E9D90A19ULL,
+       0x94CEF0893552773FULL},
+      {"Poisson_12_5", EITHER(Random_Poisson, 12.5L), true, 0x7321250B33791A32ULL,
+       0x78D834214F0DCB22ULL},
   };
-  for (const Row& row : rows) {
+  for (const auto& row : rows) {
     EngineSource engine(2026);
-    StreamHash withSource;
-    for (int i = 0; i < 20000; ++i) row.draw(withSource, engine);
+    TRandomGenFunction source(engine);
+    testing::ValueHash withSource, withoutSource;
+    const auto add = [&row](testing::ValueHash& h, Extended x) {
+      row.count ? h.Add(static_cast<Int64>(x)) : h.Add(x);
+    };
+    for (int i = 0; i < 20000; ++i) add(withSource, row.draw(&source));
     SetRandSeed(2026);
-    StreamHash withoutSource;
-    for (int i = 0; i < 20000; ++i) row.drawOwn(withoutSource);
+    for (int i = 0; i < 20000; ++i) add(withoutSource, row.draw(nullptr));
     EXPECT_EQ(withSource.Value(), row.withSource)
         << row.name << std::hex << " 0x" << withSource.Value();
     EXPECT_EQ(withoutSource.Value(), row.withoutSource)
@@ -708,57 +624,64 @@ TEST(RandomExtremes, LargeArgumentsStayWithinRangeWithoutOverflow) {
   EXPECT_GE(Random_Neg_Binomial(1e6L, 0.9L, engine), 0);  // a million geometric draws
 }
 
-void ExpectMoments(const std::string& name, long double sum, long double sumSq, int n,
-                   long double mean, long double variance, long double central4) {
-  if (!std::isfinite(variance)) return;
-  const long double sampleMean = sum / n;
-  EXPECT_NEAR(sampleMean, mean, 6 * std::sqrt(variance / n)) << name;
-  if (!std::isfinite(central4)) return;
-  const long double sampleVariance = (sumSq - n * sampleMean * sampleMean) / (n - 1);
-  EXPECT_NEAR(sampleVariance, variance, 6 * std::sqrt((central4 - variance * variance) / n))
-      << name;
-}
-
-void CheckContinuous(const std::string& name, const std::function<Extended()>& draw) {
-  const auto& ref = *std::find_if(std::begin(kContinuous), std::end(kContinuous),
-                                  [&](const auto& r) { return name == r.name; });
-  std::array<int, kReferenceBins> counts{};
+// Counts kReferenceDraws draws into bins (BinOf), then compares the counts with the bin
+// probabilities (chi-square below Critical) and the mean and variance with the reference's.
+template <typename Ref, typename Value>
+void CheckDraws(const Ref& ref, const std::function<Value()>& draw,
+                const std::function<std::size_t(Value)>& binOf,
+                const std::function<long double(std::size_t)>& probability, std::size_t bins,
+                long double critical) {
+  std::vector<int> counts(bins);
   long double sum = 0, sumSq = 0;
   for (int i = 0; i < kReferenceDraws; ++i) {
-    const Extended x = draw();
-    ASSERT_FALSE(std::isnan(x)) << name;
-    ++counts[static_cast<std::size_t>(std::upper_bound(ref.edges.begin(), ref.edges.end(), x) -
-                                      ref.edges.begin())];
-    sum += x;
-    sumSq += x * x;
-  }
-  const long double expected = static_cast<long double>(kReferenceDraws) / kReferenceBins;
-  long double chi = 0;
-  for (int c : counts) chi += (c - expected) * (c - expected) / expected;
-  EXPECT_LT(chi, kChiSquareCriticalBins) << name;
-  ExpectMoments(name, sum, sumSq, kReferenceDraws, ref.mean, ref.variance, ref.central4);
-}
-
-void CheckDiscrete(const std::string& name, const std::function<Int64()>& draw) {
-  const auto& ref = *std::find_if(std::begin(kDiscrete), std::end(kDiscrete),
-                                  [&](const auto& r) { return name == r.name; });
-  std::vector<int> counts(ref.lastValues.size());
-  long double sum = 0, sumSq = 0;
-  for (int i = 0; i < kReferenceDraws; ++i) {
-    const Int64 x = draw();
-    const auto bin = static_cast<std::size_t>(
-        std::lower_bound(ref.lastValues.begin(), ref.lastValues.end(), x) - ref.lastValues.begin());
-    ++counts[std::min(bin, counts.size() - 1)];
+    const Value x = draw();
+    ASSERT_FALSE(std::isnan(static_cast<long double>(x))) << ref.name;
+    ++counts[std::min(binOf(x), bins - 1)];
     sum += x;
     sumSq += static_cast<long double>(x) * x;
   }
   long double chi = 0;
-  for (std::size_t i = 0; i < counts.size(); ++i) {
-    const long double expected = kReferenceDraws * ref.probabilities[i];
+  for (std::size_t i = 0; i < bins; ++i) {
+    const long double expected = kReferenceDraws * probability(i);
     chi += (counts[i] - expected) * (counts[i] - expected) / expected;
   }
-  EXPECT_LT(chi, ref.critical) << name;
-  ExpectMoments(name, sum, sumSq, kReferenceDraws, ref.mean, ref.variance, ref.central4);
+  EXPECT_LT(chi, critical) << ref.name;
+  const int n = kReferenceDraws;
+  if (!std::isfinite(ref.variance)) return;
+  const long double mean = sum / n;
+  EXPECT_NEAR(mean, ref.mean, 6 * std::sqrt(ref.variance / n)) << ref.name;
+  if (!std::isfinite(ref.central4)) return;
+  EXPECT_NEAR((sumSq - n * mean * mean) / (n - 1), ref.variance,
+              6 * std::sqrt((ref.central4 - ref.variance * ref.variance) / n))
+      << ref.name;
+}
+
+template <typename Ref, std::size_t N>
+const Ref& Find(const Ref (&table)[N], const std::string& name) {
+  return *std::find_if(table, table + N, [&](const Ref& r) { return name == r.name; });
+}
+
+void CheckContinuous(const std::string& name, const std::function<Extended()>& draw) {
+  const auto& ref = Find(kContinuous, name);
+  CheckDraws<ContinuousReference, Extended>(
+      ref, draw,
+      [&](Extended x) {
+        return static_cast<std::size_t>(std::upper_bound(ref.edges.begin(), ref.edges.end(), x) -
+                                        ref.edges.begin());
+      },
+      [](std::size_t) { return 1.0L / kReferenceBins; }, kReferenceBins, kChiSquareCriticalBins);
+}
+
+void CheckDiscrete(const std::string& name, const std::function<Int64()>& draw) {
+  const auto& ref = Find(kDiscrete, name);
+  CheckDraws<DiscreteReference, Int64>(
+      ref, draw,
+      [&](Int64 x) {
+        return static_cast<std::size_t>(
+            std::lower_bound(ref.lastValues.begin(), ref.lastValues.end(), x) -
+            ref.lastValues.begin());
+      },
+      [&](std::size_t i) { return ref.probabilities[i]; }, ref.lastValues.size(), ref.critical);
 }
 
 // Half of the cases draw from VerdanRandom (the overloads without a source), half from an

@@ -106,29 +106,47 @@ Extended InverseNormalLess(Extended P) {
 
 // --- Gamma inverse ----------------------------------------------------------------------------
 
-// The x with P(a, x) = p and Q(a, x) = q (q = 1 - p, each exact where it is the smaller):
-// Wilson and Hilferty's or the power-law first estimate, then Halley steps (Newton on the
-// logarithm far in a tail) kept inside a shrinking bracket.
+// First estimate of the x with P(a, x) = p and Q(a, x) = q: for a = 1/2, Q = 2 P(Z > sqrt(2x))
+// exactly; for a >= 1 Wilson and Hilferty's cube; otherwise, or where that fails, the lower
+// tail's power law x^a / Gamma(a + 1) (with its first correction, e^-x ~ 1 - a x / (a + 1))
+// while x is small, and the upper tail's x^(a - 1) e^-x / Gamma(a) (1 + (a - 1) / x) beyond,
+// solved by two fixed-point steps.
+Extended InverseGammaStart(Extended a, Extended p, Extended q) {
+  const bool use_lower = p <= q;
+  if (a == 0.5L && !use_lower) {
+    const Extended z = InverseNormalUpper(0.5L * q);
+    return 0.5L * z * z;
+  }
+  if (a >= 1.0L) {
+    // The classic inverse (good to about 1e-16) is enough for a start.
+    const Extended z = use_lower ? tovrin::InvNormalLess(p) : -tovrin::InvNormalLess(q);
+    const Extended base = 1.0L - 1.0L / (9.0L * a) + z / (3.0L * std::sqrt(a));
+    if (base > 0.1L) return a * base * base * base;
+  }
+  Extended x = std::exp((std::log(p) + LnGamma(a + 1.0L)) / a);
+  if (x < 0.5L || (use_lower && !(x > 1.0L))) {
+    x *= std::exp(x / (a + 1.0L));
+  } else {
+    const Extended level = -std::log(q) - LnGamma(a);
+    x = std::fmax(1.0L, level);
+    for (int i = 0; i < 2; ++i) {
+      x = std::fmax(1.0L, level + (a - 1.0L) * std::log(x) + std::log1p((a - 1.0L) / x));
+    }
+  }
+  if (!(x > 0.0L)) x = std::numeric_limits<Extended>::min();
+  if (std::isinf(x)) x = std::numeric_limits<Extended>::max();
+  return x;
+}
+
+// The x with P(a, x) = p and Q(a, x) = q (q = 1 - p, each exact where it is the smaller): the
+// first estimate above, then Halley steps (Newton on the logarithm far in a tail) kept inside a
+// shrinking bracket, each reusing the density factor that the tails formed.
 Extended InverseGamma(Extended a, Extended p, Extended q) {
   if (p <= 0.0L) return 0.0L;
   if (q <= 0.0L) return kInf;
   const bool use_lower = p <= q;
   const Extended target = use_lower ? p : q;
-  const Extended z = use_lower ? -InverseNormalUpper(p) : InverseNormalUpper(q);
-  Extended x = kNaN;
-  if (a >= 1.0L) {
-    const Extended base = 1.0L - 1.0L / (9.0L * a) + z / (3.0L * std::sqrt(a));
-    if (base > 0.1L) x = a * base * base * base;
-  }
-  if (!(x > 0.0L)) {
-    if (use_lower) {
-      x = std::exp((std::log(p) + LnGamma(a + 1.0L)) / a);
-    } else {
-      x = std::fmax(1.0L, -std::log(q) - LnGamma(a));
-    }
-    if (!(x > 0.0L)) x = std::numeric_limits<Extended>::min();
-    if (std::isinf(x)) x = std::numeric_limits<Extended>::max();
-  }
+  Extended x = InverseGammaStart(a, p, q);
   Extended lo = 0.0L;
   Extended hi = kInf;
   for (int i = 0; i < 400; ++i) {
@@ -140,9 +158,12 @@ Extended InverseGamma(Extended a, Extended p, Extended q) {
     } else {
       hi = x;
     }
-    const Extended density = detail::GammaPowerFactor(a, x) / x;
+    const Extended density = (std::isnan(t.factor) ? detail::GammaPowerFactor(a, x) : t.factor) / x;
     const Extended tail = use_lower ? t.lower : t.upper;
     Extended next = kNaN;
+    // Newton doubles and Halley triples the correct digits: a Newton step below 1e-10 of x, or a
+    // Halley step below 1e-7, leaves the next iterate exact to the working precision.
+    Extended last_step = 1e-10L;
     if (density > 0.0L && std::isfinite(density)) {
       if (target < 0.01L && tail > 0.0L) {
         const Extended g = use_lower ? std::log(tail / p) : std::log(q / tail);
@@ -151,13 +172,15 @@ Extended InverseGamma(Extended a, Extended p, Extended q) {
       } else {
         const Extended step = f / density;
         Extended denom = 1.0L - 0.5L * step * ((a - 1.0L) / x - 1.0L);
-        if (!(denom > 0.5L && denom < 2.0L)) denom = 1.0L;
+        if (denom > 0.5L && denom < 2.0L) {
+          last_step = 1e-7L;
+        } else {
+          denom = 1.0L;
+        }
         next = x - step / denom;
       }
     }
-    // Newton doubles and Halley triples the correct digits: a step below 1e-10 of x leaves the
-    // next iterate exact to the working precision.
-    if (std::fabs(next - x) <= 1e-10L * x) return std::fmin(std::fmax(next, lo), hi);
+    if (std::fabs(next - x) <= last_step * x) return std::fmin(std::fmax(next, lo), hi);
     if (!(next > lo && next < hi)) {
       if (std::isinf(hi)) {
         next = x * 16.0L;
@@ -471,10 +494,52 @@ Extended StudentTGreater(Extended T, Extended DF) {
 }
 
 namespace {
-// The t >= 0 with P(T > t) = p for 0 < p <= 1/2: x / y = t^2 / DF from the beta root.
+// t^2 / DF for the t with P(T > t) = p (0 < p <= 1/2), as a first estimate: exact for DF = 1
+// and 2, Hill's approximation (CACM Algorithm 396) from DF = 3 on, NaN below that or where the
+// approximation leaves the range.
+Extended StudentRatioEstimate(Extended p, Extended DF) {
+  constexpr Extended kHalfPi = 1.57079632679489661923132169163975144L;
+  const Extended two_sided = 2.0L * p;
+  if (DF == 1.0L) {
+    const Extended cot = 1.0L / std::tan(kHalfPi * two_sided);
+    return cot * cot;
+  }
+  if (DF == 2.0L) return (1.0L - two_sided) * (1.0L - two_sided) / (two_sided * (2.0L - two_sided));
+  if (!(DF >= 3.0L) || !(0.5L * two_sided > 0.0L)) return kNaN;
+  const Extended n = DF;
+  const Extended a = 1.0L / (n - 0.5L);
+  const Extended b = 48.0L / (a * a);
+  Extended c = ((20700.0L * a / b - 98.0L) * a - 16.0L) * a + 96.36L;
+  const Extended d = ((94.5L / (b + c) - 3.0L) / b + 1.0L) * std::sqrt(a * kHalfPi) * n;
+  Extended y = std::pow(d * two_sided, 2.0L / n);
+  if (y > 0.05L + a) {
+    // The expansion about the normal quantile.
+    const Extended x = tovrin::InvNormalLess(0.5L * two_sided);
+    y = x * x;
+    if (n < 5.0L) c += 0.3L * (n - 4.5L) * (x + 0.6L);
+    c = (((0.05L * d * x - 5.0L) * x - 7.0L) * x - 2.0L) * x + b + c;
+    y = (((((0.4L * y + 6.3L) * y + 36.0L) * y + 94.5L) / c - y - 3.0L) / b + 1.0L) * x;
+    return std::expm1(a * y * y);
+  }
+  if (!(y > 0.0L)) return kNaN;
+  return ((1.0L / (((n + 6.0L) / (n * y) - 0.089L * d - 0.822L) * (n + 2.0L) * 3.0L) +
+           0.5L / (n + 4.0L)) *
+              y -
+          1.0L) *
+             (n + 1.0L) / (n + 2.0L) +
+         1.0L / y;
+}
+
+// The t >= 0 with P(T > t) = p for 0 < p <= 1/2: x / y = t^2 / DF from the beta root, started
+// from the estimate above.
 Extended InverseStudentUpper(Extended p, Extended DF) {
   if (p == 0.5L) return 0.0L;
-  return std::sqrt(DF) * std::sqrt(BetaRootRatio(1.0L - 2.0L * p, 2.0L * p, 0.5L, 0.5L * DF));
+  const Extended ratio = StudentRatioEstimate(p, DF);
+  detail::BetaRoot start{kNaN, kNaN};
+  if (ratio > 0.0L && std::isfinite(ratio)) start = {ratio / (1.0L + ratio), 1.0L / (1.0L + ratio)};
+  const detail::BetaRoot r =
+      detail::InverseIncompleteBetaTails(1.0L - 2.0L * p, 2.0L * p, 0.5L, 0.5L * DF, &start);
+  return std::sqrt(DF) * std::sqrt(r.x / r.y);
 }
 }  // namespace
 

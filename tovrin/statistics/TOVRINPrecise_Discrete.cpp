@@ -11,6 +11,7 @@
 
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINMath.h"
+#include "tovrin/foundation/detail/Elementary.h"
 #include "tovrin/foundation/detail/IncompleteTails.h"
 #include "tovrin/statistics/TOVRINPrecise.h"
 #include "tovrin/statistics/detail/PairArithmetic.h"
@@ -26,8 +27,31 @@ constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
 constexpr Extended kEpsilon = std::numeric_limits<Extended>::epsilon();
 constexpr Extended kTwoPi = 6.28318530717958647692528676655900577L;
 
+// ln(n!) - ln(sqrt(2 pi n) (n / e)^n) for the counts n = 1..11 (mpmath, 25 digits); from 12 on
+// Stirling's series is as cheap.
+constexpr Extended kStirlingErrorOfCount[] = {
+    0.08106146679532725821967026L,  0.04134069595540929409382208L,  0.02767792568499833914878929L,
+    0.02079067210376509311152277L,  0.01664469118982119216319487L,  0.01387612882307074799874573L,
+    0.01189670994589177009505572L,  0.01041126526197209649747857L,  0.009255462182712732917728637L,
+    0.008330563433362871256469319L, 0.007573675487951840794972024L,
+};
+
 // ln(n!) - ln(sqrt(2 pi n) (n / e)^n) for n > 0; 0 for n = 0 (the terms using it vanish).
-Extended StirlingError(Extended n) { return n > 0 ? detail::StirlingRemainder(n) : 0.0L; }
+Extended StirlingError(Extended n) {
+  if (n < 12.0L) {
+    if (!(n > 0.0L)) return 0.0L;
+    if (n == std::floor(n)) return kStirlingErrorOfCount[static_cast<int>(n) - 1];
+  }
+  return detail::StirlingRemainder(n);
+}
+
+// Near the mean the exponent E of a point probability e^-E is small and the deviances form it
+// to a few units in its last place: one exp instead of the powers, whose error E times that
+// stays far inside the bound up to this E.
+constexpr Extended kDirectExponent = 16.0L;
+
+// Whether bd0(x, m) takes Loader's series (no logarithm) in Deviance.
+bool NearMean(Extended x, const Pair& m) { return std::fabs(x - m.hi) < 0.1L * (x + m.hi); }
 
 // bd0(x, m) = x ln(x / m) + m - x >= 0, for m = hi + lo: Loader's series in v = (x - m) /
 // (x + m) near x = m, where the three terms cancel, and the direct form elsewhere.
@@ -35,7 +59,7 @@ Extended Deviance(Extended x, const Pair& m) {
   Extended d;
   if (x == 0.0L) {
     d = m.hi;
-  } else if (std::fabs(x - m.hi) < 0.1L * (x + m.hi)) {
+  } else if (NearMean(x, m)) {
     const Extended v = (x - m.hi) / (x + m.hi);
     Extended s = (x - m.hi) * v;
     Extended ej = 2.0L * x * v;
@@ -78,6 +102,10 @@ Extended BinomialPoint(Extended x, Extended n, const Pair& np, const Pair& nq) {
   }
   const Extended stirling = StirlingError(n) - StirlingError(x) - StirlingError(n - x);
   const Extended root = std::sqrt(n / (kTwoPi * x * (n - x)));
+  if (NearMean(x, np) && NearMean(n - x, nq)) {
+    const Extended exponent = Deviance(x, np) + Deviance(n - x, nq);
+    if (exponent <= kDirectExponent) return detail::Exp80(stirling - exponent) * root;
+  }
   const Extended left = PowerOfRatio(np, x);
   const Extended right = PowerOfRatio(nq, n - x);
   if (AllNormal(left, right, left * right)) return left * right * std::exp(stirling) * root;
@@ -266,6 +294,12 @@ Extended PoissonEq(Extended Mean, LongWord X) {
   if (X == 0) return std::exp(-Mean);
   // e^-bd0(x, Mean) = (Mean / x)^x e^(x - Mean), from powers while they stay in range.
   const Extended x = X;
+  if (NearMean(x, Pair{Mean})) {
+    const Extended exponent = Deviance(x, Pair{Mean});
+    if (exponent <= kDirectExponent) {
+      return detail::Exp80(-StirlingError(x) - exponent) / std::sqrt(kTwoPi * x);
+    }
+  }
   const Extended root = std::exp(-StirlingError(x)) / std::sqrt(kTwoPi * x);
   // The power as the square of its half, which reaches twice as far.
   const Pair q = detail::Quotient(Pair{Mean}, Pair{x});

@@ -4,10 +4,11 @@
 #include <limits>
 #include <map>
 #include <string>
+#include <utility>
 
-#include "gtest/gtest.h"
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/statistics/TOVRINPrecise_testing.h"
+#include "tovrin/testing/TOVRIN_testing.h"
 
 namespace tovrin {
 namespace {
@@ -51,116 +52,83 @@ using namespace precise;  // NOLINT: the family under test
 constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
 constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
 
-struct ErrorCase {
-  const char* what;
-  TResStringId ident;
-  Extended (*call)();
-};
-
-// Each check of each family raises its identifier, in the classic functions' order.
+// Each check of each family raises its identifier, in the classic functions' order (the
+// argument checked first raises).
 TEST(PreciseArguments, RaiseTheClassicIdentifiers) {
-  const ErrorCase cases[] = {
-      {"InvNormalLess(0)", rsValue01, [] { return InvNormalLess(0); }},
-      {"InvNormalGreater(1)", rsValue01, [] { return InvNormalGreater(1); }},
-      {"InvNormalLess(NaN)", rsValue01, [] { return InvNormalLess(kNaN); }},
-      {"NormalPDF sd 0", rsStdDev, [] { return NormalPDF(0, 0, 1); }},
-      {"NormalDistLess sd < 0", rsStdDev, [] { return NormalDistLess(0, -1, 1); }},
-      {"NormalDistGreater sd tiny", rsStdDev, [] { return NormalDistGreater(0, 1e-13L, 1); }},
-      {"InvNormalDistLess P first", rsValue01, [] { return InvNormalDistLess(0, -1, 2); }},
-      {"InvNormalDistGreater sd", rsStdDev, [] { return InvNormalDistGreater(0, -1, 0.5L); }},
-      {"LogNormalPDF X 0", rsValueGZero, [] { return LogNormalPDF(0, 1, 0); }},
-      {"LogNormalLess sd", rsStdDev, [] { return LogNormalLess(0, 0, 1); }},
-      {"InvLogNormalLess P", rsValue01, [] { return InvLogNormalLess(0, 1, 1); }},
-      {"InvLogNormalGreater sd", rsStdDev, [] { return InvLogNormalGreater(0, 0, 0.5L); }},
-      {"IncompleteGamma X < 0", rsValueGEZero, [] { return IncompleteGamma(-1, -1); }},
-      {"IncompleteGammaUpper A 0", rsValueGZero, [] { return IncompleteGammaUpper(0, 1); }},
-      {"ChiSquareLess X < 0", rsValueGEZero, [] { return ChiSquareLess(-1, 0); }},
-      {"ChiSquareGreater DF 0", rsDF, [] { return ChiSquareGreater(1, 0); }},
-      {"ChiSquarePDF DF < 0", rsDF, [] { return ChiSquarePDF(1, -2); }},
-      {"InvChiSquareLess DF", rsDF, [] { return InvChiSquareLess(2, 0); }},
-      {"InvChiSquareGreater P", rsValueGEZero, [] { return InvChiSquareGreater(1.5L, 3); }},
-      {"FDistLess X 0", rsValueGZero, [] { return FDistLess(0, 0, 1); }},
-      {"FDistGreater DF2", rsDF, [] { return FDistGreater(1, 1, 0); }},
-      {"FDistPDF DF first", rsDF, [] { return FDistPDF(-1, 0, 1); }},
-      {"FDistPDF X < 0", rsValueGEZero, [] { return FDistPDF(-1, 1, 1); }},
-      {"InvFDistLess P", rsValue01Inc, [] { return InvFDistLess(-0.1L, 0, 1); }},
-      {"InvFDistGreater DF", rsDF, [] { return InvFDistGreater(0.5L, 1, 0); }},
-      {"StudentTLess DF", rsDF, [] { return StudentTLess(1, 0); }},
-      {"StudentTGreater DF NaN", rsDF, [] { return StudentTGreater(1, kNaN); }},
-      {"StudentTPDF DF", rsDF, [] { return StudentTPDF(1, -1); }},
-      {"InvStudentTLess P", rsValue01Inc, [] { return InvStudentTLess(2, 0); }},
-      {"InvStudentTGreater DF", rsDF, [] { return InvStudentTGreater(0.5L, 0); }},
-      {"ExponentialLess mean", rsExpDistInvalid, [] { return ExponentialLess(0, 1); }},
-      {"ExponentialGreater X", rsExpDistInvalid, [] { return ExponentialGreater(1, -1); }},
-      {"ExponentialPDF mean NaN", rsExpDistInvalid, [] { return ExponentialPDF(1, kNaN); }},
-      {"BetaDistLess shape", rsValueGZero, [] { return BetaDistLess(0.5L, 0, 1); }},
-      {"BetaDistGreater bounds", rsSameValue, [] { return BetaDistGreater(0.5L, 0, 1, 2, 2); }},
-      {"InvBetaDistLess P", rsValue01Inc, [] { return InvBetaDistLess(1.5L, 0, 1); }},
-      {"InvBetaDistGreater shape", rsValueGZero, [] { return InvBetaDistGreater(0.5L, 1, -1); }},
-      {"InvBetaDistLess bounds", rsSameValue, [] { return InvBetaDistLess(2, 1, 1, 3, 3); }},
-      {"BetaPDF shape", rsValueGZero, [] { return BetaPDF(0.5L, 1, 0); }},
-      {"BetaPDF bounds", rsSameValue, [] { return BetaPDF(0.5L, 1, 1, 1, 1); }},
-      {"BinomialEq N 0", rsBinomDistInvalid, [] { return BinomialEq(0.5L, 0, 0); }},
-      {"BinomialLess P > 1", rsBinomDistInvalid, [] { return BinomialLess(1.5L, 4, 1); }},
-      {"BinomialGreater R > N", rsBinomDistInvalid, [] { return BinomialGreater(0.5L, 4, 5); }},
-      {"HyperGeometricEq S > N", rsHyperGeometricInvalid,
-       [] { return HyperGeometricEq(5, 6, 1, 0); }},
-      {"HyperGeometricLess X > S", rsHyperGeometricInvalid,
-       [] { return HyperGeometricLess(10, 3, 4, 4); }},
-      {"HyperGeometricGreater M > N", rsHyperGeometricInvalid,
-       [] { return HyperGeometricGreater(10, 3, 11, 1); }},
-      {"PoissonEq mean 0", rsPoissonInvalid, [] { return PoissonEq(0, 1); }},
-      {"PoissonLess mean < 0", rsPoissonInvalid, [] { return PoissonLess(-1, 1); }},
-      {"PoissonGreater mean 0", rsPoissonInvalid, [] { return PoissonGreater(0, 1); }},
-  };
-  for (const ErrorCase& c : cases) {
-    try {
-      c.call();
-      ADD_FAILURE() << c.what << ": no EMathError";
-    } catch (const EMathError& e) {
-      EXPECT_EQ(e.Ident(), c.ident) << c.what << " raised " << ResStringName(e.Ident());
-    }
-  }
+  testing::ExpectEachRaises(
+      rsValue01,
+      {[] { InvNormalLess(0); }, [] { InvNormalGreater(1); }, [] { InvNormalLess(kNaN); },
+       [] { InvNormalDistLess(0, -1, 2); }, [] { InvLogNormalLess(0, 1, 1); }});
+  testing::ExpectEachRaises(
+      rsStdDev, {[] { NormalPDF(0, 0, 1); }, [] { NormalDistLess(0, -1, 1); },
+                 [] { NormalDistGreater(0, 1e-13L, 1); }, [] { InvNormalDistGreater(0, -1, 0.5L); },
+                 [] { LogNormalLess(0, 0, 1); }, [] { InvLogNormalGreater(0, 0, 0.5L); }});
+  testing::ExpectEachRaises(rsValueGZero,
+                            {[] { LogNormalPDF(0, 1, 0); }, [] { IncompleteGammaUpper(0, 1); },
+                             [] { FDistLess(0, 0, 1); }, [] { BetaDistLess(0.5L, 0, 1); },
+                             [] { InvBetaDistGreater(0.5L, 1, -1); }, [] { BetaPDF(0.5L, 1, 0); }});
+  testing::ExpectEachRaises(rsValueGEZero,
+                            {[] { IncompleteGamma(-1, -1); }, [] { ChiSquareLess(-1, 0); },
+                             [] { InvChiSquareGreater(1.5L, 3); }, [] { FDistPDF(-1, 1, 1); }});
+  testing::ExpectEachRaises(rsDF,
+                            {[] { ChiSquareGreater(1, 0); }, [] { ChiSquarePDF(1, -2); },
+                             [] { InvChiSquareLess(2, 0); }, [] { FDistGreater(1, 1, 0); },
+                             [] { FDistPDF(-1, 0, 1); }, [] { InvFDistGreater(0.5L, 1, 0); },
+                             [] { StudentTLess(1, 0); }, [] { StudentTGreater(1, kNaN); },
+                             [] { StudentTPDF(1, -1); }, [] { InvStudentTGreater(0.5L, 0); }});
+  testing::ExpectEachRaises(rsValue01Inc,
+                            {[] { InvFDistLess(-0.1L, 0, 1); }, [] { InvStudentTLess(2, 0); },
+                             [] { InvBetaDistLess(1.5L, 0, 1); }});
+  testing::ExpectEachRaises(rsExpDistInvalid,
+                            {[] { ExponentialLess(0, 1); }, [] { ExponentialGreater(1, -1); },
+                             [] { ExponentialPDF(1, kNaN); }});
+  testing::ExpectEachRaises(
+      rsSameValue, {[] { BetaDistGreater(0.5L, 0, 1, 2, 2); },
+                    [] { InvBetaDistLess(2, 1, 1, 3, 3); }, [] { BetaPDF(0.5L, 1, 1, 1, 1); }});
+  testing::ExpectEachRaises(rsBinomDistInvalid,
+                            {[] { BinomialEq(0.5L, 0, 0); }, [] { BinomialLess(1.5L, 4, 1); },
+                             [] { BinomialGreater(0.5L, 4, 5); }});
+  testing::ExpectEachRaises(rsHyperGeometricInvalid, {[] { HyperGeometricEq(5, 6, 1, 0); },
+                                                      [] { HyperGeometricLess(10, 3, 4, 4); },
+                                                      [] { HyperGeometricGreater(10, 3, 11, 1); }});
+  testing::ExpectEachRaises(rsPoissonInvalid, {[] { PoissonEq(0, 1); }, [] { PoissonLess(-1, 1); },
+                                               [] { PoissonGreater(0, 1); }});
 }
 
 // The ends of the domains, where the value is exact.
 TEST(PreciseEdges, ExactValuesAtTheEnds) {
-  const struct {
-    const char* what;
-    Extended got;
-    Extended want;
-  } cases[] = {
-      {"NormalLess(0)", NormalLess(0), 0.5L},
-      {"NormalGreater(inf)", NormalGreater(kInf), 0},
-      {"IncompleteGamma(2, 0)", IncompleteGamma(2, 0), 0},
-      {"IncompleteGammaUpper(2, inf)", IncompleteGammaUpper(2, kInf), 0},
-      {"StudentTLess(0, 7)", StudentTLess(0, 7), 0.5L},
-      {"StudentTLess(-inf, 3)", StudentTLess(-kInf, 3), 0},
-      {"InvStudentTLess(0, 3)", InvStudentTLess(0, 3), -kInf},
-      {"InvStudentTGreater(0.5, 3)", InvStudentTGreater(0.5L, 3), 0},
-      {"InvFDistLess(1, 2, 3)", InvFDistLess(1, 2, 3), 0},
-      {"InvChiSquareLess(0, 4)", InvChiSquareLess(0, 4), 0},
-      {"InvChiSquareGreater(0, 4)", InvChiSquareGreater(0, 4), kInf},
-      {"InvBetaDistLess(1, 2, 3)", InvBetaDistLess(1, 2, 3), 1},
-      {"InvBetaDistLess(0, 2, 3, 5, 1)", InvBetaDistLess(0, 2, 3, 5, 1), 1},
-      {"BetaDistLess(-1, 2, 3)", BetaDistLess(-1, 2, 3), 0},
-      {"BetaDistGreater(2, 2, 3)", BetaDistGreater(2, 2, 3), 0},
-      {"BetaPDF(0, 1, 3)", BetaPDF(0, 1, 3), 3},
-      {"ChiSquarePDF(0, 2)", ChiSquarePDF(0, 2), 0.5L},
-      {"FDistPDF(0, 2, 5)", FDistPDF(0, 2, 5), 1},
-      {"ExponentialLess(2, 0)", ExponentialLess(2, 0), 0},
-      {"LogNormalLess(0, 1, 0)", LogNormalLess(0, 1, 0), 0},
-      {"LogNormalGreater(0, 1, -1)", LogNormalGreater(0, 1, -1), 1},
-      {"BinomialLess(0.5, 4, 0)", BinomialLess(0.5L, 4, 0), 0},
-      {"BinomialGreater(0.5, 4, 4)", BinomialGreater(0.5L, 4, 4), 0},
-      {"BinomialEq(0, 4, 0)", BinomialEq(0, 4, 0), 1},
-      {"BinomialEq(1, 4, 3)", BinomialEq(1, 4, 3), 0},
-      {"HyperGeometricEq(10, 3, 4, 4)", HyperGeometricEq(10, 3, 4, 4), 0},
-      {"HyperGeometricLess(10, 10, 4, 4)", HyperGeometricLess(10, 10, 4, 4), 0},
-      {"PoissonLess(3, 0)", PoissonLess(3, 0), 0},
-      {"PoissonEq(2, 0)", PoissonEq(2, 0), std::exp(-2.0L)},
-  };
-  for (const auto& c : cases) EXPECT_EQ(c.got, c.want) << c.what;
+  const std::pair<Extended, Extended> cases[] = {{NormalLess(0), 0.5L},
+                                                 {NormalGreater(kInf), 0},
+                                                 {IncompleteGamma(2, 0), 0},
+                                                 {IncompleteGammaUpper(2, kInf), 0},
+                                                 {StudentTLess(0, 7), 0.5L},
+                                                 {StudentTLess(-kInf, 3), 0},
+                                                 {InvStudentTLess(0, 3), -kInf},
+                                                 {InvStudentTGreater(0.5L, 3), 0},
+                                                 {InvFDistLess(1, 2, 3), 0},
+                                                 {InvChiSquareLess(0, 4), 0},
+                                                 {InvChiSquareGreater(0, 4), kInf},
+                                                 {InvBetaDistLess(1, 2, 3), 1},
+                                                 {InvBetaDistLess(0, 2, 3, 5, 1), 1},
+                                                 {BetaDistLess(-1, 2, 3), 0},
+                                                 {BetaDistGreater(2, 2, 3), 0},
+                                                 {BetaPDF(0, 1, 3), 3},
+                                                 {ChiSquarePDF(0, 2), 0.5L},
+                                                 {FDistPDF(0, 2, 5), 1},
+                                                 {ExponentialLess(2, 0), 0},
+                                                 {LogNormalLess(0, 1, 0), 0},
+                                                 {LogNormalGreater(0, 1, -1), 1},
+                                                 {BinomialLess(0.5L, 4, 0), 0},
+                                                 {BinomialGreater(0.5L, 4, 4), 0},
+                                                 {BinomialEq(0, 4, 0), 1},
+                                                 {BinomialEq(1, 4, 3), 0},
+                                                 {HyperGeometricEq(10, 3, 4, 4), 0},
+                                                 {HyperGeometricLess(10, 10, 4, 4), 0},
+                                                 {PoissonLess(3, 0), 0},
+                                                 {PoissonEq(2, 0), std::exp(-2.0L)}};
+  for (std::size_t i = 0; i < std::size(cases); ++i) {
+    EXPECT_EQ(cases[i].first, cases[i].second) << "case " << i;
+  }
 }
 
 }  // namespace

@@ -25,94 +25,52 @@ struct NamedCall {
 
 inline LongWord U(Extended v) { return static_cast<LongWord>(v); }
 
-// Every function of the family that the reference table exercises, by name.
+// Every function of the family that the reference table exercises, by name, by its arguments:
+// 1, 2 or 3 Extended; B(inomial) P, N, R; H(ypergeometric) N, S, M, X; P(oisson) mean, X; the
+// beta family takes its bounds from a[3] and a[4] when they differ.
+// clang-format off
+#define TOVRIN_CALL(F, ...) NamedCall{#F, [](const Extended* a) { return precise::F(__VA_ARGS__); }}
+#define TOVRIN_1(F) TOVRIN_CALL(F, a[0])
+#define TOVRIN_2(F) TOVRIN_CALL(F, a[0], a[1])
+#define TOVRIN_3(F) TOVRIN_CALL(F, a[0], a[1], a[2])
+#define TOVRIN_B(F) TOVRIN_CALL(F, a[0], U(a[1]), U(a[2]))
+#define TOVRIN_H(F) TOVRIN_CALL(F, U(a[0]), U(a[1]), U(a[2]), U(a[3]))
+#define TOVRIN_P(F) TOVRIN_CALL(F, a[0], U(a[1]))
+#define TOVRIN_BOUNDED(F) NamedCall{#F, [](const Extended* a) {                   \
+    return a[3] == a[4] ? precise::F(a[0], a[1], a[2])                               \
+                        : precise::F(a[0], a[1], a[2], a[3], a[4]); }}
+// clang-format on
 inline constexpr NamedCall kPreciseCalls[] = {
-    {"NormalZ", [](const Extended* a) { return precise::NormalZ(a[0]); }},
-    {"NormalLess", [](const Extended* a) { return precise::NormalLess(a[0]); }},
-    {"NormalGreater", [](const Extended* a) { return precise::NormalGreater(a[0]); }},
-    {"InvNormalLess", [](const Extended* a) { return precise::InvNormalLess(a[0]); }},
-    {"InvNormalGreater", [](const Extended* a) { return precise::InvNormalGreater(a[0]); }},
-    {"NormalPDF", [](const Extended* a) { return precise::NormalPDF(a[0], a[1], a[2]); }},
-    {"NormalDistLess", [](const Extended* a) { return precise::NormalDistLess(a[0], a[1], a[2]); }},
-    {"NormalDistGreater",
-     [](const Extended* a) { return precise::NormalDistGreater(a[0], a[1], a[2]); }},
-    {"InvNormalDistLess",
-     [](const Extended* a) { return precise::InvNormalDistLess(a[0], a[1], a[2]); }},
-    {"InvNormalDistGreater",
-     [](const Extended* a) { return precise::InvNormalDistGreater(a[0], a[1], a[2]); }},
-    {"LogNormalPDF", [](const Extended* a) { return precise::LogNormalPDF(a[0], a[1], a[2]); }},
-    {"LogNormalLess", [](const Extended* a) { return precise::LogNormalLess(a[0], a[1], a[2]); }},
-    {"LogNormalGreater",
-     [](const Extended* a) { return precise::LogNormalGreater(a[0], a[1], a[2]); }},
-    {"InvLogNormalLess",
-     [](const Extended* a) { return precise::InvLogNormalLess(a[0], a[1], a[2]); }},
-    {"InvLogNormalGreater",
-     [](const Extended* a) { return precise::InvLogNormalGreater(a[0], a[1], a[2]); }},
-    {"IncompleteGamma", [](const Extended* a) { return precise::IncompleteGamma(a[0], a[1]); }},
-    {"IncompleteGammaUpper",
-     [](const Extended* a) { return precise::IncompleteGammaUpper(a[0], a[1]); }},
-    {"ChiSquareLess", [](const Extended* a) { return precise::ChiSquareLess(a[0], a[1]); }},
-    {"ChiSquareGreater", [](const Extended* a) { return precise::ChiSquareGreater(a[0], a[1]); }},
-    {"InvChiSquareLess", [](const Extended* a) { return precise::InvChiSquareLess(a[0], a[1]); }},
-    {"InvChiSquareGreater",
-     [](const Extended* a) { return precise::InvChiSquareGreater(a[0], a[1]); }},
-    {"ChiSquarePDF", [](const Extended* a) { return precise::ChiSquarePDF(a[0], a[1]); }},
-    {"FDistLess", [](const Extended* a) { return precise::FDistLess(a[0], a[1], a[2]); }},
-    {"FDistGreater", [](const Extended* a) { return precise::FDistGreater(a[0], a[1], a[2]); }},
-    {"InvFDistLess", [](const Extended* a) { return precise::InvFDistLess(a[0], a[1], a[2]); }},
-    {"InvFDistGreater",
-     [](const Extended* a) { return precise::InvFDistGreater(a[0], a[1], a[2]); }},
-    {"FDistPDF", [](const Extended* a) { return precise::FDistPDF(a[0], a[1], a[2]); }},
-    {"StudentTLess", [](const Extended* a) { return precise::StudentTLess(a[0], a[1]); }},
-    {"StudentTGreater", [](const Extended* a) { return precise::StudentTGreater(a[0], a[1]); }},
-    {"InvStudentTLess", [](const Extended* a) { return precise::InvStudentTLess(a[0], a[1]); }},
-    {"InvStudentTGreater",
-     [](const Extended* a) { return precise::InvStudentTGreater(a[0], a[1]); }},
-    {"StudentTPDF", [](const Extended* a) { return precise::StudentTPDF(a[0], a[1]); }},
-    {"ExponentialLess", [](const Extended* a) { return precise::ExponentialLess(a[0], a[1]); }},
-    {"ExponentialGreater",
-     [](const Extended* a) { return precise::ExponentialGreater(a[0], a[1]); }},
-    {"ExponentialPDF", [](const Extended* a) { return precise::ExponentialPDF(a[0], a[1]); }},
-    {"BetaDistLess",
-     [](const Extended* a) {
-       return a[3] == a[4] ? precise::BetaDistLess(a[0], a[1], a[2])
-                           : precise::BetaDistLess(a[0], a[1], a[2], a[3], a[4]);
-     }},
-    {"BetaDistGreater",
-     [](const Extended* a) {
-       return a[3] == a[4] ? precise::BetaDistGreater(a[0], a[1], a[2])
-                           : precise::BetaDistGreater(a[0], a[1], a[2], a[3], a[4]);
-     }},
-    {"InvBetaDistLess",
-     [](const Extended* a) { return precise::InvBetaDistLess(a[0], a[1], a[2]); }},
-    {"InvBetaDistGreater",
-     [](const Extended* a) { return precise::InvBetaDistGreater(a[0], a[1], a[2]); }},
-    {"BetaPDF",
-     [](const Extended* a) {
-       return a[3] == a[4] ? precise::BetaPDF(a[0], a[1], a[2])
-                           : precise::BetaPDF(a[0], a[1], a[2], a[3], a[4]);
-     }},
-    {"BinomialEq", [](const Extended* a) { return precise::BinomialEq(a[0], U(a[1]), U(a[2])); }},
-    {"BinomialLess",
-     [](const Extended* a) { return precise::BinomialLess(a[0], U(a[1]), U(a[2])); }},
-    {"BinomialGreater",
-     [](const Extended* a) { return precise::BinomialGreater(a[0], U(a[1]), U(a[2])); }},
-    {"HyperGeometricEq",
-     [](const Extended* a) {
-       return precise::HyperGeometricEq(U(a[0]), U(a[1]), U(a[2]), U(a[3]));
-     }},
-    {"HyperGeometricLess",
-     [](const Extended* a) {
-       return precise::HyperGeometricLess(U(a[0]), U(a[1]), U(a[2]), U(a[3]));
-     }},
-    {"HyperGeometricGreater",
-     [](const Extended* a) {
-       return precise::HyperGeometricGreater(U(a[0]), U(a[1]), U(a[2]), U(a[3]));
-     }},
-    {"PoissonEq", [](const Extended* a) { return precise::PoissonEq(a[0], U(a[1])); }},
-    {"PoissonLess", [](const Extended* a) { return precise::PoissonLess(a[0], U(a[1])); }},
-    {"PoissonGreater", [](const Extended* a) { return precise::PoissonGreater(a[0], U(a[1])); }},
-};
+    // normal and log-normal
+    TOVRIN_1(NormalZ), TOVRIN_1(NormalLess), TOVRIN_1(NormalGreater), TOVRIN_1(InvNormalLess),
+    TOVRIN_1(InvNormalGreater), TOVRIN_3(NormalPDF), TOVRIN_3(NormalDistLess),
+    TOVRIN_3(NormalDistGreater), TOVRIN_3(InvNormalDistLess), TOVRIN_3(InvNormalDistGreater),
+    TOVRIN_3(LogNormalPDF), TOVRIN_3(LogNormalLess), TOVRIN_3(LogNormalGreater),
+    TOVRIN_3(InvLogNormalLess), TOVRIN_3(InvLogNormalGreater),
+    // gamma and chi-square
+    TOVRIN_2(IncompleteGamma), TOVRIN_2(IncompleteGammaUpper), TOVRIN_2(ChiSquareLess),
+    TOVRIN_2(ChiSquareGreater), TOVRIN_2(InvChiSquareLess), TOVRIN_2(InvChiSquareGreater),
+    TOVRIN_2(ChiSquarePDF),
+    // F, Student's t, exponential
+    TOVRIN_3(FDistLess), TOVRIN_3(FDistGreater), TOVRIN_3(InvFDistLess), TOVRIN_3(InvFDistGreater),
+    TOVRIN_3(FDistPDF), TOVRIN_2(StudentTLess), TOVRIN_2(StudentTGreater),
+    TOVRIN_2(InvStudentTLess), TOVRIN_2(InvStudentTGreater), TOVRIN_2(StudentTPDF),
+    TOVRIN_2(ExponentialLess), TOVRIN_2(ExponentialGreater), TOVRIN_2(ExponentialPDF),
+    // beta
+    TOVRIN_BOUNDED(BetaDistLess), TOVRIN_BOUNDED(BetaDistGreater), TOVRIN_3(InvBetaDistLess),
+    TOVRIN_3(InvBetaDistGreater), TOVRIN_BOUNDED(BetaPDF),
+    // discrete
+    TOVRIN_B(BinomialEq), TOVRIN_B(BinomialLess), TOVRIN_B(BinomialGreater),
+    TOVRIN_H(HyperGeometricEq), TOVRIN_H(HyperGeometricLess), TOVRIN_H(HyperGeometricGreater),
+    TOVRIN_P(PoissonEq), TOVRIN_P(PoissonLess), TOVRIN_P(PoissonGreater)};
+#undef TOVRIN_CALL
+#undef TOVRIN_1
+#undef TOVRIN_2
+#undef TOVRIN_3
+#undef TOVRIN_B
+#undef TOVRIN_H
+#undef TOVRIN_P
+#undef TOVRIN_BOUNDED
 
 inline PreciseCall FindPreciseCall(std::string_view name) {
   for (const NamedCall& c : kPreciseCalls) {

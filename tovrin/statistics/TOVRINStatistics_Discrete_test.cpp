@@ -14,6 +14,7 @@ namespace {
 
 #include "tovrin/statistics/TOVRINStatistics_Distributions_reference.inc"
 
+using testing::ExpectEachRaises;
 using testing::ExpectRaises;
 using testing::Near;
 using testing::RelNear;
@@ -45,16 +46,13 @@ TEST(Combinatorics, AgainstExactValues) {
   EXPECT_EQ(BinomialCoeff(67, 33), 14226520737620288370.0L);  // the exact result rounds back
   EXPECT_EQ(BinomialCoeff(4294967295U, 4294967294U), 4294967295.0L);  // K replaced by N - K
   EXPECT_TRUE(std::isfinite(BinomialCoeff(16000, 8000)));
-  ExpectRaises(rsFactOverflow, [] { Factorial(1755); });
-  ExpectRaises(rsFactOverflow, [] { Factorial(2147483648U); });
-  ExpectRaises(rsPermInvalid, [] { Permutation(5, 6); });
-  ExpectRaises(rsPermInvalid, [] { Permutation(0, 1); });
-  ExpectRaises(rsPermOverflowed, [] { Permutation(1755, 1755); });
-  ExpectRaises(rsPermOverflowed, [] { Permutation(4294967295U, 4294967295U); });
-  ExpectRaises(rsBinomInvalid, [] { BinomialCoeff(3, 5); });
-  ExpectRaises(rsBinomInvalid, [] { BinomialCoeff(0, 1); });
-  ExpectRaises(rsBinomOverflowed, [] { BinomialCoeff(20000, 10000); });
-  ExpectRaises(rsBinomOverflowed, [] { BinomialCoeff(4294967295U, 2147483647U); });
+  ExpectEachRaises(rsFactOverflow, {[] { Factorial(1755); }, [] { Factorial(2147483648U); }});
+  ExpectEachRaises(rsPermInvalid, {[] { Permutation(5, 6); }, [] { Permutation(0, 1); }});
+  ExpectEachRaises(rsPermOverflowed, {[] { Permutation(1755, 1755); },
+                                      [] { Permutation(4294967295U, 4294967295U); }});
+  ExpectEachRaises(rsBinomInvalid, {[] { BinomialCoeff(3, 5); }, [] { BinomialCoeff(0, 1); }});
+  ExpectEachRaises(rsBinomOverflowed, {[] { BinomialCoeff(20000, 10000); },
+                                       [] { BinomialCoeff(4294967295U, 2147483647U); }});
 }
 
 TEST(Binomial, AgainstReference) {
@@ -101,22 +99,17 @@ TEST(Binomial, SumsAreTheTermsAddedInCountOrder) {
       EXPECT_EQ(BinomialBetween(p, n, n, 0), sum);
     }
   }
-  ExpectRaises(rsBinomOverflowed, [] { BinomialLess(0.5L, 20000, 19000); });
-  ExpectRaises(rsBinomOverflowed, [] { BinomialBetween(0.5L, 20000, 19000, 3); });
+  ExpectEachRaises(rsBinomOverflowed, {[] { BinomialLess(0.5L, 20000, 19000); },
+                                       [] { BinomialBetween(0.5L, 20000, 19000, 3); }});
   EXPECT_NO_THROW(BinomialLess(0.5L, 20000, 10));  // stops short of the first overflow
 }
 
 TEST(Binomial, Checks) {
-  for (Extended p : {-0.1L, 1.1L}) {
-    ExpectRaises(rsBinomDistInvalid, [&] { BinomialEq(p, 4, 1); });
-    ExpectRaises(rsBinomDistInvalid, [&] { BinomialLess(p, 4, 1); });
-    ExpectRaises(rsBinomDistInvalid, [&] { BinomialGreater(p, 4, 1); });
-    ExpectRaises(rsBinomDistInvalid, [&] { BinomialBetween(p, 4, 1, 2); });
-  }
-  ExpectRaises(rsBinomDistInvalid, [] { BinomialEq(0.5L, 0, 0); });
-  ExpectRaises(rsBinomDistInvalid, [] { BinomialEq(0.5L, 4, 5); });
-  ExpectRaises(rsBinomDistInvalid, [] { BinomialGreater(0.5L, 4, 5); });
-  ExpectRaises(rsBinomDistInvalid, [] { BinomialBetween(0.5L, 4, 1, 5); });
+  ExpectEachRaises(rsBinomDistInvalid,
+                   {[] { BinomialEq(-0.1L, 4, 1); }, [] { BinomialLess(1.1L, 4, 1); },
+                    [] { BinomialGreater(-0.1L, 4, 1); }, [] { BinomialBetween(1.1L, 4, 1, 2); },
+                    [] { BinomialEq(0.5L, 0, 0); }, [] { BinomialEq(0.5L, 4, 5); },
+                    [] { BinomialGreater(0.5L, 4, 5); }, [] { BinomialBetween(0.5L, 4, 1, 5); }});
   ExpectRaises(rsBinomOverflowed, [] { BinomialEq(0.5L, 20000, 10000); });
   EXPECT_TRUE(std::isnan(BinomialEq(kNaN, 4, 1)));  // passes the checks
 }
@@ -149,12 +142,11 @@ TEST(HyperGeometric, AgainstReferenceAndExactCounts) {
   EXPECT_EQ(Extended(v[0]) + Extended(v[2]), 0);
   EXPECT_TRUE(Near(Extended(v[3]), 56 / 252.0L, 16 * kEps));  // C(8,3) C(2,2) / C(10,5)
   EXPECT_EQ(HyperGeometricBetween(10, 5, 3, 6, 6), 0);        // equal counts: the point probability
-  ExpectRaises(rsHyperGeometricInvalid, [] { HyperGeometricEq(0, 0, 0, 0); });
-  ExpectRaises(rsHyperGeometricInvalid, [] { HyperGeometricEq(10, 0, 3, 0); });
-  ExpectRaises(rsHyperGeometricInvalid, [] { HyperGeometricEq(10, 11, 3, 0); });
-  ExpectRaises(rsHyperGeometricInvalid, [] { HyperGeometricLess(10, 5, 11, 0); });
-  ExpectRaises(rsHyperGeometricInvalid, [] { HyperGeometricGreater(10, 5, 3, 6); });
-  ExpectRaises(rsHyperGeometricInvalid, [] { HyperGeometricBetween(10, 5, 3, 1, 6); });
+  ExpectEachRaises(
+      rsHyperGeometricInvalid,
+      {[] { HyperGeometricEq(0, 0, 0, 0); }, [] { HyperGeometricEq(10, 0, 3, 0); },
+       [] { HyperGeometricEq(10, 11, 3, 0); }, [] { HyperGeometricLess(10, 5, 11, 0); },
+       [] { HyperGeometricGreater(10, 5, 3, 6); }, [] { HyperGeometricBetween(10, 5, 3, 1, 6); }});
   ExpectRaises(rsBinomOverflowed, [] { HyperGeometricEq(20000, 10000, 10, 3); });
   const std::array<LongWord, 3> bad[] = {{0, 1, 0}, {10, 0, 3}, {10, 11, 3}, {10, 5, 11}};
   for (const auto& b : bad) {
@@ -182,14 +174,12 @@ TEST(Poisson, AgainstReferenceAndRules) {
   EXPECT_EQ(PoissonLess(m, 0), 0);
   EXPECT_TRUE(Near(PoissonGreater(m, 0), 1 - std::exp(-m), 16 * kEps));
   EXPECT_TRUE(std::isnan(PoissonEq(kNaN, 3)));
-  ExpectRaises(rsPoissonInvalid, [] { PoissonEq(0, 1); });
-  ExpectRaises(rsPoissonInvalid, [] { PoissonEq(-1, 1); });
-  ExpectRaises(rsPoissonInvalid, [] { PoissonGreater(-2, 1); });
-  ExpectRaises(rsPoissonInvalid, [] { PoissonBetween(0, 1, 2); });
-  ExpectRaises(rsPoissonInvalid, [] { PoissonLess(0, 4000000000U); });  // Mean first
-  ExpectRaises(rsFactOverflow, [] { PoissonEq(2, 1755); });
-  ExpectRaises(rsFactOverflow, [] { PoissonLess(2, 1756); });
-  ExpectRaises(rsFactOverflow, [] { PoissonGreater(2, 4294967295U); });
+  ExpectEachRaises(
+      rsPoissonInvalid,
+      {[] { PoissonEq(0, 1); }, [] { PoissonEq(-1, 1); }, [] { PoissonGreater(-2, 1); },
+       [] { PoissonBetween(0, 1, 2); }, [] { PoissonLess(0, 4000000000U); }});  // Mean first
+  ExpectEachRaises(rsFactOverflow, {[] { PoissonEq(2, 1755); }, [] { PoissonLess(2, 1756); },
+                                    [] { PoissonGreater(2, 4294967295U); }});
   EXPECT_NO_THROW(PoissonLess(2, 1755));
 }
 

@@ -3,14 +3,18 @@
 // tovrin_testing carries it, with GoogleTest, into each test program.
 #pragma once
 
+#include <atomic>
 #include <cmath>
+#include <cstdint>
 #include <cstring>
+#include <functional>
 #include <initializer_list>
 #include <type_traits>
 #include <vector>
 
 #include <gtest/gtest.h>
 
+#include "tovrin/foundation/TOVRINElementTypes.h"
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINGlobals.h"
 
@@ -25,6 +29,17 @@ void ExpectRaises(TResStringId Ident, Call&& call) {
   } catch (const EMathError& e) {
     EXPECT_EQ(e.Ident(), Ident) << "raised " << ResStringName(e.Ident()) << ", expected "
                                 << ResStringName(Ident);
+  }
+}
+
+// Runs each call, expecting EMathError(Ident) from every one (a table of calls with one
+// identifier).
+inline void ExpectEachRaises(TResStringId Ident,
+                             std::initializer_list<std::function<void()>> calls) {
+  int i = 0;
+  for (const auto& call : calls) {
+    SCOPED_TRACE(::testing::Message() << "call " << i++ << " of the list");
+    ExpectRaises(Ident, call);
   }
 }
 
@@ -87,8 +102,11 @@ inline ::testing::AssertionResult ScaledNear(Extended actual, Extended expected,
 }
 
 // The stored element type as arithmetic sees it: PackedExtended reads as Extended.
+using ::tovrin::detail::ValueOf;
 template <typename T>
-using ValueOf = std::conditional_t<std::is_same_v<T, PackedExtended>, Extended, T>;
+using Matrix = std::vector<std::vector<T>>;
+// Sets QENMatrixRectangularCheck for a scope.
+using MatrixSwitch = SwitchGuard<std::atomic<bool>, bool>;
 
 // A vector of element type T from plain numbers.
 template <typename T>
@@ -151,6 +169,30 @@ requires std::is_enum_v<T> std::vector<std::vector<Int64>> Stored(
   for (const auto& row : m) out.push_back(Stored(row));
   return out;
 }
+
+// FNV-1a over the bits of a stream of results (the 10 value bytes of an Extended, the 8 of an
+// Int64), for tests that pin long runs of results to a recorded hash.
+class ValueHash {
+ public:
+  explicit ValueHash(std::uint64_t basis = 0xCBF29CE484222325ULL) : hash_(basis) {}
+  void Add(Extended x) {
+    unsigned char bytes[sizeof(Extended)] = {};
+    std::memcpy(bytes, &x, sizeof(Extended));
+    AddBytes(bytes, 10);
+  }
+  void Add(Int64 k) {
+    unsigned char bytes[sizeof(Int64)];
+    std::memcpy(bytes, &k, sizeof(Int64));
+    AddBytes(bytes, sizeof(Int64));
+  }
+  std::uint64_t Value() const { return hash_; }
+
+ private:
+  void AddBytes(const unsigned char* bytes, std::size_t n) {
+    for (std::size_t i = 0; i < n; ++i) hash_ = (hash_ ^ bytes[i]) * 0x100000001B3ULL;
+  }
+  std::uint64_t hash_;
+};
 
 using Row = std::vector<Extended>;
 using Rows = std::vector<Row>;

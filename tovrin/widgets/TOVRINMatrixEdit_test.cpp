@@ -6,93 +6,51 @@
 #include <functional>
 
 #include "tovrin/widgets/TOVRINMatrixFractEdit.h"
+#include "tovrin/widgets/TOVRINWidgets_testing.h"
 #include "tovrin/widgets/detail/GridCells.h"
 
 namespace tovrin {
 namespace {
 
-using Command = std::function<bool(TQENMatrixEdit&)>;
-
 // The element-wise functions stop at the failing element and keep what they already wrote;
 // the control must not show that half-way state. Failing elements sit last for that reason.
 TEST(MatrixEditCommands, FailureLeavesContentsAndReportsTheIdentifier) {
-  struct Case {
-    const char* name;
-    TQENFloatMatrix start;
-    Command command;
-    TResStringId ident;
-  };
-  const Case cases[] = {
-      {"Sqrt", {{4, 9}, {16, -1}}, [](auto& e) { return e.Sqrt(); }, rsMatrixNeg},
-      {"Invert", {{2, 4}, {8, 0}}, [](auto& e) { return e.Invert(); }, rsMatrixZero},
-      {"Ln", {{1, 2}, {3, 0}}, [](auto& e) { return e.Ln(); }, rsMatrixNotPos},
-      {"Log10", {{10, 100}, {-5, 1}}, [](auto& e) { return e.Log10(); }, rsMatrixNotPos},
-      {"Sqr of nothing", {}, [](auto& e) { return e.Sqr(); }, rsMatrixIsEmpty},
-      {"Inverse of a singular matrix",
-       {{1, 2}, {2, 4}},
-       [](auto& e) { return e.Inverse(); },
-       rsNoInvert},
-      {"Inverse of a non-square matrix",
-       {{1, 2, 3}, {4, 5, 6}},
-       [](auto& e) { return e.Inverse(); },
-       rsMatrixSqr},
-      {"RowReduce of nothing", {}, [](auto& e) { return e.RowReduce(); }, rsMatrixIsEmpty},
-      {"SwapRows past the end",
-       {{1, 2}, {3, 4}},
-       [](auto& e) { return e.SwapRows(0, 2); },
-       rsInvalidRow},
-      {"SwapCols before the start",
-       {{1, 2}, {3, 4}},
-       [](auto& e) { return e.SwapCols(-1, 0); },
-       rsInvalidCol},
-      {"ScaleRow past the end", {{1, 2}}, [](auto& e) { return e.ScaleRow(1, 2); }, rsInvalidRow},
-      {"AddRows past the end", {{1, 2}}, [](auto& e) { return e.AddRows(0, 3, 1); }, rsInvalidRow},
-      {"Identity of -1", {{1}}, [](auto& e) { return e.Identity(-1); }, rsInvalidValue},
-  };
-  for (const Case& c : cases) {
-    SCOPED_TRACE(c.name);
-    TQENMatrixEdit edit;
-    edit.SetMatrix(c.start);
-    QSignalSpy changed(&edit, &TQENMatrixEdit::Changed);
-    QSignalSpy errors(&edit, &TQENMatrixEdit::MathErrorRaised);
-    EXPECT_FALSE(c.command(edit));
-    EXPECT_EQ(edit.Matrix(), c.start);
-    EXPECT_EQ(changed.count(), 0);
-    ASSERT_EQ(errors.count(), 1);
-    EXPECT_EQ(errors[0][1].toInt(), c.ident);
-    EXPECT_EQ(errors[0][0].toString().toStdString(), LoadResString(c.ident));
-  }
+  testing::RunCommands<TQENMatrixEdit, TQENFloatMatrix, TResStringId>(
+      {{"Sqrt", {{4, 9}, {16, -1}}, [](auto& e) { return e.Sqrt(); }, rsMatrixNeg},
+       {"Invert", {{2, 4}, {8, 0}}, [](auto& e) { return e.Invert(); }, rsMatrixZero},
+       {"Ln", {{1, 2}, {3, 0}}, [](auto& e) { return e.Ln(); }, rsMatrixNotPos},
+       {"Log10", {{10, 100}, {-5, 1}}, [](auto& e) { return e.Log10(); }, rsMatrixNotPos},
+       {"Sqr of nothing", {}, [](auto& e) { return e.Sqr(); }, rsMatrixIsEmpty},
+       {"Inverse singular", {{1, 2}, {2, 4}}, [](auto& e) { return e.Inverse(); }, rsNoInvert},
+       {"Inverse 2x3", {{1, 2, 3}, {4, 5, 6}}, [](auto& e) { return e.Inverse(); }, rsMatrixSqr},
+       {"RowReduce of nothing", {}, [](auto& e) { return e.RowReduce(); }, rsMatrixIsEmpty},
+       {"SwapRows", {{1, 2}, {3, 4}}, [](auto& e) { return e.SwapRows(0, 2); }, rsInvalidRow},
+       {"SwapCols", {{1, 2}, {3, 4}}, [](auto& e) { return e.SwapCols(-1, 0); }, rsInvalidCol},
+       {"ScaleRow past the end", {{1, 2}}, [](auto& e) { return e.ScaleRow(1, 2); }, rsInvalidRow},
+       {"AddRows past the end", {{1, 2}}, [](auto& e) { return e.AddRows(0, 3, 1); }, rsInvalidRow},
+       {"Identity of -1", {{1}}, [](auto& e) { return e.Identity(-1); }, rsInvalidValue}},
+      [](TQENMatrixEdit& e, const TQENFloatMatrix& m) { e.SetMatrix(m); }, &TQENMatrixEdit::Matrix);
 }
 
 TEST(MatrixEditCommands, SuccessRewritesOnce) {
-  struct Case {
-    const char* name;
-    TQENFloatMatrix start;
-    Command command;
-    TQENFloatMatrix expected;
-  };
-  const Case cases[] = {
-      {"Sqr", {{-2, 3}}, [](auto& e) { return e.Sqr(); }, {{4, 9}}},
-      {"Sqrt", {{4, 0.25}}, [](auto& e) { return e.Sqrt(); }, {{2, 0.5}}},
-      {"LinearTransform", {{1, 2}}, [](auto& e) { return e.LinearTransform(3, -1); }, {{2, 5}}},
-      {"Transpose", {{1, 2, 3}}, [](auto& e) { return e.Transpose(); }, {{1}, {2}, {3}}},
-      {"SwapRows", {{1, 2}, {3, 4}}, [](auto& e) { return e.SwapRows(0, 1); }, {{3, 4}, {1, 2}}},
-      {"SwapCols", {{1, 2}, {3, 4}}, [](auto& e) { return e.SwapCols(0, 1); }, {{2, 1}, {4, 3}}},
-      {"ScaleRow", {{1, 2}, {3, 4}}, [](auto& e) { return e.ScaleRow(1, -2); }, {{1, 2}, {-6, -8}}},
-      {"AddRows", {{1, 2}, {3, 4}}, [](auto& e) { return e.AddRows(1, 0, -3); }, {{1, 2}, {0, -2}}},
-      {"Inverse", {{2, 0}, {0, 4}}, [](auto& e) { return e.Inverse(); }, {{0.5, 0}, {0, 0.25}}},
-      {"Identity", {{5}}, [](auto& e) { return e.Identity(2); }, {{1, 0}, {0, 1}}},
-  };
-  for (const Case& c : cases) {
-    SCOPED_TRACE(c.name);
-    TQENMatrixEdit edit;
-    edit.SetMatrix(c.start);
-    QSignalSpy changed(&edit, &TQENMatrixEdit::Changed);
-    EXPECT_TRUE(c.command(edit));
-    EXPECT_EQ(edit.Matrix(), c.expected);
-    EXPECT_EQ(edit.model()->rowCount(), edit.Rows());
-    EXPECT_EQ(changed.count(), 1);
-  }
+  testing::RunCommands<TQENMatrixEdit, TQENFloatMatrix, TQENFloatMatrix>(
+      {{"Sqr", {{-2, 3}}, [](auto& e) { return e.Sqr(); }, {{4, 9}}},
+       {"Sqrt", {{4, 0.25}}, [](auto& e) { return e.Sqrt(); }, {{2, 0.5}}},
+       {"LinearTransform", {{1, 2}}, [](auto& e) { return e.LinearTransform(3, -1); }, {{2, 5}}},
+       {"Transpose", {{1, 2, 3}}, [](auto& e) { return e.Transpose(); }, {{1}, {2}, {3}}},
+       {"SwapRows", {{1, 2}, {3, 4}}, [](auto& e) { return e.SwapRows(0, 1); }, {{3, 4}, {1, 2}}},
+       {"SwapCols", {{1, 2}, {3, 4}}, [](auto& e) { return e.SwapCols(0, 1); }, {{2, 1}, {4, 3}}},
+       {"ScaleRow",
+        {{1, 2}, {3, 4}},
+        [](auto& e) { return e.ScaleRow(1, -2); },
+        {{1, 2}, {-6, -8}}},
+       {"AddRows",
+        {{1, 2}, {3, 4}},
+        [](auto& e) { return e.AddRows(1, 0, -3); },
+        {{1, 2}, {0, -2}}},
+       {"Inverse", {{2, 0}, {0, 4}}, [](auto& e) { return e.Inverse(); }, {{0.5, 0}, {0, 0.25}}},
+       {"Identity", {{5}}, [](auto& e) { return e.Identity(2); }, {{1, 0}, {0, 1}}}},
+      [](TQENMatrixEdit& e, const TQENFloatMatrix& m) { e.SetMatrix(m); }, &TQENMatrixEdit::Matrix);
 }
 
 TEST(MatrixEditShape, RaggedRowsAndNewCellsAreNullAndReadAsZero) {

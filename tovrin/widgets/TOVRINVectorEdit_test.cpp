@@ -7,93 +7,53 @@
 #include <QTest>
 #include <functional>
 
+#include "tovrin/widgets/TOVRINWidgets_testing.h"
+
 namespace tovrin {
 namespace {
 
-using Command = std::function<bool(TQENVectorEdit&)>;
+template <typename Outcome>
+using Case = testing::CommandCase<TQENVectorEdit, TQENFloatVector, Outcome>;
 
 QString Cell(const TQENVectorEdit& edit, int row, int col = 0) {
   return edit.model()->index(row, col).data().toString();
 }
 
-// A command that fails returns false, names the failing check, emits no Changed and leaves
-// every cell, nulls included, as it was.
+// A trailing null cell must survive a failure too (an empty vector stays empty).
 TEST(VectorEditCommands, FailureLeavesContentsAndReportsTheIdentifier) {
-  struct Case {
-    const char* name;
-    TQENFloatVector start;
-    Command command;
-    TResStringId ident;
-  };
-  const Case cases[] = {
-      {"Sqrt of -4", {1, -4, 9}, [](auto& e) { return e.Sqrt(); }, rsVectorNeg},
-      {"Invert of 0", {2, 0}, [](auto& e) { return e.Invert(); }, rsVectorZero},
-      {"Ln of 0", {3, 0, 1}, [](auto& e) { return e.Ln(); }, rsVectorNotPos},
-      {"Log10 of -1", {5, -1}, [](auto& e) { return e.Log10(); }, rsVectorNotPos},
-      {"Sqr of nothing", {}, [](auto& e) { return e.Sqr(); }, rsVectorIsEmpty},
-      {"LinearTransform of nothing",
-       {},
-       [](auto& e) { return e.LinearTransform(2, 1); },
-       rsVectorIsEmpty},
-      {"Delete past the end", {1, 2}, [](auto& e) { return e.Delete(3); }, rsInvalidValue},
-      {"Delete before the start", {1, 2}, [](auto& e) { return e.Delete(-1); }, rsInvalidValue},
-  };
-  for (const Case& c : cases) {
-    SCOPED_TRACE(c.name);
-    TQENVectorEdit edit;
-    edit.SetVector(c.start);
-    // A trailing null cell must survive too (an empty vector stays empty).
-    if (!c.start.empty()) edit.SetCount(edit.Count() + 1);
-    QSignalSpy changed(&edit, &TQENVectorEdit::Changed);
-    QSignalSpy errors(&edit, &TQENVectorEdit::MathErrorRaised);
-    EXPECT_FALSE(c.command(edit));
-    TQENFloatVector expected = c.start;
-    if (!c.start.empty()) expected.push_back(0);
-    EXPECT_EQ(edit.Vector(), expected);
-    EXPECT_EQ(edit.HasNulls(), !c.start.empty());
-    EXPECT_EQ(changed.count(), 0);
-    ASSERT_EQ(errors.count(), 1);
-    EXPECT_EQ(errors[0][1].toInt(), c.ident);
-    EXPECT_EQ(errors[0][0].toString().toStdString(), LoadResString(c.ident));
-  }
+  testing::RunCommands<TQENVectorEdit, TQENFloatVector, TResStringId>(
+      {{"Sqrt of -4", {1, -4, 9}, [](auto& e) { return e.Sqrt(); }, rsVectorNeg},
+       {"Invert of 0", {2, 0}, [](auto& e) { return e.Invert(); }, rsVectorZero},
+       {"Ln of 0", {3, 0, 1}, [](auto& e) { return e.Ln(); }, rsVectorNotPos},
+       {"Log10 of -1", {5, -1}, [](auto& e) { return e.Log10(); }, rsVectorNotPos},
+       {"Sqr of nothing", {}, [](auto& e) { return e.Sqr(); }, rsVectorIsEmpty},
+       {"LinearTransform", {}, [](auto& e) { return e.LinearTransform(2, 1); }, rsVectorIsEmpty},
+       {"Delete past the end", {1, 2}, [](auto& e) { return e.Delete(3); }, rsInvalidValue},
+       {"Delete before the start", {1, 2}, [](auto& e) { return e.Delete(-1); }, rsInvalidValue}},
+      [](TQENVectorEdit& e, const TQENFloatVector& v) {
+        e.SetVector(v);
+        if (!v.empty()) e.SetCount(e.Count() + 1);
+      },
+      &TQENVectorEdit::Vector);
 }
 
 // Values chosen so that every result is exact.
 TEST(VectorEditCommands, SuccessRewritesOnceAndLeavesNoNulls) {
-  struct Case {
-    const char* name;
-    TQENFloatVector start;
-    Command command;
-    TQENFloatVector expected;
-  };
-  const Case cases[] = {
-      {"Sort ascending", {3, -1, 2}, [](auto& e) { return e.Sort(); }, {-1, 2, 3}},
-      {"Sort descending", {3, -1, 2}, [](auto& e) { return e.Sort(false); }, {3, 2, -1}},
-      {"Reverse", {1, 2, 3}, [](auto& e) { return e.Reverse(); }, {3, 2, 1}},
-      {"Fill", {1, 2}, [](auto& e) { return e.Fill(7); }, {7, 7}},
-      {"Sqr", {-3, 0.5}, [](auto& e) { return e.Sqr(); }, {9, 0.25}},
-      {"Sqrt", {4, 0.25}, [](auto& e) { return e.Sqrt(); }, {2, 0.5}},
-      {"Invert", {2, -0.25}, [](auto& e) { return e.Invert(); }, {0.5, -4}},
-      {"Ln of 1", {1}, [](auto& e) { return e.Ln(); }, {0}},
-      {"LinearTransform", {1, -1.5}, [](auto& e) { return e.LinearTransform(2, 1); }, {3, -2}},
-      {"Append", {1}, [](auto& e) { return e.Append(5); }, {1, 5}},
-      {"Insert", {1, 2}, [](auto& e) { return e.Insert(1, 9); }, {1, 9, 2}},
-      {"Insert past the end appends", {1}, [](auto& e) { return e.Insert(8, 9); }, {1, 9}},
-      {"Delete", {1, 2, 3}, [](auto& e) { return e.Delete(0); }, {2, 3}},
-  };
-  for (const Case& c : cases) {
-    SCOPED_TRACE(c.name);
-    TQENVectorEdit edit;
-    edit.SetVector(c.start);
-    QSignalSpy changed(&edit, &TQENVectorEdit::Changed);
-    QSignalSpy errors(&edit, &TQENVectorEdit::MathErrorRaised);
-    EXPECT_TRUE(c.command(edit));
-    EXPECT_EQ(edit.Vector(), c.expected);
-    EXPECT_EQ(edit.model()->rowCount(), static_cast<int>(c.expected.size()));
-    EXPECT_FALSE(edit.HasNulls());
-    EXPECT_EQ(changed.count(), 1);
-    EXPECT_EQ(errors.count(), 0);
-  }
+  testing::RunCommands<TQENVectorEdit, TQENFloatVector, TQENFloatVector>(
+      {{"Sort ascending", {3, -1, 2}, [](auto& e) { return e.Sort(); }, {-1, 2, 3}},
+       {"Sort descending", {3, -1, 2}, [](auto& e) { return e.Sort(false); }, {3, 2, -1}},
+       {"Reverse", {1, 2, 3}, [](auto& e) { return e.Reverse(); }, {3, 2, 1}},
+       {"Fill", {1, 2}, [](auto& e) { return e.Fill(7); }, {7, 7}},
+       {"Sqr", {-3, 0.5}, [](auto& e) { return e.Sqr(); }, {9, 0.25}},
+       {"Sqrt", {4, 0.25}, [](auto& e) { return e.Sqrt(); }, {2, 0.5}},
+       {"Invert", {2, -0.25}, [](auto& e) { return e.Invert(); }, {0.5, -4}},
+       {"Ln of 1", {1}, [](auto& e) { return e.Ln(); }, {0}},
+       {"LinearTransform", {1, -1.5}, [](auto& e) { return e.LinearTransform(2, 1); }, {3, -2}},
+       {"Append", {1}, [](auto& e) { return e.Append(5); }, {1, 5}},
+       {"Insert", {1, 2}, [](auto& e) { return e.Insert(1, 9); }, {1, 9, 2}},
+       {"Insert past the end appends", {1}, [](auto& e) { return e.Insert(8, 9); }, {1, 9}},
+       {"Delete", {1, 2, 3}, [](auto& e) { return e.Delete(0); }, {2, 3}}},
+      [](TQENVectorEdit& e, const TQENFloatVector& v) { e.SetVector(v); }, &TQENVectorEdit::Vector);
 }
 
 TEST(VectorEditNulls, ReadAsZeroAndBecomeRealZerosUnderACommand) {
