@@ -28,8 +28,7 @@
 namespace tovrin {
 namespace {
 
-constexpr long double kNaN = std::numeric_limits<long double>::quiet_NaN();
-constexpr long double kInf = std::numeric_limits<long double>::infinity();
+using namespace testing;           // NOLINT: the shared checks and constants
 constexpr Extended kZ = 0.34312L;  // Leva's normal on the uniforms (0.5, 0.6)
 
 struct ContinuousReference {
@@ -45,8 +44,6 @@ struct DiscreteReference {
   long double critical;  // chi-square critical value at 1e-6 for these bins
 };
 #include "tovrin/random/TOVRINRandom_reference.inc"
-
-using testing::ExpectRaises;
 
 // A uniform source handing out a fixed list of values; running out fails the test.
 class ScriptedSource {
@@ -624,64 +621,48 @@ TEST(RandomExtremes, LargeArgumentsStayWithinRangeWithoutOverflow) {
   EXPECT_GE(Random_Neg_Binomial(1e6L, 0.9L, engine), 0);  // a million geometric draws
 }
 
-// Counts kReferenceDraws draws into bins (BinOf), then compares the counts with the bin
-// probabilities (chi-square below Critical) and the mean and variance with the reference's.
-template <typename Ref, typename Value>
-void CheckDraws(const Ref& ref, const std::function<Value()>& draw,
-                const std::function<std::size_t(Value)>& binOf,
-                const std::function<long double(std::size_t)>& probability, std::size_t bins,
-                long double critical) {
+// Counts kReferenceDraws draws into the bins of the named reference (continuous: between its
+// quantiles; discrete: up to its last values), then compares the counts with the bin
+// probabilities (chi-square below the critical value) and the mean and variance with the
+// reference's.
+void CheckDraws(const std::string& name, const std::function<long double()>& draw) {
+  const auto c = std::find_if(std::begin(kContinuous), std::end(kContinuous),
+                              [&](const auto& r) { return name == r.name; });
+  const auto d = std::find_if(std::begin(kDiscrete), std::end(kDiscrete),
+                              [&](const auto& r) { return name == r.name; });
+  const bool continuous = c != std::end(kContinuous);
+  ASSERT_TRUE(continuous || d != std::end(kDiscrete)) << name;
+  const std::size_t bins = continuous ? kReferenceBins : d->lastValues.size();
   std::vector<int> counts(bins);
   long double sum = 0, sumSq = 0;
   for (int i = 0; i < kReferenceDraws; ++i) {
-    const Value x = draw();
-    ASSERT_FALSE(std::isnan(static_cast<long double>(x))) << ref.name;
-    ++counts[std::min(binOf(x), bins - 1)];
+    const long double x = draw();
+    ASSERT_FALSE(std::isnan(x)) << name;
+    const auto bin =
+        continuous
+            ? std::upper_bound(c->edges.begin(), c->edges.end(), x) - c->edges.begin()
+            : std::lower_bound(d->lastValues.begin(), d->lastValues.end(), static_cast<Int64>(x)) -
+                  d->lastValues.begin();
+    ++counts[std::min(static_cast<std::size_t>(bin), bins - 1)];
     sum += x;
-    sumSq += static_cast<long double>(x) * x;
+    sumSq += x * x;
   }
   long double chi = 0;
   for (std::size_t i = 0; i < bins; ++i) {
-    const long double expected = kReferenceDraws * probability(i);
+    const long double expected =
+        kReferenceDraws * (continuous ? 1.0L / kReferenceBins : d->probabilities[i]);
     chi += (counts[i] - expected) * (counts[i] - expected) / expected;
   }
-  EXPECT_LT(chi, critical) << ref.name;
-  const int n = kReferenceDraws;
-  if (!std::isfinite(ref.variance)) return;
-  const long double mean = sum / n;
-  EXPECT_NEAR(mean, ref.mean, 6 * std::sqrt(ref.variance / n)) << ref.name;
-  if (!std::isfinite(ref.central4)) return;
-  EXPECT_NEAR((sumSq - n * mean * mean) / (n - 1), ref.variance,
-              6 * std::sqrt((ref.central4 - ref.variance * ref.variance) / n))
-      << ref.name;
-}
-
-template <typename Ref, std::size_t N>
-const Ref& Find(const Ref (&table)[N], const std::string& name) {
-  return *std::find_if(table, table + N, [&](const Ref& r) { return name == r.name; });
-}
-
-void CheckContinuous(const std::string& name, const std::function<Extended()>& draw) {
-  const auto& ref = Find(kContinuous, name);
-  CheckDraws<ContinuousReference, Extended>(
-      ref, draw,
-      [&](Extended x) {
-        return static_cast<std::size_t>(std::upper_bound(ref.edges.begin(), ref.edges.end(), x) -
-                                        ref.edges.begin());
-      },
-      [](std::size_t) { return 1.0L / kReferenceBins; }, kReferenceBins, kChiSquareCriticalBins);
-}
-
-void CheckDiscrete(const std::string& name, const std::function<Int64()>& draw) {
-  const auto& ref = Find(kDiscrete, name);
-  CheckDraws<DiscreteReference, Int64>(
-      ref, draw,
-      [&](Int64 x) {
-        return static_cast<std::size_t>(
-            std::lower_bound(ref.lastValues.begin(), ref.lastValues.end(), x) -
-            ref.lastValues.begin());
-      },
-      [&](std::size_t i) { return ref.probabilities[i]; }, ref.lastValues.size(), ref.critical);
+  EXPECT_LT(chi, continuous ? kChiSquareCriticalBins : d->critical) << name;
+  const long double n = kReferenceDraws, mean = continuous ? c->mean : d->mean,
+                    variance = continuous ? c->variance : d->variance,
+                    central4 = continuous ? c->central4 : d->central4;
+  if (!std::isfinite(variance)) return;
+  EXPECT_NEAR(sum / n, mean, 6 * std::sqrt(variance / n)) << name;
+  if (!std::isfinite(central4)) return;
+  EXPECT_NEAR((sumSq - sum * sum / n) / (n - 1), variance,
+              6 * std::sqrt((central4 - variance * variance) / n))
+      << name;
 }
 
 // Half of the cases draw from VerdanRandom (the overloads without a source), half from an
@@ -689,78 +670,77 @@ void CheckDiscrete(const std::string& name, const std::function<Int64()>& draw) 
 TEST(RandomDistribution, Continuous) {
   SetRandSeed(101);
   EngineSource e(102);
-  CheckContinuous("StandardNormal", [] { return Random_Normal(); });
-  CheckContinuous("StandardNormal", [&] { return (Random_Normal(3, 2, e) - 3) / 2; });
-  CheckContinuous("LogNormal_2_1_5", [] { return Random_LogNormal(2, 1.5L); });
-  CheckContinuous("Gamma_0_3", [] { return Random_Gamma(0.3L); });
-  CheckContinuous("Gamma_0_5", [&] { return Random_Gamma(0.5L, e); });
-  CheckContinuous("Gamma_1", [] { return Random_Gamma(1); });
-  CheckContinuous("Gamma_2_5", [&] { return Random_Gamma(2.5L, e); });
-  CheckContinuous("Gamma_5", [] { return Random_Gamma(5); });
-  CheckContinuous("Gamma_30", [&] { return Random_Gamma(30, e); });
-  CheckContinuous("ChiSq_3", [] { return Random_ChiSq(3); });
-  CheckContinuous("Gamma_1", [&] { return Random_Exponential(e); });
-  CheckContinuous("Weibull_2_5", [] { return Random_Weibull(2.5L); });
-  CheckContinuous("Weibull_neg2", [&] { return Random_Weibull(-2, e); });
-  CheckContinuous("Beta_2_3", [] { return Random_Beta(2, 3); });
-  CheckContinuous("Beta_0_5_0_7", [&] { return Random_Beta(0.5L, 0.7L, e); });
-  CheckContinuous("Beta_3_0_4", [] { return Random_Beta(3, 0.4L); });
-  CheckContinuous("Beta_0_2_5", [&] { return Random_Beta(0.2L, 5, e); });
+  CheckDraws("StandardNormal", [] { return Random_Normal(); });
+  CheckDraws("StandardNormal", [&] { return (Random_Normal(3, 2, e) - 3) / 2; });
+  CheckDraws("LogNormal_2_1_5", [] { return Random_LogNormal(2, 1.5L); });
+  CheckDraws("Gamma_0_3", [] { return Random_Gamma(0.3L); });
+  CheckDraws("Gamma_0_5", [&] { return Random_Gamma(0.5L, e); });
+  CheckDraws("Gamma_1", [] { return Random_Gamma(1); });
+  CheckDraws("Gamma_2_5", [&] { return Random_Gamma(2.5L, e); });
+  CheckDraws("Gamma_5", [] { return Random_Gamma(5); });
+  CheckDraws("Gamma_30", [&] { return Random_Gamma(30, e); });
+  CheckDraws("ChiSq_3", [] { return Random_ChiSq(3); });
+  CheckDraws("Gamma_1", [&] { return Random_Exponential(e); });
+  CheckDraws("Weibull_2_5", [] { return Random_Weibull(2.5L); });
+  CheckDraws("Weibull_neg2", [&] { return Random_Weibull(-2, e); });
+  CheckDraws("Beta_2_3", [] { return Random_Beta(2, 3); });
+  CheckDraws("Beta_0_5_0_7", [&] { return Random_Beta(0.5L, 0.7L, e); });
+  CheckDraws("Beta_3_0_4", [] { return Random_Beta(3, 0.4L); });
+  CheckDraws("Beta_0_2_5", [&] { return Random_Beta(0.2L, 5, e); });
   // DF 1 and 2 are decided by the exact test alone (the quick rejection would cut their tails):
   // DF = 1 is the standard Cauchy.
-  CheckContinuous("T_1", [] { return Random_T(1); });
-  CheckContinuous("Cauchy", [&] { return Random_T(1, e); });
-  CheckContinuous("T_2", [&] { return Random_T(2, e); });
-  CheckContinuous("T_3", [] { return Random_T(3); });
-  CheckContinuous("T_10", [&] { return Random_T(10, e); });
-  CheckContinuous("Cauchy", [] { return Random_Cauchy(); });
-  CheckContinuous("Cauchy", [&] { return Random_Cauchy(e); });
-  CheckContinuous("InvGauss_0_1", [] { return Random_Inv_Gauss(0, 1); });
-  CheckContinuous("InvGauss_0_5_1_5", [&] { return Random_Inv_Gauss(0.5L, 1.5L, e); });
-  CheckContinuous("InvGauss_2_0_5", [] { return Random_Inv_Gauss(2, 0.5L); });
-  CheckContinuous("InvGauss_6_20", [&] { return Random_Inv_Gauss(6, 20, e); });
-  CheckContinuous("VonMises_0", [] { return Random_von_Mises(0); });
-  CheckContinuous("VonMises_0_3", [&] { return Random_von_Mises(0.3L, e); });
-  CheckContinuous("VonMises_0_5", [] { return Random_von_Mises(0.5L); });
-  CheckContinuous("VonMises_2_7", [&] { return Random_von_Mises(2.7L, e); });
-  CheckContinuous("VonMises_9_99", [] { return Random_von_Mises(9.99L); });
+  CheckDraws("T_1", [] { return Random_T(1); });
+  CheckDraws("Cauchy", [&] { return Random_T(1, e); });
+  CheckDraws("T_2", [&] { return Random_T(2, e); });
+  CheckDraws("T_3", [] { return Random_T(3); });
+  CheckDraws("T_10", [&] { return Random_T(10, e); });
+  CheckDraws("Cauchy", [] { return Random_Cauchy(); });
+  CheckDraws("Cauchy", [&] { return Random_Cauchy(e); });
+  CheckDraws("InvGauss_0_1", [] { return Random_Inv_Gauss(0, 1); });
+  CheckDraws("InvGauss_0_5_1_5", [&] { return Random_Inv_Gauss(0.5L, 1.5L, e); });
+  CheckDraws("InvGauss_2_0_5", [] { return Random_Inv_Gauss(2, 0.5L); });
+  CheckDraws("InvGauss_6_20", [&] { return Random_Inv_Gauss(6, 20, e); });
+  CheckDraws("VonMises_0", [] { return Random_von_Mises(0); });
+  CheckDraws("VonMises_0_3", [&] { return Random_von_Mises(0.3L, e); });
+  CheckDraws("VonMises_0_5", [] { return Random_von_Mises(0.5L); });
+  CheckDraws("VonMises_2_7", [&] { return Random_von_Mises(2.7L, e); });
+  CheckDraws("VonMises_9_99", [] { return Random_von_Mises(9.99L); });
 }
 
 TEST(RandomDistribution, Discrete) {
   SetRandSeed(501);
   EngineSource e(502);
-  CheckDiscrete("Binomial1_20_0_3", [] { return Random_Binomial1(20, 0.3L); });
-  CheckDiscrete("Binomial1_10_0_5", [&] { return Random_Binomial1(10, 0.5L, e); });
-  CheckDiscrete("Binomial1_200_0_7", [] { return Random_Binomial1(200, 0.7L); });
-  CheckDiscrete("Binomial1_1000_0_05", [&] { return Random_Binomial1(1000, 0.05L, e); });
+  CheckDraws("Binomial1_20_0_3", [] { return Random_Binomial1(20, 0.3L); });
+  CheckDraws("Binomial1_10_0_5", [&] { return Random_Binomial1(10, 0.5L, e); });
+  CheckDraws("Binomial1_200_0_7", [] { return Random_Binomial1(200, 0.7L); });
+  CheckDraws("Binomial1_1000_0_05", [&] { return Random_Binomial1(1000, 0.05L, e); });
   // The inversion path (N min(P, 1 - P) <= 30) redraws 0: the reference is truncated there.
-  CheckDiscrete("Binomial2_20_0_3", [] { return Random_Binomial2(20, 0.3L); });
-  CheckDiscrete("Binomial2_20_0_8", [&] { return Random_Binomial2(20, 0.8L, e); });
-  CheckDiscrete("Binomial2_5_0_5", [] { return Random_Binomial2(5, 0.5L); });
-  CheckDiscrete("Binomial2_1000_0_3", [&] { return Random_Binomial2(1000, 0.3L, e); });
-  CheckDiscrete("Binomial2_200_0_6", [] { return Random_Binomial2(200, 0.6L); });
-  CheckDiscrete("Binomial2_100000_0_45", [&] { return Random_Binomial2(100000, 0.45L, e); });
-  CheckDiscrete("Binomial2_150_0_5", [] { return Random_Binomial2(150, 0.5L); });
+  CheckDraws("Binomial2_20_0_3", [] { return Random_Binomial2(20, 0.3L); });
+  CheckDraws("Binomial2_20_0_8", [&] { return Random_Binomial2(20, 0.8L, e); });
+  CheckDraws("Binomial2_5_0_5", [] { return Random_Binomial2(5, 0.5L); });
+  CheckDraws("Binomial2_1000_0_3", [&] { return Random_Binomial2(1000, 0.3L, e); });
+  CheckDraws("Binomial2_200_0_6", [] { return Random_Binomial2(200, 0.6L); });
+  CheckDraws("Binomial2_100000_0_45", [&] { return Random_Binomial2(100000, 0.45L, e); });
+  CheckDraws("Binomial2_150_0_5", [] { return Random_Binomial2(150, 0.5L); });
   const std::pair<const char*, Extended> poisson[] = {
       {"Poisson_0_5", 0.5L},         {"Poisson_4", 4},   {"Poisson_10", 10},
       {"Poisson_10_0001", 10.0001L}, {"Poisson_25", 25}, {"Poisson_100", 100},
       {"Poisson_1000", 1000}};
   for (std::size_t i = 0; i < std::size(poisson); ++i) {
     Extended mu = poisson[i].second;
-    CheckDiscrete(poisson[i].first,
-                  [&] { return i % 2 ? Random_Poisson(mu, e) : Random_Poisson(mu); });
+    CheckDraws(poisson[i].first,
+               [&] { return i % 2 ? Random_Poisson(mu, e) : Random_Poisson(mu); });
   }
-  CheckDiscrete("NegBinomial_2_5_0_4", [] { return Random_Neg_Binomial(2.5L, 0.4L); });
-  CheckDiscrete("NegBinomial_3_7_0_8", [&] { return Random_Neg_Binomial(3.7L, 0.8L, e); });
-  CheckDiscrete("NegBinomial_1_0_5", [] { return Random_Neg_Binomial(1, 0.5L); });
-  CheckDiscrete("NegBinomial_0_4_0_95", [&] { return Random_Neg_Binomial(0.4L, 0.95L, e); });
+  CheckDraws("NegBinomial_2_5_0_4", [] { return Random_Neg_Binomial(2.5L, 0.4L); });
+  CheckDraws("NegBinomial_3_7_0_8", [&] { return Random_Neg_Binomial(3.7L, 0.8L, e); });
+  CheckDraws("NegBinomial_1_0_5", [] { return Random_Neg_Binomial(1, 0.5L); });
+  CheckDraws("NegBinomial_0_4_0_95", [&] { return Random_Neg_Binomial(0.4L, 0.95L, e); });
 }
 
 TEST(RandomDistribution, MultivariateNormalMoments) {
   // Sample means and covariances within six standard errors (for normal data the covariance
   // (i, j) has variance (s_ii s_jj + s_ij^2) / n).
-  const Extended sigma[3][3] = {{4, 2, -2}, {2, 10, 5}, {-2, 5, 6}};
-  const TQENFloatVector means{1, -2, 3}, covariance{4, 2, 10, -2, 5, 6};
+  const Extended sigma[3][3] = {{4, 2, -2}, {2, 10, 5}, {-2, 5, 6}}, mu[3] = {1, -2, 3};
   constexpr int kDraws = 50000;
   std::array<long double, 3> sum{};
   std::array<std::array<long double, 3>, 3> cross{};
@@ -768,18 +748,16 @@ TEST(RandomDistribution, MultivariateNormalMoments) {
   TQENFloatVector factor, variate;
   LongInt error = 0;
   for (int n = 0; n < kDraws; ++n) {
-    Random_MVNorm(means, covariance, factor, variate, error);
+    Random_MVNorm({1, -2, 3}, {4, 2, 10, -2, 5, 6}, factor, variate, error);
     ASSERT_EQ(error, 0);
+    const std::vector<Extended> v = testing::Values(variate);
     for (int i = 0; i < 3; ++i) {
-      sum[i] += Extended(variate[i]);
-      for (int j = 0; j < 3; ++j) {
-        cross[i][j] += (Extended(variate[i]) - Extended(means[i])) *
-                       (Extended(variate[j]) - Extended(means[j]));
-      }
+      sum[i] += v[i];
+      for (int j = 0; j < 3; ++j) cross[i][j] += (v[i] - mu[i]) * (v[j] - mu[j]);
     }
   }
   for (int i = 0; i < 3; ++i) {
-    EXPECT_NEAR(sum[i] / kDraws, Extended(means[i]), 6 * std::sqrt(sigma[i][i] / kDraws));
+    EXPECT_NEAR(sum[i] / kDraws, mu[i], 6 * std::sqrt(sigma[i][i] / kDraws));
     for (int j = 0; j < 3; ++j) {
       EXPECT_NEAR(cross[i][j] / kDraws, sigma[i][j],
                   6 * std::sqrt((sigma[i][i] * sigma[j][j] + sigma[i][j] * sigma[i][j]) / kDraws));

@@ -14,13 +14,7 @@ namespace {
 
 #include "tovrin/statistics/TOVRINStatistics_Distributions_reference.inc"
 
-using testing::ExpectEachRaises;
-using testing::ExpectRaises;
-using testing::Near;
-using testing::RelNear;
-constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
-constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
-constexpr Extended kEps = std::numeric_limits<Extended>::epsilon();
+using namespace testing;  // NOLINT: the shared checks and constants
 LongWord U(Extended v) { return static_cast<LongWord>(v); }
 
 TEST(Combinatorics, AgainstExactValues) {
