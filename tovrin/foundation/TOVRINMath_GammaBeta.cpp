@@ -370,6 +370,12 @@ Extended PowerOfPair(Extended x_hi, Extended x_lo, Extended a, bool precise_powe
   return power * (1.0L + a * (x_lo / x_hi));
 }
 
+// Below this exponent E the precise family takes e^-E in one piece (an error of E times the
+// rounding of E); beyond the other, e^-E times any factor below sqrt(min(a, b)) is below the
+// smallest subnormal number.
+constexpr Extended kDirectExponent = 16.0L;
+constexpr Extended kBeyondRangeExponent = 11450.0L;
+
 // x^a y^b / B(a, b), the factor shared by the incomplete beta and its derivative (the density
 // is this divided by x y), for lambda = a y - b x. For large shapes it is written as
 //   (x c / a)^a (y c / b)^b sqrt(a b / (2 pi c)) exp(Delta(c) - Delta(a) - Delta(b)),  c = a + b.
@@ -385,6 +391,28 @@ Extended BetaPowerFactor(const BetaPoint& p, Extended a, Extended b, Extended la
   const Extended c = a + b;
   const Extended correction = StirlingRemainder(c) - StirlingRemainder(a) - StirlingRemainder(b);
   const Extended scale = std::sqrt(a) * std::sqrt(b / c) / kSqrt2Pi;
+  if (p.precise_powers) {
+    // The precise family forms the exponent E = a phi(ta) + b phi(tb) of the form below first:
+    // near the mean, where E is small, e^-E in one piece carries only E times the rounding of
+    // E, far inside the bound, at the cost of one exp instead of two powers; far beyond the
+    // range the result is 0. Where a t falls below -1/2 its term is a ln(x c / a) (or
+    // b ln(y c / b)), here only estimated.
+    const Extended ta = -lambda / a;
+    const Extended tb = lambda / b;
+    Extended exponent;
+    if (ta >= -0.5L && tb >= -0.5L) {
+      exponent = ShapeTimesPhi(a, ta, -lambda) + ShapeTimesPhi(b, tb, lambda);
+      if (exponent <= kDirectExponent) return scale * Exp80(correction - exponent);
+    } else if (ta < -0.5L) {
+      exponent = ShapeTimesPhi(b, tb, lambda) - lambda - a * (std::log(p.x) + std::log1p(b / a));
+    } else {
+      exponent = ShapeTimesPhi(a, ta, -lambda) + lambda - b * (std::log(p.y) + std::log1p(a / b));
+    }
+    if (exponent > kBeyondRangeExponent &&
+        exponent > kBeyondRangeExponent + 0.5L * std::log(std::fmin(a, b))) {
+      return 0.0L;
+    }
+  }
   {
     // Both powers from exact bases: near the mean and far from it alike, the result carries
     // only pow's rounding of each.
@@ -629,10 +657,10 @@ BetaValues HugeShapeBeta(const BetaPoint& p, Extended a, Extended b, Extended la
   return {tail, 1.0L - tail, factor};
 }
 
-BetaValues IncompleteBetaBoth(const BetaPoint& p, Extended a, Extended b) {
+// lambda = BetaLambda(p, a, b), as the caller has it.
+BetaValues IncompleteBetaBoth(const BetaPoint& p, Extended a, Extended b, Extended lambda) {
   // Below the mean (lambda >= 0) I_x is the smaller tail and is computed directly; above it
   // the complement I_y(b, a) is.
-  const Extended lambda = BetaLambda(p, a, b);
   const bool swap = lambda < 0.0L;
   const BetaPoint q = swap ? Swapped(p) : p;
   const Extended sa = swap ? b : a;
@@ -641,12 +669,18 @@ BetaValues IncompleteBetaBoth(const BetaPoint& p, Extended a, Extended b) {
   const Extended factor = BetaPowerFactor(q, sa, sb, swap ? -lambda : lambda);
   Extended tail;
   Extended other;
-  if (!LowerTailSmallB(q, sa, sb, factor, tail)) {
+  if (p.precise_powers && factor == 0.0L) {
+    tail = 0.0L;
+  } else if (!LowerTailSmallB(q, sa, sb, factor, tail)) {
     tail = factor * BetaContinuedFraction(q, sa, sb, std::fabs(lambda));
   }
   other = 1.0L - tail;
   if (swap) return {other, tail, factor};
   return {tail, other, factor};
+}
+
+BetaValues IncompleteBetaBoth(const BetaPoint& p, Extended a, Extended b) {
+  return IncompleteBetaBoth(p, a, b, BetaLambda(p, a, b));
 }
 
 bool AnyNaN(Extended a, Extended b, Extended c) {
@@ -723,6 +757,10 @@ Extended InverseBetaLowerHalf(Extended p, Extended q, Extended a, Extended b, Be
     }
     const Extended density = v.factor / (pt.x * pt.y);
     Extended next = kNaN;
+    // Converged once the step falls below the rounding of x. The precise family stops a step
+    // earlier: Newton doubles and Halley triples the correct digits, so after a Newton step
+    // below 1e-10 of x, or a Halley step below 1e-7, the next iterate is exact.
+    Extended last_step = start.precise_powers ? 1e-10L : 4.0L * kEpsilon;
     if (density > 0.0L && std::isfinite(density)) {
       const Extended tail = use_lower ? v.lower : v.upper;
       if (target < 0.01L && tail > 0.0L) {
@@ -737,12 +775,15 @@ Extended InverseBetaLowerHalf(Extended p, Extended q, Extended a, Extended b, Be
         // Halley's correction with f'' / f' = (a - 1)/x - (b - 1)/y.
         const Extended curvature = (a - 1.0L) / pt.x - (b - 1.0L) / pt.y;
         Extended denom = 1.0L - 0.5L * step * curvature;
-        if (!(denom > 0.5L && denom < 2.0L)) denom = 1.0L;
+        if (!(denom > 0.5L && denom < 2.0L)) {
+          denom = 1.0L;
+        } else if (start.precise_powers) {
+          last_step = 1e-7L;
+        }
         next = x - step / denom;
       }
     }
-    // Converged once the step falls below the rounding of x.
-    if (std::fabs(next - x) <= 4.0L * kEpsilon * x) return std::fmin(std::fmax(next, lo), hi);
+    if (std::fabs(next - x) <= last_step * x) return std::fmin(std::fmax(next, lo), hi);
     if (next > hi && !hi_evaluated) {
       // The root may sit on the end of the half (I_{1/2} = p exactly): try the end itself.
       next = hi;
@@ -997,8 +1038,7 @@ Extended BetaLargeShapes(Extended a, Extended b, Extended lambda) {
 // IncompleteBetaBoth with the expansion above for two shapes beyond kLargeShapes near the mean.
 constexpr Extended kLargeShapes = 1000.0L;
 
-BetaValues IncompleteBetaBothLarge(const BetaPoint& p, Extended a, Extended b) {
-  const Extended lambda = BetaLambda(p, a, b);
+BetaValues IncompleteBetaBothLarge(const BetaPoint& p, Extended a, Extended b, Extended lambda) {
   const Extended smaller = std::fmin(a, b);
   if (smaller >= kLargeShapes && smaller <= kHugeShape && std::fabs(lambda) <= 0.03L * smaller) {
     const bool swap = lambda < 0.0L;
@@ -1008,7 +1048,7 @@ BetaValues IncompleteBetaBothLarge(const BetaPoint& p, Extended a, Extended b) {
     if (swap) return {1.0L - tail, tail, factor};
     return {tail, 1.0L - tail, factor};
   }
-  return IncompleteBetaBoth(p, a, b);
+  return IncompleteBetaBoth(p, a, b, lambda);
 }
 
 // Temme's expansion, Q = erfc(s) / 2 + e^-E / sqrt(2 pi a) sum_k C_k(eta) a^-k with
@@ -1102,12 +1142,13 @@ Tails IncompleteBetaTails(Extended X, Extended XLo, Extended Y, Extended YLo, Ex
     return A < kTinyShape ? Tails{1.0L, 0.0L} : Tails{0.0L, 1.0L};
   }
   const BetaPoint p{X, Y, XLo, YLo, true};
-  BetaValues v = IncompleteBetaBothLarge(p, A, B);
+  const Extended lambda = BetaLambda(p, A, B);
+  BetaValues v = IncompleteBetaBothLarge(p, A, B, lambda);
   // The side is chosen by the mean; for a very skewed shape the complement can still be small,
   // and then it is computed directly where the expansion for a small second shape applies.
   constexpr Extended kDirectBelow = 0.25L;
   if (std::fmin(A, B) <= kHugeShape) {
-    const bool lower_derived = BetaLambda(p, A, B) < 0.0L;
+    const bool lower_derived = lambda < 0.0L;
     Extended direct;
     if (lower_derived && v.lower < kDirectBelow && LowerTailSmallB(p, A, B, v.factor, direct)) {
       v.lower = direct;
@@ -1125,7 +1166,8 @@ Extended BetaPowerFactor(Extended X, Extended XLo, Extended Y, Extended YLo, Ext
   return tovrin::BetaPowerFactor(p, A, B, BetaLambda(p, A, B));
 }
 
-BetaRoot InverseIncompleteBetaTails(Extended P, Extended Q, Extended A, Extended B) {
+BetaRoot InverseIncompleteBetaTails(Extended P, Extended Q, Extended A, Extended B,
+                                    const BetaRoot* Start) {
   if (AnyNaN(P, A, B) || std::isnan(Q)) return {kNaN, kNaN};
   if (P <= 0.0L) return {0.0L, 1.0L};
   if (Q <= 0.0L) return {1.0L, 0.0L};
@@ -1137,7 +1179,9 @@ BetaRoot InverseIncompleteBetaTails(Extended P, Extended Q, Extended A, Extended
     const Extended level = A < kTinyShape ? (B < kTinyShape ? B / (A + B) : 1.0L) : 0.0L;
     return P <= level ? BetaRoot{0.0L, 1.0L} : BetaRoot{1.0L, 0.0L};
   }
-  BetaPoint start = InverseBetaEstimate(P, Q, A, B);
+  BetaPoint start = Start != nullptr && Start->x > 0.0L && Start->y > 0.0L
+                        ? BetaPoint{Start->x, Start->y}
+                        : InverseBetaEstimate(P, Q, A, B);
   start.precise_powers = true;
   bool beyond_half = false;
   if (start.x <= 0.5L) {

@@ -494,10 +494,52 @@ Extended StudentTGreater(Extended T, Extended DF) {
 }
 
 namespace {
-// The t >= 0 with P(T > t) = p for 0 < p <= 1/2: x / y = t^2 / DF from the beta root.
+// t^2 / DF for the t with P(T > t) = p (0 < p <= 1/2), as a first estimate: exact for DF = 1
+// and 2, Hill's approximation (CACM Algorithm 396) from DF = 3 on, NaN below that or where the
+// approximation leaves the range.
+Extended StudentRatioEstimate(Extended p, Extended DF) {
+  constexpr Extended kHalfPi = 1.57079632679489661923132169163975144L;
+  const Extended two_sided = 2.0L * p;
+  if (DF == 1.0L) {
+    const Extended cot = 1.0L / std::tan(kHalfPi * two_sided);
+    return cot * cot;
+  }
+  if (DF == 2.0L) return (1.0L - two_sided) * (1.0L - two_sided) / (two_sided * (2.0L - two_sided));
+  if (!(DF >= 3.0L) || !(0.5L * two_sided > 0.0L)) return kNaN;
+  const Extended n = DF;
+  const Extended a = 1.0L / (n - 0.5L);
+  const Extended b = 48.0L / (a * a);
+  Extended c = ((20700.0L * a / b - 98.0L) * a - 16.0L) * a + 96.36L;
+  const Extended d = ((94.5L / (b + c) - 3.0L) / b + 1.0L) * std::sqrt(a * kHalfPi) * n;
+  Extended y = std::pow(d * two_sided, 2.0L / n);
+  if (y > 0.05L + a) {
+    // The expansion about the normal quantile.
+    const Extended x = tovrin::InvNormalLess(0.5L * two_sided);
+    y = x * x;
+    if (n < 5.0L) c += 0.3L * (n - 4.5L) * (x + 0.6L);
+    c = (((0.05L * d * x - 5.0L) * x - 7.0L) * x - 2.0L) * x + b + c;
+    y = (((((0.4L * y + 6.3L) * y + 36.0L) * y + 94.5L) / c - y - 3.0L) / b + 1.0L) * x;
+    return std::expm1(a * y * y);
+  }
+  if (!(y > 0.0L)) return kNaN;
+  return ((1.0L / (((n + 6.0L) / (n * y) - 0.089L * d - 0.822L) * (n + 2.0L) * 3.0L) +
+           0.5L / (n + 4.0L)) *
+              y -
+          1.0L) *
+             (n + 1.0L) / (n + 2.0L) +
+         1.0L / y;
+}
+
+// The t >= 0 with P(T > t) = p for 0 < p <= 1/2: x / y = t^2 / DF from the beta root, started
+// from the estimate above.
 Extended InverseStudentUpper(Extended p, Extended DF) {
   if (p == 0.5L) return 0.0L;
-  return std::sqrt(DF) * std::sqrt(BetaRootRatio(1.0L - 2.0L * p, 2.0L * p, 0.5L, 0.5L * DF));
+  const Extended ratio = StudentRatioEstimate(p, DF);
+  detail::BetaRoot start{kNaN, kNaN};
+  if (ratio > 0.0L && std::isfinite(ratio)) start = {ratio / (1.0L + ratio), 1.0L / (1.0L + ratio)};
+  const detail::BetaRoot r =
+      detail::InverseIncompleteBetaTails(1.0L - 2.0L * p, 2.0L * p, 0.5L, 0.5L * DF, &start);
+  return std::sqrt(DF) * std::sqrt(r.x / r.y);
 }
 }  // namespace
 

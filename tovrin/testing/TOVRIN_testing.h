@@ -3,6 +3,7 @@
 // tovrin_testing carries it, with GoogleTest, into each test program.
 #pragma once
 
+#include <atomic>
 #include <cmath>
 #include <cstdint>
 #include <cstring>
@@ -14,6 +15,7 @@
 
 #include <gtest/gtest.h>
 
+#include "tovrin/foundation/TOVRINElementTypes.h"
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINGlobals.h"
 
@@ -105,8 +107,11 @@ inline ::testing::AssertionResult ScaledNear(Extended actual, Extended expected,
 }
 
 // The stored element type as arithmetic sees it: PackedExtended reads as Extended.
+using ::tovrin::detail::ValueOf;
 template <typename T>
-using ValueOf = std::conditional_t<std::is_same_v<T, PackedExtended>, Extended, T>;
+using Matrix = std::vector<std::vector<T>>;
+// Sets QENMatrixRectangularCheck for a scope.
+using MatrixSwitch = SwitchGuard<std::atomic<bool>, bool>;
 
 // A vector of element type T from plain numbers.
 template <typename T>

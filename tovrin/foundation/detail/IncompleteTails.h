@@ -41,12 +41,14 @@ Extended BetaPowerFactor(Extended X, Extended XLo, Extended Y, Extended YLo, Ext
                          Extended B);
 
 // The root x of I_x(A, B) = P, given P and Q = 1 - P (each exact where it is the smaller), as
-// the pair (x, 1 - x) whose smaller member is computed directly.
+// the pair (x, 1 - x) whose smaller member is computed directly. Start, when given, is a first
+// estimate of the root that the caller knows better than the general one.
 struct BetaRoot {
   Extended x;
   Extended y;
 };
-BetaRoot InverseIncompleteBetaTails(Extended P, Extended Q, Extended A, Extended B);
+BetaRoot InverseIncompleteBetaTails(Extended P, Extended Q, Extended A, Extended B,
+                                    const BetaRoot* Start = nullptr);
 
 // X^A for X > 0, faster than pow and still well inside the precise family's bound: sqrt for
 // A = 1/2, exp(A ln X) while |A ln X| <= 8 (an error of about that many units in the last
