@@ -4,11 +4,8 @@
 // inverses at their stopping rule divided by the density, plus a few roundings.
 #include <array>
 #include <cmath>
-#include <cstdint>
-#include <cstring>
 #include <functional>
 #include <limits>
-#include <string>
 #include <vector>
 
 #include "tovrin/statistics/TOVRINStatistics.h"
@@ -275,7 +272,7 @@ TEST(StudentT, InverseGivesTheRecordedResultsOverAGrid) {
   // Most halvings of the bisection are settled by bounds on the distribution function instead
   // of evaluating it; the results must be those of the plain bisection to the bit. The hash
   // (FNV-1a over the 10 value bytes of each result) was recorded from the plain bisection.
-  testing::ValueHash hash;
+  ValueHash hash;
   for (LongWord df : {1U, 2U, 3U, 4U, 5U, 7U, 9U, 15U, 40U, 300U, 5000U, 1000000U, 4000000000U}) {
     for (Extended p : {1e-300L, 1e-30L, 1e-12L, 1e-5L, 0.01L, 0.1L, 0.3L, 0.49L, 0.500000001L,
                        0.51L, 0.8L, 0.975L, 0.9999L, 1 - 1e-15L}) {
@@ -399,8 +396,8 @@ TEST(PDFValues, PointsDensitiesAndChecks) {
   }
   V xs, ys;
   ChiSquarePDFValues(2, 2, -2, 2, xs, ys);  // a descending range
-  EXPECT_EQ(testing::Values(xs), (std::vector<Extended>{2, 0, -2}));
-  EXPECT_EQ(testing::Values(ys), (std::vector<Extended>{ChiSquarePDF(2, 2), 0.5L, 0}));
+  EXPECT_EQ(Values(xs), (std::vector<Extended>{2, 0, -2}));
+  EXPECT_EQ(Values(ys), (std::vector<Extended>{ChiSquarePDF(2, 2), 0.5L, 0}));
 }
 
 }  // namespace

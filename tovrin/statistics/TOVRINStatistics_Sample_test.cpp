@@ -27,7 +27,7 @@ TQENFloatVector Floats(std::initializer_list<long double> values) {
 
 template <typename T>
 class SampleFamilies : public ::testing::Test {};
-TYPED_TEST_SUITE(SampleFamilies, testing::BuildableElements);
+TYPED_TEST_SUITE(SampleFamilies, BuildableElements);
 
 // The two-pass variances hand SumSqDiffVector a centre rounded to Double and Single for those
 // element types, which the reference reproduces; the one-pass forms match the emulated
@@ -302,13 +302,13 @@ TEST(SampleStandardise, BothFormsAndTheirErrors) {
   EXPECT_EQ(Extended(y[0]), 0);
   auto z = From<PackedExtended>(kCentred);
   Standardise(z, 0, 1, false);
-  EXPECT_TRUE(testing::Near(QENMean(z), 0, 1e-17L));
+  EXPECT_TRUE(Near(QENMean(z), 0, 1e-17L));
   EXPECT_TRUE(RelNear(SampleVariance(z), 1, 1e-17L));
   z = From<PackedExtended>(kCentred);
   Standardise(z, 5, 3, true);
   EXPECT_TRUE(RelNear(QENMean(z), 5, 1e-17L));
   EXPECT_TRUE(RelNear(PopulationVariance(z), 9, 1e-17L));
-  using testing::ExpectRaisesUntouched;
+  using ExpectRaisesUntouched;
   ExpectRaisesUntouched(rsVectorIsEmpty, TQENFloatVector{},
                         [](auto& v) { Standardise(v, 0, 0, 0, 1); });
   ExpectRaisesUntouched(rsVectorIsEmpty, TQENFloatVector{},
