@@ -46,8 +46,8 @@ struct DiscreteReference {
 
 // A uniform source handing out a fixed list of values and counting them; running out fails
 // the test.
-struct ScriptedSource {
-  ScriptedSource(std::initializer_list<Extended> list) : values(list) {}
+struct Uniforms {
+  Uniforms(std::initializer_list<Extended> list) : values(list) {}
   Extended operator()() {
     if (next >= values.size()) throw std::out_of_range("scripted source ran out");
     return values[next++];
@@ -75,7 +75,7 @@ using Draw = std::function<Extended(TRandomGenFunction*)>;
 // Raises Ident through a scripted source without drawing, and through the overload without a
 // source without moving the thread's stream.
 void ExpectRaisesBeforeDraw(TResStringId Ident, const Draw& draw) {
-  ScriptedSource script{0.5L, 0.5L, 0.5L, 0.5L};
+  Uniforms script{0.5L, 0.5L, 0.5L, 0.5L};
   TRandomGenFunction source(script);
   ExpectRaises(Ident, [&] { draw(&source); });
   EXPECT_EQ(script.Draws(), 0u) << ResStringName(Ident);
@@ -226,19 +226,17 @@ TEST(VerdanRandom, OverloadsWithoutSourceDrawAsVerdanRandomDoes) {
 }
 
 TEST(RandomNormal, LevaDrawOrderRoundingAndRedraws) {
-  ScriptedSource script{0.5L, 0.6L};
+  Uniforms script{0.5L, 0.6L};
   // u = 0.5, v = (0.6 - 0.5) 1.7156 = 0.17156: accepted at once, v / u = 0.34312.
   EXPECT_TRUE(Near(Random_Normal(script), kZ, 1e-15L));
   EXPECT_EQ(script.Draws(), 2u);
-  ScriptedSource swapped{0.6L, 0.5L};  // v = 0 exactly
-  EXPECT_EQ(Random_Normal(swapped), 0.0L);
-  for (const auto& [v, expected] : kNormalRounding) {  // v rounded once to double
-    ScriptedSource a{0.5L, v}, b{0.5L, v};
-    EXPECT_EQ(Random_Normal(a), expected) << static_cast<double>(v);
-    EXPECT_EQ(Random_Normal(1, 1, b), 1 + expected) << static_cast<double>(v);
+  EXPECT_EQ(Random_Normal(Uniforms{0.6L, 0.5L}), 0.0L);  // v = 0 exactly
+  for (const auto& [v, expected] : kNormalRounding) {    // v rounded once to double
+    EXPECT_EQ(Random_Normal(Uniforms{0.5L, v}), expected) << static_cast<double>(v);
+    EXPECT_EQ(Random_Normal(1, 1, Uniforms{0.5L, v}), 1 + expected) << static_cast<double>(v);
   }
   for (const auto& [v, accepted, expected] : kNormalAtBounds) {  // q within 1e-15 of a bound
-    ScriptedSource s{0.5L, v, 0.5L, 0.6L};
+    Uniforms s{0.5L, v, 0.5L, 0.6L};
     if (accepted != 0) {
       EXPECT_EQ(Random_Normal(s), expected);
     } else {
@@ -247,18 +245,17 @@ TEST(RandomNormal, LevaDrawOrderRoundingAndRedraws) {
     }
   }
   // (0.01, 0.99): q past the outer bound; (0, 0.5): u = 0 makes the log test NaN.
-  ScriptedSource redrawn{0.01L, 0.99L, 0.0L, 0.5L, 0.5L, 0.6L};
+  Uniforms redrawn{0.01L, 0.99L, 0.0L, 0.5L, 0.5L, 0.6L};
   EXPECT_TRUE(Near(Random_Normal(redrawn), kZ, 1e-15L));
   EXPECT_EQ(redrawn.Draws(), 6u);
   // The smallest double: v = 0 passes the log test, then u < 5.0E-324 refuses the division.
-  ScriptedSource tiny{static_cast<Extended>(std::numeric_limits<double>::denorm_min()), 0.5L};
-  ExpectRaises(rsDivideByZero, [&] { Random_Normal(tiny); });
-  ScriptedSource scaled{0.5L, 0.6L}, zero{0.5L, 0.6L};
-  EXPECT_TRUE(Near(Random_Normal(10, -2, scaled), 10 - 2 * kZ, 1e-14L));  // StdDev < 0 used
-  EXPECT_EQ(Random_Normal(10, 0, zero), 10.0L);
+  ExpectRaises(rsDivideByZero, [] {
+    Random_Normal(Uniforms{static_cast<Extended>(std::numeric_limits<double>::denorm_min()), 0.5L});
+  });
+  EXPECT_TRUE(Near(Random_Normal(10, -2, Uniforms{0.5L, 0.6L}), 10 - 2 * kZ, 1e-14L));  // SD < 0
+  EXPECT_EQ(Random_Normal(10, 0, Uniforms{0.5L, 0.6L}), 10.0L);
   // The log-normal's logarithm is normal with matching moments: mean 1, StdDev 1.
-  ScriptedSource logNormal{0.5L, 0.6L};
-  EXPECT_TRUE(Near(std::log(Random_LogNormal(1, 1, logNormal)),
+  EXPECT_TRUE(Near(std::log(Random_LogNormal(1, 1, Uniforms{0.5L, 0.6L})),
                    -0.5L * std::log(2.0L) + std::sqrt(std::log(2.0L)) * kZ, 1e-15L));
   const auto logNormalDraw = [](Pair p) { return EITHER(Random_LogNormal, p[0], p[1]); };
   ExpectEachRaisesBeforeDraw<Pair>(rsInvalidMean, {{0, 1}, {-1, -1}}, logNormalDraw);
@@ -268,26 +265,24 @@ TEST(RandomNormal, LevaDrawOrderRoundingAndRedraws) {
 TEST(RandomGamma, ExponentialShapesAndDrawOrder) {
   // 0, 4E-324 and exactly 5.0E-324 are refused (u must exceed 5.0E-324); shape 1 is the
   // exponential draw for draw.
-  ScriptedSource script{0.0L, 4e-324L, 5.0E-324L, 0.25L}, a{0.0L, 4e-324L, 5.0E-324L, 0.25L};
+  Uniforms script{0.0L, 4e-324L, 5.0E-324L, 0.25L}, a{0.0L, 4e-324L, 5.0E-324L, 0.25L};
   EXPECT_EQ(Random_Exponential(script), std::log(4.0L));
   EXPECT_EQ(Random_Gamma(1, a), std::log(4.0L));
   EXPECT_EQ(a.Draws(), 4u);
-  ScriptedSource justAbove{5.0000001E-324L};
-  EXPECT_NEAR(Random_Exponential(justAbove), 744.0L, 1.0L);
+  EXPECT_NEAR(Random_Exponential(Uniforms{5.0000001E-324L}), 744.0L, 1.0L);
   EngineSource left(11), right(11);
   for (int i = 0; i < 1000; ++i) ASSERT_EQ(Random_Gamma(1, left), Random_Exponential(right));
   // Shape 0.5: t = 0.5, p = 1 / (1 + e^-0.5). u = 1 is redrawn; u = 1E-300 lies under the
   // floor p (Tiny / t)^0.5 and gives 0 at once, without a second uniform.
-  ScriptedSource floor{1.0L, 1e-300L};
+  Uniforms floor{1.0L, 1e-300L};
   EXPECT_EQ(Random_Gamma(0.5L, floor), 0.0L);
   EXPECT_EQ(floor.Draws(), 2u);
-  ScriptedSource body{0.3L, 0.5L};  // u <= p: x = t (u / p)^2; u2 = 0.5 accepts
-  EXPECT_NEAR(Random_Gamma(0.5L, body), 0.1161423342268519125961405L, 1e-15L);
-  ScriptedSource tail{0.9L, 0.1L};  // u > p: x = t - ln((1 - u) / (1 - p))
-  EXPECT_NEAR(Random_Gamma(0.5L, tail), 0.5L - std::log(0.1L / (1 - 1 / (1 + std::exp(-0.5L)))),
-              1e-15L);
+  // u <= p: x = t (u / p)^2, u2 = 0.5 accepts; u > p: x = t - ln((1 - u) / (1 - p)).
+  EXPECT_NEAR(Random_Gamma(0.5L, Uniforms{0.3L, 0.5L}), 0.1161423342268519125961405L, 1e-15L);
+  EXPECT_NEAR(Random_Gamma(0.5L, Uniforms{0.9L, 0.1L}),
+              0.5L - std::log(0.1L / (1 - 1 / (1 + std::exp(-0.5L)))), 1e-15L);
   // Shape 2: a normal, then one uniform; d = 5/3, c = 1/sqrt(15): d (1 + c z)^3 = 2.150035...
-  ScriptedSource large{0.5L, 0.6L, 0.5L}, chi{0.5L, 0.6L, 0.5L};
+  Uniforms large{0.5L, 0.6L, 0.5L}, chi{0.5L, 0.6L, 0.5L};
   const Extended x = Random_Gamma(2, large);
   EXPECT_NEAR(x, 2.150035L, 1e-6L);
   EXPECT_EQ(large.Draws(), 3u);
@@ -297,14 +292,13 @@ TEST(RandomGamma, ExponentialShapesAndDrawOrder) {
   ExpectEachRaisesBeforeDraw(rsInvalidShape, {0, -3},
                              [](int df) { return EITHER(Random_ChiSq, df); });
   ExpectEachRaisesBeforeDraw(rsShapeTooSmall, {1e-4000L, 4.9E-324L}, gamma);
-  ScriptedSource atTiny{0.5L, 0.5L};
-  EXPECT_GE(Random_Gamma(5.0E-324L, atTiny), 0.0L);  // Tiny itself is allowed
+  EXPECT_GE(Random_Gamma(5.0E-324L, Uniforms{0.5L, 0.5L}), 0.0L);  // Tiny itself is allowed
 }
 
 TEST(RandomWeibullBetaAndT, DrawsAndChecks) {
-  ScriptedSource negative{0.25L}, positive{0.25L};  // E = ln 4; a negative shape is accepted
-  EXPECT_NEAR(Random_Weibull(-2, negative), 0.849321800288019042721502834103L, 1e-18L);
-  EXPECT_NEAR(Random_Weibull(2, positive), 1.17741002251547469101156932646L, 1e-18L);
+  // E = ln 4; a negative shape is accepted.
+  EXPECT_NEAR(Random_Weibull(-2, Uniforms{0.25L}), 0.849321800288019042721502834103L, 1e-18L);
+  EXPECT_NEAR(Random_Weibull(2, Uniforms{0.25L}), 1.17741002251547469101156932646L, 1e-18L);
   ExpectEachRaisesBeforeDraw(rsInvalidValue, {0.0L, 5.0E-324L, -5.0E-324L, 1e-4000L, kNaN},
                              [](Extended shape) { return EITHER(Random_Weibull, shape); });
   // Swapped beta parameters reflect on the same uniforms: the smaller first parameter gives
@@ -331,10 +325,10 @@ TEST(RandomWeibullBetaAndT, DrawsAndChecks) {
   EXPECT_EQ(Random_Beta(2, 3, source), expected);
   // T: u = 0 is redrawn; u = 0.5, v = 0.75 gives x = (2 v - 1) m / u = m: 1 for DF = 1,
   // sqrt(4) 3^-0.75 for DF = 2.
-  ScriptedSource t1{0.0L, 0.5L, 0.75L}, t2{0.5L, 0.75L};
+  Uniforms t1{0.0L, 0.5L, 0.75L};
   EXPECT_EQ(Random_T(1, t1), 1.0L);
   EXPECT_EQ(t1.Draws(), 3u);
-  EXPECT_NEAR(Random_T(2, t2), 2 * std::pow(3.0L, -0.75L), 1e-18L);
+  EXPECT_NEAR(Random_T(2, Uniforms{0.5L, 0.75L}), 2 * std::pow(3.0L, -0.75L), 1e-18L);
   ExpectEachRaisesBeforeDraw(rsInvalidValue, {0, -100},
                              [](int df) { return EITHER(Random_T, df); });
 }
@@ -362,7 +356,7 @@ TEST(RandomMVNorm, PacksTheUpperFactorByRows) {
   const TQENFloatVector means{1, 2, 3};
   TQENFloatVector factor{7, 7, 7, 7, 7, 7, 7, 7}, variate;
   LongInt error = -1;
-  ScriptedSource script{0.5L, 0.6L, 0.5L, 0.6L, 0.5L, 0.6L};
+  Uniforms script{0.5L, 0.6L, 0.5L, 0.6L, 0.5L, 0.6L};
   Random_MVNorm(means, TQENFloatVector{4, 2, 10, -2, 5, 6, 123}, factor, variate, error, script);
   EXPECT_EQ(error, 0);
   EXPECT_EQ(Values(factor), (std::vector<Extended>{2, 1, -1, 3, 2, 1}));
@@ -373,18 +367,16 @@ TEST(RandomMVNorm, PacksTheUpperFactorByRows) {
   }
   // One dimension: the square root.
   TQENFloatVector one;
-  ScriptedSource two{0.5L, 0.6L};
-  Random_MVNorm(TQENFloatVector{5}, TQENFloatVector{4}, factor, one, error, two);
+  Random_MVNorm({5}, {4}, factor, one, error, Uniforms{0.5L, 0.6L});
   EXPECT_EQ(Extended(factor[0]), 2.0L);
   EXPECT_TRUE(Near(Extended(one[0]), 5 + 2 * kZ, 1e-14L));
   // The outputs may be the inputs: Factor is the Covariance; Factor and Variate are one
   // vector (the variate wins).
   TQENFloatVector v{4, 2, 10, -2, 5, 6}, same;
-  ScriptedSource again{0.5L, 0.6L, 0.5L, 0.6L, 0.5L, 0.6L},
-      third{0.5L, 0.6L, 0.5L, 0.6L, 0.5L, 0.6L};
-  Random_MVNorm(means, v, v, variate, error, again);
+  Random_MVNorm(means, v, v, variate, error, Uniforms{0.5L, 0.6L, 0.5L, 0.6L, 0.5L, 0.6L});
   EXPECT_EQ(Values(v), (std::vector<Extended>{2, 1, -1, 3, 2, 1}));
-  Random_MVNorm(means, TQENFloatVector{4, 2, 10, -2, 5, 6}, same, same, error, third);
+  Random_MVNorm(means, {4, 2, 10, -2, 5, 6}, same, same, error,
+                Uniforms{0.5L, 0.6L, 0.5L, 0.6L, 0.5L, 0.6L});
   ASSERT_EQ(same.size(), 3u);
   EXPECT_TRUE(Near(Extended(same[2]), 3 + 2 * kZ, 1e-14L));
 }
@@ -392,7 +384,7 @@ TEST(RandomMVNorm, PacksTheUpperFactorByRows) {
 TEST(RandomMVNorm, ErrorsAndChecks) {
   TQENFloatVector factor{1, 2}, variate{8, 9};
   LongInt error = 0;
-  ScriptedSource script{0.5L, 0.6L};
+  Uniforms script{0.5L, 0.6L};
   Random_MVNorm(TQENFloatVector{5}, TQENFloatVector{0}, factor, variate, error, script);
   EXPECT_EQ(error, 1);  // not positive definite: the variate is left, the factor sized
   EXPECT_EQ(Values(variate), (std::vector<Extended>{8, 9}));
@@ -430,10 +422,10 @@ TEST(RandomBinomial, ModeShortcutOutwardWalkAndInversion) {
   // Mode Trunc(11 x 0.35) = 3 with probability 0.2522: a first uniform below it returns 3;
   // for (10, 0.39) the mode is Trunc(4.29) = 4, not Trunc(10 x 0.39) = 3.
   for (Extended u : {0.0L, 0.25L}) {
-    ScriptedSource script{u}, other{u};
+    Uniforms script{u};
     EXPECT_EQ(Random_Binomial1(10, 0.35L, script), 3);
     EXPECT_EQ(script.Draws(), 1u);
-    EXPECT_EQ(Random_Binomial1(10, 0.39L, other), 4);
+    EXPECT_EQ(Random_Binomial1(10, 0.39L, Uniforms{u}), 4);
   }
   const int order[] = {3, 2, 4, 1, 5, 0, 6, 7, 8, 9, 10};  // the walk's order of visits
   for (int step = 0; step < 1000; ++step) {
@@ -449,30 +441,27 @@ TEST(RandomBinomial, ModeShortcutOutwardWalkAndInversion) {
         break;
       }
     }
-    ScriptedSource script{u};
     if (!nearEdge) {
-      ASSERT_EQ(Random_Binomial1(10, 0.35L, script), expected) << u;
+      ASSERT_EQ(Random_Binomial1(10, 0.35L, Uniforms{u}), expected) << u;
     }
   }
   // P = 0 and P = 1 leave one possible value and draw nothing; N = 0 has the mode 0.
   for (LongInt n : {0, 1, 7, 1000000}) {
-    ScriptedSource none{};
+    Uniforms none{};
     EXPECT_EQ(Random_Binomial1(n, 0, none), 0);
     EXPECT_EQ(Random_Binomial1(n, 1, none), n);
     EXPECT_EQ(none.Draws(), 0u);
   }
-  ScriptedSource zero{0.999L};
-  EXPECT_EQ(Random_Binomial1(0, 0.4L, zero), 0);
+  EXPECT_EQ(Random_Binomial1(0, 0.4L, Uniforms{0.999L}), 0);
   // N = 1, P = 0.01: the probabilities 0.99 and 0.01, held as doubles, add up to less than the
   // largest uniform, so the walk ends with u still not negative.
-  ScriptedSource last{1 - 0x1p-64L};
-  ExpectRaises(rsInvalidValue, [&] { Random_Binomial1(1, 0.01L, last); });
+  ExpectRaises(rsInvalidValue, [] { Random_Binomial1(1, 0.01L, Uniforms{1 - 0x1p-64L}); });
   // N = 5, P = 0.3: q^N = 0.16807. u = 0.1 and 0.05 would give 0 and are redrawn; u = 0.2
   // gives 1, or N - 1 reflected for P > 0.5. Past y = 110 the search would not end.
-  ScriptedSource script{0.1L, 0.05L, 0.2L}, reflected{0.1L, 0.05L, 0.2L}, beyond{1.5L};
+  Uniforms script{0.1L, 0.05L, 0.2L}, beyond{1.5L};
   EXPECT_EQ(Random_Binomial2(5, 0.3L, script), 1);
   EXPECT_EQ(script.Draws(), 3u);
-  EXPECT_EQ(Random_Binomial2(5, 0.7L, reflected), 4);
+  EXPECT_EQ(Random_Binomial2(5, 0.7L, Uniforms{0.1L, 0.05L, 0.2L}), 4);
   ExpectRaises(rsInvalidValue, [&] { Random_Binomial2(5, 0.3L, beyond); });
   EXPECT_EQ(beyond.Draws(), 1u);
   ExpectEachRaisesBeforeDraw<Pair>(
@@ -483,11 +472,12 @@ TEST(RandomBinomial, ModeShortcutOutwardWalkAndInversion) {
 TEST(RandomDiscrete, NegativeBinomialPoissonAndCauchy) {
   // R = 1, P = 0.5: u = 0.7 gives 1. R = 2, P = 0.8: two geometric draws (u = 0 redrawn),
   // Trunc(ln 0.5 / ln 0.8) = 3 and Trunc(ln 0.3 / ln 0.8) = 5; the fraction 0 adds nothing.
-  ScriptedSource script{0.7L}, geometric{0.0L, 0.5L, 0.3L, 0.9L}, near{0.5L};
-  EXPECT_EQ(Random_Neg_Binomial(1, 0.5L, script), 1);
+  Uniforms geometric{0.0L, 0.5L, 0.3L, 0.9L};
+  EXPECT_EQ(Random_Neg_Binomial(1, 0.5L, Uniforms{0.7L}), 1);
   EXPECT_EQ(Random_Neg_Binomial(2, 0.8L, geometric), 8);
   EXPECT_EQ(geometric.Draws(), 4u);
-  EXPECT_GE(Random_Neg_Binomial(1000, 0.5L, near), 0);  // 0.5^1000 is still above the guard
+  // 0.5^1000 is still above the guard.
+  EXPECT_GE(Random_Neg_Binomial(1000, 0.5L, Uniforms{0.5L}), 0);
   ExpectEachRaisesBeforeDraw<Pair>(
       rsInvalidValue,
       {{0, 0.5L}, {1, 0}, {1, 1}, {1, -0.1L}, {1, 1.5L}, {kNaN, 0.5L}, {1100, 0.5L}},
@@ -506,19 +496,17 @@ TEST(RandomDiscrete, NegativeBinomialPoissonAndCauchy) {
                  {-kInf, {0.999L}, 0, 1}};
   for (const auto& c : poisson) {
     Extended mu = c.mu;
-    ScriptedSource s(c.uniforms);
+    Uniforms s(c.uniforms);
     EXPECT_EQ(Random_Poisson(mu, s), c.expected) << static_cast<double>(c.mu);
     EXPECT_EQ(s.Draws(), c.draws);
     EXPECT_EQ(mu, c.mu);
   }
-  ScriptedSource literal{0.5L, 0.6L};  // the mean may be a literal
-  EXPECT_EQ(Random_Poisson(10.0001L, literal), 11);
+  EXPECT_EQ(Random_Poisson(10.0001L, Uniforms{0.5L, 0.6L}), 11);  // the mean may be a literal
   for (Extended mu : {kInf, kNaN, 1e30L}) {
-    ScriptedSource s{0.5L, 0.6L, 0.5L, 0.6L};
-    ExpectRaises(rsInvalidValue, [&] { Random_Poisson(mu, s); });
+    ExpectRaises(rsInvalidValue, [&] { Random_Poisson(mu, Uniforms{0.5L, 0.6L, 0.5L, 0.6L}); });
   }
   // Cauchy: (0.5, 0) has y = 0; (0.98, 0.98) lies outside the disc; (0.5, -0.5) gives -1.
-  ScriptedSource cauchy{0.75L, 0.5L, 0.99L, 0.99L, 0.75L, 0.25L};
+  Uniforms cauchy{0.75L, 0.5L, 0.99L, 0.99L, 0.75L, 0.25L};
   EXPECT_EQ(Random_Cauchy(cauchy), -1.0L);
   EXPECT_EQ(cauchy.Draws(), 6u);
 }
@@ -528,19 +516,18 @@ TEST(RandomInvGaussAndVonMises, DrawsAndChecks) {
   ExpectEachRaisesBeforeDraw<Pair>(rsInvalidValue,
                                    {{-1, 1}, {1, 0}, {1, -2}, {1e160L, 1}, {0, 1e-200L}, {kNaN, 1}},
                                    [](Pair p) { return EITHER(Random_Inv_Gauss, p[0], p[1]); });
-  ScriptedSource script{0.0L, 0.5L, 0.5L};  // u = 0 is redrawn
+  Uniforms script{0.0L, 0.5L, 0.5L};  // u = 0 is redrawn
   EXPECT_GT(Random_Inv_Gauss(1, 1, script), 0.0L);
   EXPECT_EQ(script.Draws(), 3u);
   ExpectEachRaisesBeforeDraw(rsInvalidValue, {-0.1L, 10.0L, kInf, kNaN},
                              [](Extended k) { return EITHER(Random_von_Mises, k); });
   // K = 0: one interval [0, pi]; the selecting uniform places the angle (s = 1 - u), the
   // uniform that ends the comparison run gives the sign.
-  ScriptedSource plus{0.25L, 0.6L}, minus{0.25L, 0.3L};
-  EXPECT_NEAR(Random_von_Mises(0, plus), 0.75L * QENPi, 1e-18L);
-  EXPECT_NEAR(Random_von_Mises(0, minus), -0.75L * QENPi, 1e-18L);
+  EXPECT_NEAR(Random_von_Mises(0, Uniforms{0.25L, 0.6L}), 0.75L * QENPi, 1e-18L);
+  EXPECT_NEAR(Random_von_Mises(0, Uniforms{0.25L, 0.3L}), -0.75L * QENPi, 1e-18L);
   // K = 0.3 at 3 pi / 4: h = 0.512; the run 0.4, 0.5 has even length, so a new position s = 0.5
   // (pi / 2, h = 0.3) is drawn; 0.9 ends a run of length 1 and accepts.
-  ScriptedSource run{0.25L, 0.4L, 0.5L, 0.5L, 0.9L};
+  Uniforms run{0.25L, 0.4L, 0.5L, 0.5L, 0.9L};
   EXPECT_NEAR(Random_von_Mises(0.3L, run), QENPi / 2, 1e-18L);
   EXPECT_EQ(run.Draws(), 5u);
 }

@@ -308,7 +308,6 @@ TEST(SampleStandardise, BothFormsAndTheirErrors) {
   Standardise(z, 5, 3, true);
   EXPECT_TRUE(RelNear(QENMean(z), 5, 1e-17L));
   EXPECT_TRUE(RelNear(PopulationVariance(z), 9, 1e-17L));
-  using ExpectRaisesUntouched;
   ExpectRaisesUntouched(rsVectorIsEmpty, TQENFloatVector{},
                         [](auto& v) { Standardise(v, 0, 0, 0, 1); });
   ExpectRaisesUntouched(rsVectorIsEmpty, TQENFloatVector{},
