@@ -487,10 +487,20 @@ Extended BetaContinuedFraction(const BetaPoint& p, Extended a, Extended b, Exten
     bn = bnp1;
     bnp1 = t;
     const Extended r0 = r;
-    r = anp1 / bnp1;
-    if (!(std::fabs(r - r0) > kEpsilon * r)) break;
-    an /= bnp1;
-    bn /= bnp1;
+    if (p.precise_powers) {
+      // The precise family rescales by one reciprocal instead of three quotients (a rounding
+      // more in each ratio, which the next step's rescaling does not carry forward).
+      const Extended scale = 1.0L / bnp1;
+      r = anp1 * scale;
+      if (!(std::fabs(r - r0) > kEpsilon * r)) break;
+      an *= scale;
+      bn *= scale;
+    } else {
+      r = anp1 / bnp1;
+      if (!(std::fabs(r - r0) > kEpsilon * r)) break;
+      an /= bnp1;
+      bn /= bnp1;
+    }
     anp1 = r;
     bnp1 = 1.0L;
   }
@@ -1084,6 +1094,8 @@ namespace detail {
 
 Extended PrecisePower(Extended X, Extended A) {
   if (A == 0.5L) return std::sqrt(X);
+  // |ln X| >= |X - 1| / max(X, 1): beyond the limit by that bound, the logarithm is not needed.
+  if (std::fabs(A * (X - 1.0L)) > kExpLogPowerLimit * std::fmax(X, 1.0L)) return Pow80(X, A);
   const Extended e = A * Ln80(X);
   if (std::fabs(e) <= kExpLogPowerLimit) return Exp80(e);
   return Pow80(X, A);

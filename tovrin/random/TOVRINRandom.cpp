@@ -16,6 +16,7 @@
 #include <cstring>
 #include <functional>
 #include <mutex>
+#include <random>
 #include <thread>
 
 namespace tovrin {
@@ -70,12 +71,8 @@ inline std::uint64_t NextBits(ThreadStream& stream) {
   return result;
 }
 
-// bits * 2^-64, exact in the 64-bit mantissa. The word is loaded as a signed integer and moved
-// up by 2^63, which avoids the branch of an unsigned conversion.
-inline Extended UniformFromBits(std::uint64_t bits) {
-  const auto shifted = static_cast<std::int64_t>(bits ^ 0x8000000000000000ULL);
-  return (static_cast<Extended>(shifted) + 0x1p63L) * 0x1p-64L;
-}
+using detail::UniformDoubleFromBits;
+using detail::UniformFromBits;
 
 // The process seed. Only the slow paths (a thread joining a seed, a new seed) take the lock;
 // a draw reads the atomic generation and nothing else that is shared.
@@ -106,23 +103,39 @@ class ThreadSource {
  public:
   ThreadSource() : stream_(CurrentStream()) {}
   Extended operator()() { return UniformFromBits(NextBits(stream_)); }
-  // The next uniform rounded to double, without the trip through the x87 unit: rounding the
-  // 64-bit word to 53 bits and scaling by 2^-64 rounds the exact uniform the same way. A word
-  // of 2^63 or more is halved first with its last bit kept as a sticky bit (it lies below the
-  // rounding position), which rounds the same way; the choice is made without a branch,
-  // which would go either way at random.
-  double NextDouble() {
-    const std::uint64_t bits = NextBits(stream_);
-    const std::uint64_t high = bits >> 63;
-    const std::uint64_t mask = 0 - high;
-    const std::uint64_t word = bits ^ ((bits ^ ((bits >> 1) | (bits & 1))) & mask);
-    const auto factor = static_cast<double>(static_cast<std::int64_t>(high + 1));  // 1 or 2
-    return static_cast<double>(static_cast<std::int64_t>(word)) * 0x1p-64 * factor;
-  }
+  // The next uniform rounded to double.
+  double NextDouble() { return UniformDoubleFromBits(NextBits(stream_)); }
 
  private:
   ThreadStream& stream_;
 };
+
+// The standard Mersenne Twisters passed as a TRandomGenFunction: the generators draw their
+// words inline instead of through the reference, the same uniforms in the same order.
+template <typename Engine>
+class EngineSource {
+ public:
+  explicit EngineSource(Engine& engine) : engine_(engine) {}
+  Extended operator()() { return UniformFromBits(detail::EngineWord64(engine_)); }
+  double NextDouble() { return UniformDoubleFromBits(detail::EngineWord64(engine_)); }
+
+ private:
+  Engine& engine_;
+};
+
+// body(source) with the engine behind gen drawn inline where it is a known one.
+template <typename Body>
+auto WithSource(TRandomGenFunction gen, Body body) {
+  if (auto* engine = gen.EngineOf<std::mt19937_64>()) {
+    EngineSource<std::mt19937_64> source(*engine);
+    return body(source);
+  }
+  if (auto* engine = gen.EngineOf<std::mt19937>()) {
+    EngineSource<std::mt19937> source(*engine);
+    return body(source);
+  }
+  return body(gen);
+}
 
 // ---------------------------------------------------------------------------------------------
 // Conversions to integers. Truncating NaN or a value past the Int64 range has no integer
@@ -243,40 +256,49 @@ Extended TruncExtended(Extended x) {
 // A uniform rounded to double.
 template <typename Gen>
 double DrawDouble(Gen& gen) {
-  return static_cast<double>(gen());
+  return gen.NextDouble();
 }
-double DrawDouble(ThreadSource& gen) { return gen.NextDouble(); }
 
 // Leva's ratio of uniforms. The uniforms, the transformed v and the intermediates x, y, q are
 // held as doubles (the published method's precision); each of them is computed in Extended
 // arithmetic with Extended constants and rounded once when it is stored, like every other
 // value of the library. The comparisons, the logarithmic test and the ratio are Extended.
 //
-// v enters the result, so it is always worked out that way. x, y and q only steer the two
-// bounds: plain double arithmetic gives q within 1e-15 of the stored value, which settles both
-// bounds alike unless q lies within 1e-9 of one of them, and only then is the Extended form
-// computed. The Extended bounds 0.27597 and 0.27846 lie above their nearest doubles and below
-// the next ones, so for a double q, q < 0.27597L is q <= 0.27597 and q > 0.27846L is q > 0.27846.
+// v enters the result, so it is worked out that way whenever it is used: on acceptance and for
+// the logarithmic test. x, y and q only steer the two bounds: plain double arithmetic on the
+// uniforms, v taken as (v - 0.5) 1.7156 in double (within 5e-16 of the stored v), gives q within
+// 2e-15 of the stored value, which settles both bounds alike unless q lies within 1e-9 of one
+// of them, and only then is the Extended form computed. So the Extended v stays off the path of
+// the rejections. The Extended bounds 0.27597 and 0.27846 lie above their nearest doubles and
+// below the next ones, so for a double q, q < 0.27597L is q <= 0.27597 and q > 0.27846L is
+// q > 0.27846.
+inline double LevaV(double v) { return static_cast<double>((v - 0.5L) * 1.7156L); }
+
 template <typename Gen>
 Extended StandardNormal(Gen& gen) {
   double u;
   double v;
   for (;;) {
     u = DrawDouble(gen);
-    v = DrawDouble(gen);
-    v = static_cast<double>((v - 0.5L) * 1.7156L);
+    const double rawV = DrawDouble(gen);
+    const double vNear = (rawV - 0.5) * 1.7156;
     double x = u - 0.449871;
-    double y = std::fabs(v) + 0.386595;
+    double y = std::fabs(vNear) + 0.386595;
     double q = x * x + y * (0.196 * y - 0.25472 * x);
-    if (std::fabs(q - 0.27597) < 1e-9 || std::fabs(q - 0.27846) < 1e-9) {
+    if (std::fabs(q - 0.27597) < 1e-9 || std::fabs(q - 0.27846) < 1e-9) [[unlikely]] {
+      v = LevaV(rawV);
       x = static_cast<double>(u - 0.449871L);
       y = static_cast<double>(std::fabs(v) + 0.386595L);
       const Extended xe = x;
       const Extended ye = y;
       q = static_cast<double>(xe * xe + ye * (0.196L * ye - 0.25472L * xe));
     }
-    if (q <= 0.27597) break;
+    if (q <= 0.27597) {
+      v = LevaV(rawV);
+      break;
+    }
     if (q > 0.27846) continue;
+    v = LevaV(rawV);
     if (static_cast<Extended>(v) * v <
         -4.0L * static_cast<Extended>(u) * u * std::log(Extended{u})) {
       break;
@@ -396,6 +418,9 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
   bool haveW0 = false;
   Extended tLnT = 0;
   bool haveTLnT = false;
+  BoundedLog logT{};  // ln t in double, formed on first use like t ln t
+  bool haveLogT = false;
+  bool logTValid = false;
   for (;;) {
     const Extended u = gen();
     if (u >= 1) continue;
@@ -406,8 +431,11 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
     if (tail) {
       x = t - std::log((1 - u) / (1 - p));
       BoundedLog logX;
-      BoundedLog logT;
-      if (DoubleLog(x, logX) && DoubleLog(t, logT)) {
+      if (!haveLogT) {
+        logTValid = DoubleLog(t, logT);
+        haveLogT = true;
+      }
+      if (DoubleLog(x, logX) && logTValid) {
         const Extended lnX = logX.value;
         const Extended lnT = logT.value;
         w = t * lnX - t * lnT;
@@ -1316,13 +1344,15 @@ void Randomize() {
 // ---------------------------------------------------------------------------------------------
 // The generators: each overload is a forward to its method.
 
-Extended Random_Normal(TRandomGenFunction Gen) { return StandardNormal(Gen); }
+Extended Random_Normal(TRandomGenFunction Gen) {
+  return WithSource(Gen, [](auto& gen) { return StandardNormal(gen); });
+}
 Extended Random_Normal() {
   ThreadSource gen;
   return StandardNormal(gen);
 }
 Extended Random_Normal(Extended Mean, Extended StdDev, TRandomGenFunction Gen) {
-  return NormalVariate(Mean, StdDev, Gen);
+  return WithSource(Gen, [=](auto& gen) { return NormalVariate(Mean, StdDev, gen); });
 }
 Extended Random_Normal(Extended Mean, Extended StdDev) {
   ThreadSource gen;
@@ -1336,7 +1366,9 @@ Extended Random_LogNormal(Extended Mean, Extended StdDev) {
   return LogNormalVariate(Mean, StdDev, gen);
 }
 
-Extended Random_Gamma(Extended Shape, TRandomGenFunction Gen) { return GammaVariate(Shape, Gen); }
+Extended Random_Gamma(Extended Shape, TRandomGenFunction Gen) {
+  return WithSource(Gen, [Shape](auto& gen) { return GammaVariate(Shape, gen); });
+}
 Extended Random_Gamma(Extended Shape) {
   ThreadSource gen;
   return GammaVariate(Shape, gen);
@@ -1399,7 +1431,7 @@ Int64 Random_Binomial1(LongInt N, Extended P) {
   return BinomialFromMode(N, P, gen);
 }
 Int64 Random_Binomial2(Int64 N, Extended P, TRandomGenFunction Gen) {
-  return BinomialVariate(N, P, Gen);
+  return WithSource(Gen, [N, P](auto& gen) { return BinomialVariate(N, P, gen); });
 }
 Int64 Random_Binomial2(Int64 N, Extended P) {
   ThreadSource gen;
@@ -1424,7 +1456,9 @@ Extended Random_Cauchy() {
   return CauchyVariate(gen);
 }
 
-Int64 Random_Poisson(const Extended& Mu, TRandomGenFunction Gen) { return PoissonVariate(Mu, Gen); }
+Int64 Random_Poisson(const Extended& Mu, TRandomGenFunction Gen) {
+  return WithSource(Gen, [&Mu](auto& gen) { return PoissonVariate(Mu, gen); });
+}
 Int64 Random_Poisson(const Extended& Mu) {
   ThreadSource gen;
   return PoissonVariate(Mu, gen);

@@ -117,6 +117,58 @@ TEST(TRandomGenFunction, IsACheapReferenceToAnyCallable) {
   EXPECT_EQ(Random_Exponential([] { return Extended{0.5L}; }), std::log(2.0L));
 }
 
+// A bit generator passed as the source gives the uniforms of std::generate_canonical<long
+// double, 64> on it, draw for draw, whether a generator draws its words inline (the normal,
+// gamma, binomial and Poisson on the Mersenne Twisters) or through the reference.
+template <typename Engine>
+void ExpectEngineDrawsAsCanonical() {
+  Engine direct(2026);
+  Engine viaCanonical(2026);
+  auto canonical = [&viaCanonical] {
+    return std::generate_canonical<long double, 64>(viaCanonical);
+  };
+  for (int i = 0; i < 2000; ++i) {
+    Extended mu = 100;
+    ASSERT_EQ(Random_Normal(direct), Random_Normal(canonical));
+    ASSERT_EQ(Random_Normal(1, 2, direct), Random_Normal(1, 2, canonical));
+    ASSERT_EQ(Random_Gamma(0.5L, direct), Random_Gamma(0.5L, canonical));
+    ASSERT_EQ(Random_Gamma(5, direct), Random_Gamma(5, canonical));
+    ASSERT_EQ(Random_Binomial2(1000, 0.3L, direct), Random_Binomial2(1000, 0.3L, canonical));
+    ASSERT_EQ(Random_Poisson(mu, direct), Random_Poisson(mu, canonical));
+    ASSERT_EQ(Random_Beta(2, 3, direct), Random_Beta(2, 3, canonical));
+  }
+  EXPECT_EQ(direct, viaCanonical);  // the same words consumed
+}
+
+TEST(TRandomGenFunction, TakesBitGeneratorsAsGenerateCanonicalDoes) {
+  ExpectEngineDrawsAsCanonical<std::mt19937_64>();
+  ExpectEngineDrawsAsCanonical<std::mt19937>();
+  ExpectEngineDrawsAsCanonical<std::ranlux24_base>();  // 24-bit words
+}
+
+TEST(TRandomGenFunction, WordsRoundToDoubleAsTheirUniforms) {
+  // Ties to even in both halves of the range, the last words below 2^53 and 1, and random words.
+  std::vector<std::uint64_t> words = {0,
+                                      1,
+                                      (std::uint64_t{1} << 53) - 1,
+                                      (std::uint64_t{1} << 53) + 1,
+                                      0x0020000000000003ULL,
+                                      0x8000000000000400ULL,
+                                      0x8000000000000C00ULL,
+                                      0x8000000000000401ULL,
+                                      0x4000000000000200ULL,
+                                      0x4000000000000600ULL,
+                                      ~std::uint64_t{0},
+                                      ~std::uint64_t{0} - 1024};
+  std::mt19937_64 engine(9);
+  for (int i = 0; i < 100000; ++i) words.push_back(engine() >> (i % 64));
+  for (const std::uint64_t word : words) {
+    const Extended uniform = static_cast<Extended>(word) * 0x1p-64L;
+    ASSERT_EQ(detail::UniformFromBits(word), uniform) << word;
+    ASSERT_EQ(detail::UniformDoubleFromBits(word), static_cast<double>(uniform)) << word;
+  }
+}
+
 TEST(VerdanRandom, Seed0GivesTheXoshiroReferenceStream) {
   SetRandSeed(0);
   for (std::uint64_t expected : kXoshiroSeed0) {

@@ -4,47 +4,25 @@
 #include <limits>
 #include <utility>
 
-#include "tovrin/foundation/TOVRINErrors.h"
-#include "tovrin/foundation/TOVRINMath.h"
-#include "tovrin/foundation/detail/IncompleteTails.h"
-#include "tovrin/statistics/TOVRINPrecise.h"
 #include "tovrin/statistics/TOVRINStatistics_Continuous.h"
-#include "tovrin/statistics/detail/PairArithmetic.h"
+#include "tovrin/statistics/detail/PreciseCommon.h"
 
 namespace tovrin::precise {
 namespace {
 
-using detail::Pair;
-using detail::RaiseMathError;
-using detail::Tails;
+using namespace common;  // NOLINT: the family's shared names
 
-constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
-constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
 // 1/sqrt(2) as hi + lo, 1/sqrt(2 pi) and 2/sqrt(pi).
 constexpr Extended kInvSqrt2 = 0.707106781186547524381894036516L;
 constexpr Extended kInvSqrt2Lo = 1.895032558893257079655062e-20L;
 constexpr Extended kInvSqrt2Pi = 0.398942280401432677939946059934381868L;
 constexpr Extended kTwoOverSqrtPi = 1.12837916709551257389615890312154517L;
 
-// --- Checks, as the classic functions make them ---------------------------------------------
+// --- Checks, as the classic functions make them (detail/DistributionChecks.h) ---------------
 
-void CheckStdDev(Extended StdDev) {
-  if (!FloatIsPositive(StdDev)) RaiseMathError(rsStdDev);
-}
-void CheckInverseStdDev(Extended StdDev) {
-  if (FloatIsZero(StdDev) || FloatIsNegative(StdDev)) RaiseMathError(rsStdDev);
-}
-void CheckOpenProbability(Extended P) {
-  if (!(P > 0 && P < 1)) RaiseMathError(rsValue01);
-}
-void CheckClosedProbability(Extended P) {
-  if (!(P >= 0 && P <= 1)) RaiseMathError(rsValue01Inc);
-}
+// Degrees of freedom are Extended here.
 void CheckDF(Extended DF) {
   if (!(DF > 0)) RaiseMathError(rsDF);
-}
-void CheckBetaShapes(Extended A, Extended B) {
-  if (!(A > 0) || !(B > 0)) RaiseMathError(rsValueGZero);
 }
 
 // --- Normal tails -----------------------------------------------------------------------------
@@ -76,27 +54,33 @@ Pair Standardized(Extended Mean, Extended StdDev, Extended X) {
   return detail::Quotient(detail::ExactSum(X, -Mean), Pair{StdDev});
 }
 
-// The z >= 0 with P(Z > z) = p, for 0 < p <= 1/2: Wichura's AS 241 (the classic InvNormalLess,
-// good to about 1e-16) as the first estimate, then Halley steps on erf near the centre and on
-// the upper tail beyond. Halley's method triples the correct digits, so once a step is below
-// 1e-7 relative the result is exact to the working precision and no further step is needed.
+#include "tovrin/statistics/TOVRINPrecise_InvNormal.inc"
+
+// c[0] + c[1] t + ... + c[N-1] t^(N-1) as Horner's rule in t^2 over the pairs c[i] + c[i+1] t:
+// half the dependent steps of the plain rule, the same rounding for coefficients of one sign.
+template <int N>
+Extended Polynomial(const Extended (&c)[N], Extended t) {
+  const Extended t2 = t * t;
+  Extended v = N % 2 == 1 ? c[N - 1] : c[N - 2] + c[N - 1] * t;
+  for (int i = N % 2 == 1 ? N - 3 : N - 4; i >= 0; i -= 2) v = v * t2 + (c[i] + c[i + 1] * t);
+  return v;
+}
+
+// The z >= 0 with P(Z > z) = p, for 0 < p <= 1/2, from the rational approximations fitted by
+// TOVRINPrecise_InvNormal.py (about 1e-20 relative): in q = 1/2 - p for p >= 0.075, beyond in
+// r = sqrt(-ln p) on six intervals up to the smallest subnormal p. No correction step follows:
+// the rounding of ln p moves z by about one unit in the last place.
 Extended InverseNormalUpper(Extended p) {
-  if (p == 0.5L) return 0.0L;
-  const bool central = p > 0.3L;
-  Extended z = -tovrin::InvNormalLess(p);
-  for (int i = 0; i < 20; ++i) {
-    // The tail and density need no argument carried to twice the precision here: an error of
-    // z^2 eps in Q(z) moves the root by only z eps.
-    const Extended density = kInvSqrt2Pi * std::exp(-0.5L * z * z);
-    // u = f / f' for f increasing in z (0.5 erf(z / sqrt 2) - (0.5 - p), or p - Q(z)).
-    const Extended x = z * kInvSqrt2;
-    const Extended f = central ? 0.5L * std::erf(x) - (0.5L - p) : p - 0.5L * std::erfc(x);
-    const Extended u = f / density;
-    const Extended step = u / (1.0L + 0.5L * u * z);
-    z -= step;
-    if (!(std::fabs(step) > 1e-7L * std::fabs(z))) break;
+  if (p >= 0.075L) {
+    const Extended q = 0.5L - p;
+    const Extended v = kInvNormalCentralEdge - q * q;
+    return q * Polynomial(kInvNormalCentralP, v) / Polynomial(kInvNormalCentralQ, v);
   }
-  return z;
+  const Extended r = std::sqrt(-std::log(p));
+  int k = 0;
+  while (k + 1 < kInvNormalTailRegions && r >= kInvNormalTailStart[k + 1]) ++k;
+  const Extended s = r - kInvNormalTailStart[k];
+  return r * Polynomial(kInvNormalTailP[k], s) / Polynomial(kInvNormalTailQ[k], s);
 }
 
 // The z with P(Z < z) = P for 0 < P < 1 (1 - P is exact where it is used).
@@ -601,63 +585,77 @@ Extended ExponentialPDF(Extended X, Extended Mean) {
 
 // === Beta =======================================================================================
 
-Extended BetaDistLess(Extended X, Extended A, Extended B) {
+namespace {
+// The point (x, 1 - x) after the checks: X on [0, 1] (width 1), or X mapped from
+// [Lower, Upper] (the width of the interval).
+struct BetaPoint {
+  std::pair<Pair, Pair> xy;
+  Extended width;
+};
+BetaPoint CheckedBetaPoint(Extended X, Extended A, Extended B) {
   CheckBetaShapes(A, B);
-  return BetaDistTails(UnitPoint(X), A, B).lower;
+  return {UnitPoint(X), 1.0L};
+}
+BetaPoint CheckedBetaPoint(Extended X, Extended A, Extended B, Extended Lower, Extended Upper) {
+  const auto [low, high] = BetaInterval(Lower, Upper);
+  CheckBetaShapes(A, B);
+  return {IntervalPoint(X, low, high), high - low};
+}
+
+// The root with P below it (above it for Greater) after the checks, on [0, 1] or mapped to
+// [Lower, Upper] from whichever end is nearer.
+detail::BetaRoot CheckedBetaRoot(Extended P, Extended A, Extended B, bool greater) {
+  CheckClosedProbability(P);
+  CheckBetaShapes(A, B);
+  return greater ? BetaRoot(1.0L - P, P, A, B) : BetaRoot(P, 1.0L - P, A, B);
+}
+Extended CheckedBetaRoot(Extended P, Extended A, Extended B, Extended Lower, Extended Upper,
+                         bool greater) {
+  const auto [low, high] = BetaInterval(Lower, Upper);
+  const detail::BetaRoot r = CheckedBetaRoot(P, A, B, greater);
+  return r.x <= 0.5L ? low + (high - low) * r.x : high - (high - low) * r.y;
+}
+}  // namespace
+
+Extended BetaDistLess(Extended X, Extended A, Extended B) {
+  return BetaDistTails(CheckedBetaPoint(X, A, B).xy, A, B).lower;
 }
 
 Extended BetaDistLess(Extended X, Extended A, Extended B, Extended Lower, Extended Upper) {
-  const auto [low, high] = BetaInterval(Lower, Upper);
-  CheckBetaShapes(A, B);
-  return BetaDistTails(IntervalPoint(X, low, high), A, B).lower;
+  return BetaDistTails(CheckedBetaPoint(X, A, B, Lower, Upper).xy, A, B).lower;
 }
 
 Extended BetaDistGreater(Extended X, Extended A, Extended B) {
-  CheckBetaShapes(A, B);
-  return BetaDistTails(UnitPoint(X), A, B).upper;
+  return BetaDistTails(CheckedBetaPoint(X, A, B).xy, A, B).upper;
 }
 
 Extended BetaDistGreater(Extended X, Extended A, Extended B, Extended Lower, Extended Upper) {
-  const auto [low, high] = BetaInterval(Lower, Upper);
-  CheckBetaShapes(A, B);
-  return BetaDistTails(IntervalPoint(X, low, high), A, B).upper;
+  return BetaDistTails(CheckedBetaPoint(X, A, B, Lower, Upper).xy, A, B).upper;
 }
 
 Extended InvBetaDistLess(Extended P, Extended A, Extended B) {
-  CheckClosedProbability(P);
-  CheckBetaShapes(A, B);
-  return BetaRoot(P, 1.0L - P, A, B).x;
+  return CheckedBetaRoot(P, A, B, false).x;
 }
 
 Extended InvBetaDistLess(Extended P, Extended A, Extended B, Extended Lower, Extended Upper) {
-  const auto [low, high] = BetaInterval(Lower, Upper);
-  const detail::BetaRoot r =
-      (CheckClosedProbability(P), CheckBetaShapes(A, B), BetaRoot(P, 1.0L - P, A, B));
-  return r.x <= 0.5L ? low + (high - low) * r.x : high - (high - low) * r.y;
+  return CheckedBetaRoot(P, A, B, Lower, Upper, false);
 }
 
 Extended InvBetaDistGreater(Extended P, Extended A, Extended B) {
-  CheckClosedProbability(P);
-  CheckBetaShapes(A, B);
-  return BetaRoot(1.0L - P, P, A, B).x;
+  return CheckedBetaRoot(P, A, B, true).x;
 }
 
 Extended InvBetaDistGreater(Extended P, Extended A, Extended B, Extended Lower, Extended Upper) {
-  const auto [low, high] = BetaInterval(Lower, Upper);
-  const detail::BetaRoot r =
-      (CheckClosedProbability(P), CheckBetaShapes(A, B), BetaRoot(1.0L - P, P, A, B));
-  return r.x <= 0.5L ? low + (high - low) * r.x : high - (high - low) * r.y;
+  return CheckedBetaRoot(P, A, B, Lower, Upper, true);
 }
 
 Extended BetaPDF(Extended X, Extended A, Extended B) {
-  CheckBetaShapes(A, B);
-  return BetaDensityAt(UnitPoint(X), A, B);
+  return BetaDensityAt(CheckedBetaPoint(X, A, B).xy, A, B);
 }
 
 Extended BetaPDF(Extended X, Extended A, Extended B, Extended Lower, Extended Upper) {
-  const auto [low, high] = BetaInterval(Lower, Upper);
-  CheckBetaShapes(A, B);
-  return BetaDensityAt(IntervalPoint(X, low, high), A, B) / (high - low);
+  const BetaPoint point = CheckedBetaPoint(X, A, B, Lower, Upper);
+  return BetaDensityAt(point.xy, A, B) / point.width;
 }
 
 }  // namespace tovrin::precise
