@@ -6,6 +6,7 @@
 // call per draw).
 #include "tovrin/random/TOVRINRandom.h"
 
+#include "tovrin/foundation/detail/Elementary.h"
 #include "tovrin/foundation/detail/Wrapping.h"
 
 #include <algorithm>
@@ -23,6 +24,8 @@ namespace tovrin {
 
 namespace {
 
+using detail::Exp80;
+using detail::Ln80;
 using detail::RaiseMathError;
 
 // The two literal guards of the methods: the literal 5.0E-324 held as an Extended (not the
@@ -299,8 +302,7 @@ Extended StandardNormal(Gen& gen) {
     }
     if (q > 0.27846) continue;
     v = LevaV(rawV);
-    if (static_cast<Extended>(v) * v <
-        -4.0L * static_cast<Extended>(u) * u * std::log(Extended{u})) {
+    if (static_cast<Extended>(v) * v < -4.0L * static_cast<Extended>(u) * u * Ln80(Extended{u})) {
       break;
     }
   }
@@ -330,7 +332,7 @@ Extended ExponentialVariate(Gen& gen) {
   do {
     u = gen();
   } while (!(u > kTiny));
-  return -std::log(u);
+  return -Ln80(u);
 }
 
 // ---------------------------------------------------------------------------------------------
@@ -340,8 +342,9 @@ Extended ExponentialVariate(Gen& gen) {
 // only where the two sides lie within the bound below does the Extended logarithm decide.
 //
 // ln x in double for a positive x in the normal double range, with a bound on its distance
-// from std::log(x) in Extended: rounding x to double moves ln x by 1.2e-16, the double log is
-// within an ulp (2.3e-16 |ln x|) and so is the Extended one; 5e-16 (1 + |ln x|) covers all.
+// from the Extended logarithm (Ln80, or std::log where the C library's is still used):
+// rounding x to double moves ln x by 1.2e-16, the double log is within an ulp
+// (2.3e-16 |ln x|) and so are the Extended ones; 5e-16 (1 + |ln x|) covers all.
 struct BoundedLog {
   double value;
   double bound;
@@ -392,7 +395,7 @@ Extended GammaLargeShape(Extended shape, Gen& gen) {
       if (settled == Settled::kYes) return d * t;
       if (settled == Settled::kNo) continue;
     }
-    if (std::log(u) < 0.5L * x2 + d * (1 - t + std::log(t))) return d * t;
+    if (Ln80(u) < 0.5L * x2 + d * (1 - t + Ln80(t))) return d * t;
   }
 }
 
@@ -401,7 +404,7 @@ template <typename Gen>
 Extended GammaSmallShape(Extended shape, Gen& gen) {
   if (shape < kTiny) RaiseMathError(rsShapeTooSmall);
   const Extended t = 1 - shape;
-  const Extended p = t / (t + shape * std::exp(-t));
+  const Extended p = t / (t + shape * Exp80(-t));
   // Below the floor w0 = p (Tiny / t)^Shape the body's candidate would underflow: such a draw
   // gives 0 at once. The power is costly, so w0 (and t ln t, needed by the tail only) are
   // computed on first use. Since Tiny / t <= 1E-304 and p <= 1, w0 <= exp(-699 Shape): a
@@ -429,7 +432,7 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
     Extended wError = -1;  // -1: w is not known yet
     const bool tail = u > p;
     if (tail) {
-      x = t - std::log((1 - u) / (1 - p));
+      x = t - Ln80((1 - u) / (1 - p));
       BoundedLog logX;
       if (!haveLogT) {
         logTValid = DoubleLog(t, logT);
@@ -473,14 +476,14 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
     }
     if (tail) {
       if (!haveTLnT) {
-        tLnT = t * std::log(t);
+        tLnT = t * Ln80(t);
         haveTLnT = true;
       }
-      w = t * std::log(x) - tLnT;
+      w = t * Ln80(x) - tLnT;
     }
     if (w < 1 - u2) return x;
     if (u2 <= 0) return x;
-    if (u2 * (1 + w) < 1 && w < -std::log(u2)) return x;
+    if (u2 * (1 + w) < 1 && w < -Ln80(u2)) return x;
   }
 }
 
