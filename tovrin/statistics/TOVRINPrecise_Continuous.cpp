@@ -6,6 +6,7 @@
 
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINMath.h"
+#include "tovrin/foundation/detail/Elementary.h"
 #include "tovrin/foundation/detail/IncompleteTails.h"
 #include "tovrin/statistics/TOVRINPrecise.h"
 #include "tovrin/statistics/TOVRINStatistics_Continuous.h"
@@ -14,6 +15,8 @@
 namespace tovrin::precise {
 namespace {
 
+using detail::Exp80;
+using detail::Ln80;
 using detail::Pair;
 using detail::RaiseMathError;
 using detail::Tails;
@@ -58,22 +61,42 @@ Extended NormalUpper(const Pair& z) {
   // The correction is x.lo erfc'(x.hi), at most 2 x^2 units in the last place of erfc for
   // x > 0 and less than one below: below x = 2 it is not worth its exp.
   if (x.lo != 0.0L && x.hi > 2.0L && x.hi < 110.0L) {
-    e -= x.lo * kTwoOverSqrtPi * std::exp(-x.hi * x.hi);
+    e -= x.lo * kTwoOverSqrtPi * Exp80(-x.hi * x.hi);
   }
   return 0.5L * e;
 }
 
-// exp(-z^2 / 2) for z = hi + lo, with z^2 carried exactly.
-Extended ExpMinusHalfSquare(const Pair& z) {
-  Pair s = detail::ExactProduct(z.hi, z.hi);
-  if (!(s.hi < 30000.0L)) return std::isnan(s.hi) ? kNaN : 0.0L;
-  s.lo += 2.0L * z.hi * z.lo;
-  return std::exp(-0.5L * s.hi) * (1.0L - 0.5L * s.lo);
+// e^(-z^2 / 2) for z = hi + lo, with z^2 carried exactly (its rounding would cost z^2 / 2 units
+// in the last place); 0 beyond |z| = 152, where it is below the smallest subnormal.
+Extended ExpMinusHalfSquare(Extended hi, Extended lo) {
+  if (!(std::fabs(hi) < 152.0L)) return std::isnan(hi) ? kNaN : 0.0L;
+  const Pair s = detail::ExactProduct(hi, hi);
+  return Exp80(-0.5L * s.hi, -0.5L * (s.lo + 2.0L * hi * lo));
 }
 
 // (X - Mean) / StdDev to twice the working precision.
 Pair Standardized(Extended Mean, Extended StdDev, Extended X) {
   return detail::Quotient(detail::ExactSum(X, -Mean), Pair{StdDev});
+}
+
+// Scales within 2^(+-16000) have a normal reciprocal and split without overflow.
+bool ScaleInRange(Extended s) { return s >= 0x1p-16000L && s <= 0x1p16000L; }
+
+// The normal density at X. z = (X - Mean) / StdDev is carried to twice the precision with one
+// division: hi = (X - Mean) / StdDev through the reciprocal is within two units in the last
+// place of the quotient, so its remainder is exact all the same and lo is that remainder over
+// StdDev.
+Extended NormalDensity(Extended Mean, Extended StdDev, Extended X) {
+  if (!ScaleInRange(StdDev)) {
+    const Pair z = Standardized(Mean, StdDev, X);
+    return kInvSqrt2Pi * ExpMinusHalfSquare(z.hi, z.lo) / StdDev;
+  }
+  const Extended inverse = 1.0L / StdDev;
+  const Pair d = detail::ExactSum(X, -Mean);
+  const Extended hi = d.hi * inverse;
+  const Pair p = detail::ExactProduct(hi, StdDev);
+  const Extended lo = (((d.hi - p.hi) - p.lo) + d.lo) * inverse;
+  return kInvSqrt2Pi * inverse * ExpMinusHalfSquare(hi, lo);
 }
 
 #include "tovrin/statistics/TOVRINPrecise_InvNormal.inc"
@@ -98,7 +121,7 @@ Extended InverseNormalUpper(Extended p) {
     const Extended v = kInvNormalCentralEdge - q * q;
     return q * Polynomial(kInvNormalCentralP, v) / Polynomial(kInvNormalCentralQ, v);
   }
-  const Extended r = std::sqrt(-std::log(p));
+  const Extended r = std::sqrt(-Ln80(p));
   int k = 0;
   while (k + 1 < kInvNormalTailRegions && r >= kInvNormalTailStart[k + 1]) ++k;
   const Extended s = r - kInvNormalTailStart[k];
@@ -315,7 +338,7 @@ Extended BetaDensityAt(const std::pair<Pair, Pair>& xy, Extended A, Extended B) 
 
 // === Standard normal ============================================================================
 
-Extended NormalZ(Extended Z) { return kInvSqrt2Pi * ExpMinusHalfSquare(Pair{Z}); }
+Extended NormalZ(Extended Z) { return kInvSqrt2Pi * ExpMinusHalfSquare(Z, 0.0L); }
 
 Extended NormalLess(Extended Z) { return NormalUpper(Pair{-Z}); }
 
@@ -337,11 +360,7 @@ Extended ZAlpha(Extended Alpha) { return InvNormalDistGreater(0, 1, Alpha); }
 
 Extended NormalPDF(Extended Mean, Extended StdDev, Extended X) {
   CheckStdDev(StdDev);
-  // Within four standard deviations the plain quotient is enough: its rounding moves the
-  // exponent z^2 / 2 by at most 16 units in the last place of 1, far inside the bound.
-  const Extended z = (X - Mean) / StdDev;
-  if (std::fabs(z) < 4.0L) return kInvSqrt2Pi * std::exp(-0.5L * z * z) / StdDev;
-  return kInvSqrt2Pi * ExpMinusHalfSquare(Standardized(Mean, StdDev, X)) / StdDev;
+  return NormalDensity(Mean, StdDev, X);
 }
 
 Extended NormalDistLess(Extended Mean, Extended StdDev, Extended X) {
@@ -372,28 +391,28 @@ Extended InvNormalDistGreater(Extended Mean, Extended StdDev, Extended P) {
 Extended LogNormalPDF(Extended Mean, Extended StdDev, Extended X) {
   CheckStdDev(StdDev);
   if (!(X > 0)) RaiseMathError(rsValueGZero);
-  return NormalPDF(Mean, StdDev, std::log(X)) / X;
+  return NormalDensity(Mean, StdDev, Ln80(X)) / X;
 }
 
 Extended LogNormalLess(Extended Mean, Extended StdDev, Extended X) {
   CheckStdDev(StdDev);
   if (std::isnan(X)) return kNaN;
   if (X <= 0) return 0;
-  return NormalDistLess(Mean, StdDev, std::log(X));
+  return NormalDistLess(Mean, StdDev, Ln80(X));
 }
 
 Extended LogNormalGreater(Extended Mean, Extended StdDev, Extended X) {
   CheckStdDev(StdDev);
   if (std::isnan(X)) return kNaN;
   if (X <= 0) return 1;
-  return NormalDistGreater(Mean, StdDev, std::log(X));
+  return NormalDistGreater(Mean, StdDev, Ln80(X));
 }
 
 namespace {
 // exp(Mean + StdDev z) with the exponent carried to twice the working precision.
 Extended ExpOfAffine(Extended Mean, Extended StdDev, Extended z) {
   const Pair e = detail::Sum(detail::ExactProduct(StdDev, z), Pair{Mean});
-  return std::exp(e.hi) * (1.0L + e.lo);
+  return Exp80(e.hi, e.lo);
 }
 }  // namespace
 
@@ -584,25 +603,33 @@ Extended ExponentialLess(Extended Mean, Extended X) {
 }
 
 namespace {
-// e^-q for q = X / Mean >= 0. The rounding of q moves e^-q by q units in the last place, so
-// below q = 16 the rounded quotient serves; beyond, q is carried to twice the precision.
-Extended ExpMinusRatio(Extended X, Extended Mean) {
-  const Extended rounded = X / Mean;
-  if (rounded < 16.0L) return std::exp(-rounded);
-  const Pair q = detail::Quotient(Pair{X}, Pair{Mean});
-  if (!(q.hi < 12000.0L)) return std::isnan(q.hi) ? kNaN : 0.0L;
-  return std::exp(-q.hi) * (1.0L - q.lo);
+// e^-q for q = X / Mean >= 0, divided by Mean as well for the density. The rounding of q
+// would move e^-q by q units in the last place, so q is carried to twice the precision, with
+// one division as for the normal density.
+Extended ExpMinusRatio(Extended X, Extended Mean, bool density) {
+  if (!ScaleInRange(Mean)) {
+    const Pair q = detail::Quotient(Pair{X}, Pair{Mean});
+    if (!(q.hi < 12000.0L)) return std::isnan(q.hi) ? kNaN : 0.0L;
+    const Extended e = Exp80(-q.hi, -q.lo);
+    return density ? e / Mean : e;
+  }
+  const Extended inverse = 1.0L / Mean;
+  const Extended hi = X * inverse;
+  if (!(hi < 12000.0L)) return std::isnan(hi) ? kNaN : 0.0L;
+  const Pair p = detail::ExactProduct(hi, Mean);
+  const Extended e = Exp80(-hi, -(((X - p.hi) - p.lo) * inverse));
+  return density ? e * inverse : e;
 }
 }  // namespace
 
 Extended ExponentialGreater(Extended Mean, Extended X) {
   if (Mean <= 0 || X < 0) RaiseMathError(rsExpDistInvalid);
-  return ExpMinusRatio(X, Mean);
+  return ExpMinusRatio(X, Mean, false);
 }
 
 Extended ExponentialPDF(Extended X, Extended Mean) {
   if (!(Mean > 0) || X < 0) RaiseMathError(rsExpDistInvalid);
-  return ExpMinusRatio(X, Mean) / Mean;
+  return ExpMinusRatio(X, Mean, true);
 }
 
 // === Beta =======================================================================================
