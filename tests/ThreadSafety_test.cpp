@@ -48,6 +48,8 @@ TEST(ThreadSafetyTest, RowReductionNeverChangesTheShapeSwitch) {
         TQENDoubleMatrix copy = m;
         ASSERT_TRUE(MatrixInverse(copy, inverse));
         determinants[t] = MatrixDeterminant(m);
+        TQENDoubleMatrix notSquare{{1, 2}};  // a failed call leaves the switch alone too
+        EXPECT_THROW(MatrixInverse(notSquare, inverse), EMathError);
       }
     });
   }

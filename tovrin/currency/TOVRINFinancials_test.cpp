@@ -148,49 +148,42 @@ TEST(RoundHalfEven, NearestIntegerWithHalvesToEven) {
   EXPECT_EQ(detail::RoundHalfEven(-1e30L), -1e30L);
 }
 
-// Stored integers in, stored integers out: widening multiplies exactly (wrapping modulo 2^64
-// past the range), narrowing rounds halves to even and wraps at the narrow width.
 TEST(MoneyConversions, WideningIsExact) {
-  const std::pair<Int64, Int64> currToLong[] = {{-12345, -123450000}, {INT32_MIN, -21474836480000}};
-  for (const auto& [in, out] : currToLong) {
-    EXPECT_EQ(Stored(QENCurrency2QENLongCurrency(TQENCurrency{static_cast<LongInt>(in)})), out);
-  }
+  EXPECT_EQ(Stored(QENCurrency2QENLongCurrency(TQENCurrency{-12345})), -123450000);
+  EXPECT_EQ(Stored(QENCurrency2QENLongCurrency(TQENCurrency{INT32_MIN})), -21474836480000);
   EXPECT_EQ(Stored(QENCurrency2Currency(TQENCurrency{12345})), 1234500);
   EXPECT_EQ(Stored(QENCurrency2Currency(TQENCurrency{INT32_MAX})), 214748364700);
-  const std::pair<Int64, Int64> currencyToLong[] = {{-15, -1500},
-                                                    {92233720368547758, 9223372036854775800},
-                                                    {92233720368547759, -9223372036854775716},
-                                                    {-92233720368547759, 9223372036854775716}};
-  for (const auto& [in, out] : currencyToLong) {
-    EXPECT_EQ(Stored(Currency2QENLongCurrency(Currency{in})), out);
-  }
+  EXPECT_EQ(Stored(Currency2QENLongCurrency(Currency{-15})), -1500);
+  EXPECT_EQ(Stored(Currency2QENLongCurrency(Currency{92233720368547758})), 9223372036854775800);
+  // Past the range the product wraps modulo 2^64.
+  EXPECT_EQ(Stored(Currency2QENLongCurrency(Currency{92233720368547759})), -9223372036854775716);
+  EXPECT_EQ(Stored(Currency2QENLongCurrency(Currency{-92233720368547759})), 9223372036854775716);
 }
 
 TEST(MoneyConversions, NarrowingRoundsHalvesToEven) {
-  // millionths to hundredths: amount 0.015 is 1.5 hundredths, 0.025 is 2.5; INT64_MAX / 10000
-  // rounds to 922337203685478 = 0x346DC5D638866, low 32 bits 0x5D638866.
-  const std::pair<Int64, Int64> longToCurr[] = {
-      {15000, 2},   {25000, 2},   {25001, 3},   {14999, 1},
-      {-15000, -2}, {-25000, -2}, {-25001, -3}, {INT64_MAX, 0x5D638866}};
-  for (const auto& [in, out] : longToCurr) {
-    EXPECT_EQ(Stored(QENLongCurrency2QENCurrency(TQENLongCurrency{in})), out) << in;
-  }
-  const std::pair<Int64, Int64> longToCurrency[] = {
-      {250, 2}, {350, 4}, {-350, -4}, {-349, -3}, {INT64_MIN, -92233720368547758}};
-  for (const auto& [in, out] : longToCurrency) {
-    EXPECT_EQ(Stored(QENLongCurrency2Currency(TQENLongCurrency{in})), out) << in;
-  }
+  // millionths to hundredths: amount 0.015 is 1.5 hundredths, 0.025 is 2.5
+  EXPECT_EQ(Stored(QENLongCurrency2QENCurrency(TQENLongCurrency{15000})), 2);
+  EXPECT_EQ(Stored(QENLongCurrency2QENCurrency(TQENLongCurrency{25000})), 2);
+  EXPECT_EQ(Stored(QENLongCurrency2QENCurrency(TQENLongCurrency{25001})), 3);
+  EXPECT_EQ(Stored(QENLongCurrency2QENCurrency(TQENLongCurrency{14999})), 1);
+  EXPECT_EQ(Stored(QENLongCurrency2QENCurrency(TQENLongCurrency{-15000})), -2);
+  EXPECT_EQ(Stored(QENLongCurrency2QENCurrency(TQENLongCurrency{-25000})), -2);
+  EXPECT_EQ(Stored(QENLongCurrency2QENCurrency(TQENLongCurrency{-25001})), -3);
+  EXPECT_EQ(Stored(QENLongCurrency2Currency(TQENLongCurrency{250})), 2);
+  EXPECT_EQ(Stored(QENLongCurrency2Currency(TQENLongCurrency{350})), 4);
+  EXPECT_EQ(Stored(QENLongCurrency2Currency(TQENLongCurrency{-350})), -4);
+  EXPECT_EQ(Stored(QENLongCurrency2Currency(TQENLongCurrency{-349})), -3);
+  EXPECT_EQ(Stored(QENLongCurrency2Currency(TQENLongCurrency{INT64_MIN})), -92233720368547758);
+  EXPECT_EQ(Stored(Currency2QENCurrency(Currency{150})), 2);
+  EXPECT_EQ(Stored(Currency2QENCurrency(Currency{-50})), 0);
+  EXPECT_EQ(Stored(Currency2QENCurrency(Currency{-51})), -1);
+  EXPECT_EQ(Stored(Currency2QENCurrency(Currency{214748364749})), INT32_MAX);
   // 2147483647.5 hundredths rounds to the even 2147483648, one past the range: it wraps.
-  const std::pair<Int64, Int64> currencyToCurr[] = {{150, 2},
-                                                    {-50, 0},
-                                                    {-51, -1},
-                                                    {214748364749, INT32_MAX},
-                                                    {214748364750, INT32_MIN},
-                                                    {-214748364850, INT32_MIN},
-                                                    {-214748364851, INT32_MAX}};
-  for (const auto& [in, out] : currencyToCurr) {
-    EXPECT_EQ(Stored(Currency2QENCurrency(Currency{in})), out) << in;
-  }
+  EXPECT_EQ(Stored(Currency2QENCurrency(Currency{214748364750})), INT32_MIN);
+  EXPECT_EQ(Stored(Currency2QENCurrency(Currency{-214748364850})), INT32_MIN);
+  EXPECT_EQ(Stored(Currency2QENCurrency(Currency{-214748364851})), INT32_MAX);
+  // INT64_MAX / 10000 rounds to 922337203685478 = 0x346DC5D638866, low 32 bits 0x5D638866.
+  EXPECT_EQ(Stored(QENLongCurrency2QENCurrency(TQENLongCurrency{INT64_MAX})), 0x5D638866);
 }
 
 TEST(SameCurrency, ComparesStoredIntegersExactly) {

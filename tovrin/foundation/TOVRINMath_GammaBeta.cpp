@@ -1084,6 +1084,8 @@ namespace detail {
 
 Extended PrecisePower(Extended X, Extended A) {
   if (A == 0.5L) return std::sqrt(X);
+  // |ln X| >= |X - 1| / max(X, 1): beyond the limit by that bound, the logarithm is not needed.
+  if (std::fabs(A * (X - 1.0L)) > kExpLogPowerLimit * std::fmax(X, 1.0L)) return Pow80(X, A);
   const Extended e = A * Ln80(X);
   if (std::fabs(e) <= kExpLogPowerLimit) return Exp80(e);
   return Pow80(X, A);

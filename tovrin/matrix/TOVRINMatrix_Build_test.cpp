@@ -11,15 +11,7 @@
 namespace tovrin {
 namespace {
 
-using testing::ExpectRaises;
-using testing::ExpectRaisesUntouched;
-using testing::Mat;
-template <typename T>
-using Matrix = std::vector<std::vector<T>>;
-using Switch = testing::SwitchGuard<decltype(QENMatrixRectangularCheck), bool>;
-using testing::Rows;
-using testing::SameBits;
-using testing::Values;
+using namespace testing;
 
 // The creators of each element type, so that typed tests can reach the per-type names.
 template <typename T>
@@ -48,37 +40,18 @@ template <typename T>
 class MatrixAllTypes : public ::testing::Test {};
 TYPED_TEST_SUITE(MatrixAllTypes, testing::AllElements);
 
-TYPED_TEST(MatrixAllTypes, CreateGivesZerosOfTheAskedShape) {
+TYPED_TEST(MatrixAllTypes, CreatorsAndRowAndColumnCounts) {
   const auto m = Creators<TypeParam>::Create(2, 3);
   static_assert(std::is_same_v<std::remove_const_t<decltype(m)>, Matrix<TypeParam>>);
   EXPECT_EQ(Values(m), (Rows{{0, 0, 0}, {0, 0, 0}}));
-  EXPECT_TRUE(Creators<TypeParam>::Create(0, 5).empty());
-  EXPECT_EQ(MatrixCols(Creators<TypeParam>::Create(0, 5)), 0);
+  EXPECT_TRUE(Creators<TypeParam>::Create(0, 5).empty() &&
+              Creators<TypeParam>::Identity(0).empty());
   EXPECT_EQ(Values(Creators<TypeParam>::Create(3, 0)), (Rows{{}, {}, {}}));
-}
-
-TYPED_TEST(MatrixAllTypes, IdentityHasOnesOnTheDiagonal) {
   EXPECT_EQ(Values(Creators<TypeParam>::Identity(3)), (Rows{{1, 0, 0}, {0, 1, 0}, {0, 0, 1}}));
-  EXPECT_TRUE(Creators<TypeParam>::Identity(0).empty());
-}
-
-TYPED_TEST(MatrixAllTypes, RowsAndColsLookAtRowZeroOnly) {
-  EXPECT_EQ(MatrixRows(Matrix<TypeParam>{}), 0);
-  EXPECT_EQ(MatrixCols(Matrix<TypeParam>{}), 0);
+  // MatrixRows and MatrixCols look at row 0 only.
+  EXPECT_EQ(MatrixRows(Matrix<TypeParam>{}) + MatrixCols(Matrix<TypeParam>{}), 0);
   const auto ragged = Mat<TypeParam>({{1, 2}, {3}, {4, 5, 6}});
-  EXPECT_EQ(MatrixRows(ragged), 3);
-  EXPECT_EQ(MatrixCols(ragged), 2);
-}
-
-TYPED_TEST(MatrixAllTypes, IsRectangularIgnoresTheSwitch) {
-  for (bool on : {true, false}) {
-    Switch sw(QENMatrixRectangularCheck, on);
-    EXPECT_FALSE(MatrixIsRectangular(Matrix<TypeParam>{}));
-    EXPECT_TRUE(MatrixIsRectangular(Mat<TypeParam>({{}, {}})));
-    EXPECT_TRUE(MatrixIsRectangular(Mat<TypeParam>({{1, 2}, {3, 4}, {5, 6}})));
-    EXPECT_FALSE(MatrixIsRectangular(Mat<TypeParam>({{1, 2}, {3, 4}, {5}})));
-    EXPECT_FALSE(MatrixIsRectangular(Mat<TypeParam>({{1}, {3, 4}})));
-  }
+  EXPECT_EQ(MatrixRows(ragged) * 10 + MatrixCols(ragged), 32);
 }
 
 struct Dims {
@@ -87,52 +60,44 @@ struct Dims {
   bool Rectangular;
   bool operator==(const Dims&) const = default;
 };
-template <typename T>
-Dims DimsOf(const Matrix<T>& M) {
-  Dims d{99, 99, false};
-  MatrixDimensions(M, d.Rows, d.Cols, d.Rectangular);
-  return d;
-}
 
-TYPED_TEST(MatrixAllTypes, DimensionsWithTheSwitchOn) {
-  Switch sw(QENMatrixRectangularCheck, true);
-  EXPECT_EQ(DimsOf(Matrix<TypeParam>{}), (Dims{0, 0, false}));
-  EXPECT_EQ(DimsOf(Mat<TypeParam>({{}, {1}})), (Dims{2, 0, false}));
-  EXPECT_EQ(DimsOf(Mat<TypeParam>({{1, 2}, {3}})), (Dims{2, 0, false}));
-  EXPECT_EQ(DimsOf(Mat<TypeParam>({{1, 2}, {3, 4, 5}})), (Dims{2, 0, false}));
-  EXPECT_EQ(DimsOf(Mat<TypeParam>({{1, 2, 3}, {4, 5, 6}})), (Dims{2, 3, true}));
-  EXPECT_FALSE(MatrixIsSquare(Matrix<TypeParam>{}));
-  EXPECT_TRUE(MatrixIsSquare(Mat<TypeParam>({{1, 2}, {3, 4}})));
-  EXPECT_FALSE(MatrixIsSquare(Mat<TypeParam>({{1, 2}, {3}})));
-  EXPECT_FALSE(MatrixIsSquare(Mat<TypeParam>({{1, 2, 3}, {4, 5, 6}})));
-}
-
-TYPED_TEST(MatrixAllTypes, DimensionsWithTheSwitchOff) {
-  Switch sw(QENMatrixRectangularCheck, false);
-  EXPECT_EQ(DimsOf(Matrix<TypeParam>{}), (Dims{0, 0, true}));
-  EXPECT_EQ(DimsOf(Mat<TypeParam>({{}, {1}})), (Dims{2, 0, true}));
-  EXPECT_EQ(DimsOf(Mat<TypeParam>({{1, 2}, {3}})), (Dims{2, 2, true}));
-  EXPECT_TRUE(MatrixIsSquare(Matrix<TypeParam>{}));
-  EXPECT_TRUE(MatrixIsSquare(Mat<TypeParam>({{1, 2}, {3}})));
-}
-
-TYPED_TEST(MatrixAllTypes, SameDimensions) {
-  const auto a = Mat<TypeParam>({{1, 2, 3}, {4, 5, 6}});
-  const auto b = Mat<TypeParam>({{0, 0, 0}, {0, 0, 0}});
+// MatrixIsRectangular ignores the switch; MatrixDimensions, MatrixIsSquare and
+// MatricesSameDimensions follow it: on, a ragged matrix has no columns and is not rectangular;
+// off, row 0 gives the columns and every matrix counts as rectangular.
+TYPED_TEST(MatrixAllTypes, ShapeQueriesFollowTheSwitch) {
+  using M = Matrix<TypeParam>;
+  const M none, blank = Mat<TypeParam>({{}, {1}}), shortRow = Mat<TypeParam>({{1, 2}, {3}});
+  const M longRow = Mat<TypeParam>({{1, 2}, {3, 4, 5}}),
+          wide = Mat<TypeParam>({{1, 2, 3}, {4, 5, 6}});
+  const M square = Mat<TypeParam>({{1, 2}, {3, 4}});
+  const struct {
+    const M& m;
+    bool on, rectangular, isSquare;
+    Dims dims;
+  } cases[] = {
+      {none, true, false, false, {0, 0, false}},     {blank, true, false, false, {2, 0, false}},
+      {shortRow, true, false, false, {2, 0, false}}, {longRow, true, false, false, {2, 0, false}},
+      {wide, true, true, false, {2, 3, true}},       {square, true, true, true, {2, 2, true}},
+      {none, false, false, true, {0, 0, true}},      {blank, false, false, false, {2, 0, true}},
+      {shortRow, false, false, true, {2, 2, true}}};
+  for (const auto& c : cases) {
+    MatrixSwitch sw(QENMatrixRectangularCheck, c.on);
+    Dims d{99, 99, !c.dims.Rectangular};
+    MatrixDimensions(c.m, d.Rows, d.Cols, d.Rectangular);
+    EXPECT_EQ(d, c.dims) << c.on;
+    EXPECT_EQ(MatrixIsRectangular(c.m), c.rectangular) << c.on;
+    EXPECT_EQ(MatrixIsSquare(c.m), c.isSquare) << c.on;
+  }
+  EXPECT_TRUE(MatrixIsRectangular(Mat<TypeParam>({{}, {}})));
   const auto ragged = Mat<TypeParam>({{1, 2, 3}, {4, 5}});
   {
-    Switch sw(QENMatrixRectangularCheck, true);
-    EXPECT_TRUE(MatricesSameDimensions(a, b));
-    EXPECT_FALSE(MatricesSameDimensions(a, ragged));
-    EXPECT_FALSE(MatricesSameDimensions(ragged, ragged));
-    EXPECT_FALSE(MatricesSameDimensions(a, Mat<TypeParam>({{1, 2}, {3, 4}})));
-    EXPECT_FALSE(MatricesSameDimensions(Matrix<TypeParam>{}, Matrix<TypeParam>{}));
+    MatrixSwitch sw(QENMatrixRectangularCheck, true);
+    EXPECT_TRUE(MatricesSameDimensions(wide, Mat<TypeParam>({{0, 0, 0}, {0, 0, 0}})));
+    EXPECT_FALSE(MatricesSameDimensions(wide, ragged) || MatricesSameDimensions(ragged, ragged));
+    EXPECT_FALSE(MatricesSameDimensions(wide, square) || MatricesSameDimensions(none, none));
   }
-  {
-    Switch sw(QENMatrixRectangularCheck, false);
-    EXPECT_TRUE(MatricesSameDimensions(a, ragged));
-    EXPECT_TRUE(MatricesSameDimensions(Matrix<TypeParam>{}, Matrix<TypeParam>{}));
-  }
+  MatrixSwitch sw(QENMatrixRectangularCheck, false);
+  EXPECT_TRUE(MatricesSameDimensions(wide, ragged) && MatricesSameDimensions(none, none));
 }
 
 TYPED_TEST(MatrixAllTypes, ToFloatMatrixKeepsTheShapeAndTheValues) {
@@ -141,7 +106,7 @@ TYPED_TEST(MatrixAllTypes, ToFloatMatrixKeepsTheShapeAndTheValues) {
   EXPECT_EQ(Values(f), (Rows{{1, 2}, {}, {3, 4, 5}}));
   EXPECT_TRUE(Matrix2FloatMatrix(Matrix<TypeParam>{}).empty());
   // The extreme values of the type are held exactly.
-  using V = testing::ValueOf<TypeParam>;
+  using V = ValueOf<TypeParam>;
   const Matrix<TypeParam> extremes{
       {TypeParam(std::numeric_limits<V>::max()), TypeParam(std::numeric_limits<V>::lowest())}};
   const TQENFloatMatrix g = Matrix2FloatMatrix(extremes);
@@ -178,7 +143,7 @@ TYPED_TEST(MatrixArithmetic, TwoMatrixChecksInOrder) {
   const auto emptyFirstRow = Mat<TypeParam>({{}, {1, 2}});
   // An M1 without rows has no row 0 to read: access violation, before anything else.
   for (bool on : {true, false}) {
-    Switch sw(QENMatrixRectangularCheck, on);
+    MatrixSwitch sw(QENMatrixRectangularCheck, on);
     EXPECT_THROW(AddMatrices(none, a), EAccessViolation);
     EXPECT_THROW(SubtractMatrices(none, none), EAccessViolation);
     M target;
@@ -198,14 +163,14 @@ TYPED_TEST(MatrixArithmetic, TwoMatrixChecksInOrder) {
     });
   }
   {
-    Switch sw(QENMatrixRectangularCheck, true);
+    MatrixSwitch sw(QENMatrixRectangularCheck, true);
     ExpectRaises(rsSameDimensions, [&] { AddMatrices(ragged, ragged); });
     ExpectRaisesUntouched(rsSameDimensions, a, [&](M& m) { AddToMatrix(m, ragged); });
     ExpectRaisesUntouched(rsSameDimensions, ragged, [&](M& m) { AddToMatrix(m, a); });
   }
   {
     // Without the switch the shape is row 0's; a short row is never read past its end.
-    Switch sw(QENMatrixRectangularCheck, false);
+    MatrixSwitch sw(QENMatrixRectangularCheck, false);
     ExpectRaises(rsMatrixRect, [&] { AddMatrices(ragged, a); });
     ExpectRaises(rsMatrixRect, [&] { SubtractMatrices(a, ragged); });
     ExpectRaisesUntouched(rsMatrixRect, ragged, [&](M& m) { AddToMatrix(m, a); });
@@ -222,7 +187,7 @@ TYPED_TEST(MatrixArithmetic, TwoMatrixChecksInOrder) {
 
 TYPED_TEST(MatrixArithmetic, ScalarArithmeticKeepsRaggedShapes) {
   using M = Matrix<TypeParam>;
-  Switch sw(QENMatrixRectangularCheck, true);
+  MatrixSwitch sw(QENMatrixRectangularCheck, true);
   const auto ragged = Mat<TypeParam>({{1, 2}, {3}, {}});
   EXPECT_EQ(Values(MultiplyMatrixByConst(ragged, 2)), (Rows{{2, 4}, {6}, {}}));
   auto m = ragged;
@@ -249,38 +214,18 @@ TYPED_TEST(MatrixArithmetic, GrandMean) {
   ExpectRaises(rsMatrixIsEmpty, [&] { GrandMean(Mat<TypeParam>({{}, {}}), n); });
 }
 
-// --- Integer wrap-around ---
+// --- Type rules the matrices alone use ---
+// (Sums, differences and linear transforms follow the element rules the vector tests check.)
 
-TEST(MatrixIntegerArithmetic, LongIntWraps) {
+TEST(MatrixIntegerArithmetic, ProductsByAConstantWrapAndTheGrandMeanDoesNot) {
   const LongInt hi = std::numeric_limits<LongInt>::max();
   const LongInt lo = std::numeric_limits<LongInt>::min();
   EXPECT_EQ(MultiplyMatrixByConst(TQENLIntMatrix{{hi}}, 2), (TQENLIntMatrix{{-2}}));
-  EXPECT_EQ(AddMatrices(TQENLIntMatrix{{hi, lo}}, TQENLIntMatrix{{1, -1}}),
-            (TQENLIntMatrix{{lo, hi}}));
-  EXPECT_EQ(SubtractMatrices(TQENLIntMatrix{{lo}}, TQENLIntMatrix{{1}}), (TQENLIntMatrix{{hi}}));
-  TQENLIntMatrix m{{65536}};
-  LinearTransformMatrix(m, 65536, 5);  // 2^32 + 5 wraps to 5
-  EXPECT_EQ(m, (TQENLIntMatrix{{5}}));
-  m = {{lo}};
+  TQENLIntMatrix m{{lo}};
   MultiplyMatrixByConst2(m, -1);
   EXPECT_EQ(m, (TQENLIntMatrix{{lo}}));
-}
-
-TEST(MatrixIntegerArithmetic, Int64Wraps) {
-  const Int64 hi = std::numeric_limits<Int64>::max();
-  const Int64 lo = std::numeric_limits<Int64>::min();
-  EXPECT_EQ(MultiplyMatrixByConst(TQENInt64Matrix{{hi}}, 2), (TQENInt64Matrix{{-2}}));
-  TQENInt64Matrix m{{hi}};
-  AddToMatrix(m, TQENInt64Matrix{{1}});
-  EXPECT_EQ(m, (TQENInt64Matrix{{lo}}));
-  SubtractFromMatrix(m, TQENInt64Matrix{{1}});
-  EXPECT_EQ(m, (TQENInt64Matrix{{hi}}));
-  m = {{Int64{1} << 32}};
-  LinearTransformMatrix(m, Int64{1} << 32, -1);  // 2^64 - 1 wraps to -1
-  EXPECT_EQ(m, (TQENInt64Matrix{{-1}}));
-}
-
-TEST(MatrixIntegerArithmetic, GrandMeanOfLargeInt64DoesNotWrap) {
+  EXPECT_EQ(MultiplyMatrixByConst(TQENInt64Matrix{{std::numeric_limits<Int64>::max()}}, 2),
+            (TQENInt64Matrix{{-2}}));
   LongWord n = 0;
   const Int64 big = Int64{1} << 62;
   EXPECT_EQ(GrandMean(TQENInt64Matrix{{big, big, big}}, n), static_cast<long double>(big));
@@ -343,7 +288,7 @@ TYPED_TEST(MatrixElementWise, Values) {
 TYPED_TEST(MatrixElementWise, FailuresStopWhereTheyAreWithoutRollBack) {
   using M = Matrix<TypeParam>;
   for (bool on : {true, false}) {
-    Switch sw(QENMatrixRectangularCheck, on);
+    MatrixSwitch sw(QENMatrixRectangularCheck, on);
     auto m = Mat<TypeParam>({{4, -1, 9}});
     ExpectRaises(rsMatrixNeg, [&] { SqrtMatrix(m); });
     EXPECT_EQ(Values(m), (Rows{{2, -1, 9}}));

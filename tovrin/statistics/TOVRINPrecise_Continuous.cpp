@@ -4,50 +4,27 @@
 #include <limits>
 #include <utility>
 
-#include "tovrin/foundation/TOVRINErrors.h"
-#include "tovrin/foundation/TOVRINMath.h"
-#include "tovrin/foundation/detail/Elementary.h"
-#include "tovrin/foundation/detail/IncompleteTails.h"
-#include "tovrin/statistics/TOVRINPrecise.h"
 #include "tovrin/statistics/TOVRINStatistics_Continuous.h"
-#include "tovrin/statistics/detail/PairArithmetic.h"
+#include "tovrin/statistics/detail/PreciseCommon.h"
 
 namespace tovrin::precise {
 namespace {
 
+using namespace common;  // NOLINT: the family's shared names
 using detail::Exp80;
 using detail::Ln80;
-using detail::Pair;
-using detail::RaiseMathError;
-using detail::Tails;
 
-constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
-constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
 // 1/sqrt(2) as hi + lo, 1/sqrt(2 pi) and 2/sqrt(pi).
 constexpr Extended kInvSqrt2 = 0.707106781186547524381894036516L;
 constexpr Extended kInvSqrt2Lo = 1.895032558893257079655062e-20L;
 constexpr Extended kInvSqrt2Pi = 0.398942280401432677939946059934381868L;
 constexpr Extended kTwoOverSqrtPi = 1.12837916709551257389615890312154517L;
 
-// --- Checks, as the classic functions make them ---------------------------------------------
+// --- Checks, as the classic functions make them (detail/DistributionChecks.h) ---------------
 
-void CheckStdDev(Extended StdDev) {
-  if (!FloatIsPositive(StdDev)) RaiseMathError(rsStdDev);
-}
-void CheckInverseStdDev(Extended StdDev) {
-  if (FloatIsZero(StdDev) || FloatIsNegative(StdDev)) RaiseMathError(rsStdDev);
-}
-void CheckOpenProbability(Extended P) {
-  if (!(P > 0 && P < 1)) RaiseMathError(rsValue01);
-}
-void CheckClosedProbability(Extended P) {
-  if (!(P >= 0 && P <= 1)) RaiseMathError(rsValue01Inc);
-}
+// Degrees of freedom are Extended here.
 void CheckDF(Extended DF) {
   if (!(DF > 0)) RaiseMathError(rsDF);
-}
-void CheckBetaShapes(Extended A, Extended B) {
-  if (!(A > 0) || !(B > 0)) RaiseMathError(rsValueGZero);
 }
 
 // --- Normal tails -----------------------------------------------------------------------------
@@ -634,63 +611,77 @@ Extended ExponentialPDF(Extended X, Extended Mean) {
 
 // === Beta =======================================================================================
 
-Extended BetaDistLess(Extended X, Extended A, Extended B) {
+namespace {
+// The point (x, 1 - x) after the checks: X on [0, 1] (width 1), or X mapped from
+// [Lower, Upper] (the width of the interval).
+struct BetaPoint {
+  std::pair<Pair, Pair> xy;
+  Extended width;
+};
+BetaPoint CheckedBetaPoint(Extended X, Extended A, Extended B) {
   CheckBetaShapes(A, B);
-  return BetaDistTails(UnitPoint(X), A, B).lower;
+  return {UnitPoint(X), 1.0L};
+}
+BetaPoint CheckedBetaPoint(Extended X, Extended A, Extended B, Extended Lower, Extended Upper) {
+  const auto [low, high] = BetaInterval(Lower, Upper);
+  CheckBetaShapes(A, B);
+  return {IntervalPoint(X, low, high), high - low};
+}
+
+// The root with P below it (above it for Greater) after the checks, on [0, 1] or mapped to
+// [Lower, Upper] from whichever end is nearer.
+detail::BetaRoot CheckedBetaRoot(Extended P, Extended A, Extended B, bool greater) {
+  CheckClosedProbability(P);
+  CheckBetaShapes(A, B);
+  return greater ? BetaRoot(1.0L - P, P, A, B) : BetaRoot(P, 1.0L - P, A, B);
+}
+Extended CheckedBetaRoot(Extended P, Extended A, Extended B, Extended Lower, Extended Upper,
+                         bool greater) {
+  const auto [low, high] = BetaInterval(Lower, Upper);
+  const detail::BetaRoot r = CheckedBetaRoot(P, A, B, greater);
+  return r.x <= 0.5L ? low + (high - low) * r.x : high - (high - low) * r.y;
+}
+}  // namespace
+
+Extended BetaDistLess(Extended X, Extended A, Extended B) {
+  return BetaDistTails(CheckedBetaPoint(X, A, B).xy, A, B).lower;
 }
 
 Extended BetaDistLess(Extended X, Extended A, Extended B, Extended Lower, Extended Upper) {
-  const auto [low, high] = BetaInterval(Lower, Upper);
-  CheckBetaShapes(A, B);
-  return BetaDistTails(IntervalPoint(X, low, high), A, B).lower;
+  return BetaDistTails(CheckedBetaPoint(X, A, B, Lower, Upper).xy, A, B).lower;
 }
 
 Extended BetaDistGreater(Extended X, Extended A, Extended B) {
-  CheckBetaShapes(A, B);
-  return BetaDistTails(UnitPoint(X), A, B).upper;
+  return BetaDistTails(CheckedBetaPoint(X, A, B).xy, A, B).upper;
 }
 
 Extended BetaDistGreater(Extended X, Extended A, Extended B, Extended Lower, Extended Upper) {
-  const auto [low, high] = BetaInterval(Lower, Upper);
-  CheckBetaShapes(A, B);
-  return BetaDistTails(IntervalPoint(X, low, high), A, B).upper;
+  return BetaDistTails(CheckedBetaPoint(X, A, B, Lower, Upper).xy, A, B).upper;
 }
 
 Extended InvBetaDistLess(Extended P, Extended A, Extended B) {
-  CheckClosedProbability(P);
-  CheckBetaShapes(A, B);
-  return BetaRoot(P, 1.0L - P, A, B).x;
+  return CheckedBetaRoot(P, A, B, false).x;
 }
 
 Extended InvBetaDistLess(Extended P, Extended A, Extended B, Extended Lower, Extended Upper) {
-  const auto [low, high] = BetaInterval(Lower, Upper);
-  const detail::BetaRoot r =
-      (CheckClosedProbability(P), CheckBetaShapes(A, B), BetaRoot(P, 1.0L - P, A, B));
-  return r.x <= 0.5L ? low + (high - low) * r.x : high - (high - low) * r.y;
+  return CheckedBetaRoot(P, A, B, Lower, Upper, false);
 }
 
 Extended InvBetaDistGreater(Extended P, Extended A, Extended B) {
-  CheckClosedProbability(P);
-  CheckBetaShapes(A, B);
-  return BetaRoot(1.0L - P, P, A, B).x;
+  return CheckedBetaRoot(P, A, B, true).x;
 }
 
 Extended InvBetaDistGreater(Extended P, Extended A, Extended B, Extended Lower, Extended Upper) {
-  const auto [low, high] = BetaInterval(Lower, Upper);
-  const detail::BetaRoot r =
-      (CheckClosedProbability(P), CheckBetaShapes(A, B), BetaRoot(1.0L - P, P, A, B));
-  return r.x <= 0.5L ? low + (high - low) * r.x : high - (high - low) * r.y;
+  return CheckedBetaRoot(P, A, B, Lower, Upper, true);
 }
 
 Extended BetaPDF(Extended X, Extended A, Extended B) {
-  CheckBetaShapes(A, B);
-  return BetaDensityAt(UnitPoint(X), A, B);
+  return BetaDensityAt(CheckedBetaPoint(X, A, B).xy, A, B);
 }
 
 Extended BetaPDF(Extended X, Extended A, Extended B, Extended Lower, Extended Upper) {
-  const auto [low, high] = BetaInterval(Lower, Upper);
-  CheckBetaShapes(A, B);
-  return BetaDensityAt(IntervalPoint(X, low, high), A, B) / (high - low);
+  const BetaPoint point = CheckedBetaPoint(X, A, B, Lower, Upper);
+  return BetaDensityAt(point.xy, A, B) / point.width;
 }
 
 }  // namespace tovrin::precise

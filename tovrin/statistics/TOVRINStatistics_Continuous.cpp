@@ -6,10 +6,13 @@
 #include <limits>
 #include <utility>
 
+#include "tovrin/statistics/detail/DistributionChecks.h"
+
 namespace tovrin {
 namespace {
 
 using detail::RaiseMathError;
+using namespace detail::checks;  // NOLINT: the checks shared with the precise family
 
 constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
 constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
@@ -42,25 +45,9 @@ void EmptyTable(TQENFloatVector& XValues, TQENFloatVector& YValues) {
 
 // --- Checks -----------------------------------------------------------------------------------
 
-void CheckStdDev(Extended StdDev) {
-  if (!FloatIsPositive(StdDev)) RaiseMathError(rsStdDev);
-}
-// The inverses reject a standard deviation that is zero within the tolerance or negative, so
-// QENTolerance itself passes here while CheckStdDev rejects it (and a NaN gives NaN).
-void CheckInverseStdDev(Extended StdDev) {
-  if (FloatIsZero(StdDev) || FloatIsNegative(StdDev)) RaiseMathError(rsStdDev);
-}
-void CheckOpenProbability(Extended P) {
-  if (!(P > 0 && P < 1)) RaiseMathError(rsValue01);
-}
-void CheckClosedProbability(Extended P) {
-  if (!(P >= 0 && P <= 1)) RaiseMathError(rsValue01Inc);
-}
+// The rest are in detail/DistributionChecks.h.
 void CheckDF(LongWord DF) {
   if (DF == 0) RaiseMathError(rsDF);
-}
-void CheckBetaShapes(Extended A, Extended B) {
-  if (!(A > 0) || !(B > 0)) RaiseMathError(rsValueGZero);
 }
 
 // --- Beta density, shared by the beta and F densities ------------------------------------------

@@ -11,11 +11,7 @@
 namespace tovrin {
 namespace {
 
-using testing::ExpectRaises;
-using testing::ExpectRaisesUntouched;
-using testing::Values;
-using testing::Vec;
-using L = std::vector<Extended>;
+using namespace testing;
 
 template <typename T>
 class FloatTransform : public ::testing::Test {};
@@ -25,14 +21,14 @@ TYPED_TEST(FloatTransform, ValuesAndChecksBeforeAnyWrite) {
   using V = std::vector<TypeParam>;
   auto v = Vec<TypeParam>({4, 0.25, 16});
   SqrtVector(v);
-  EXPECT_EQ(Values(v), (L{2, 0.5, 4}));
+  EXPECT_EQ(Values(v), (Row{2, 0.5, 4}));
   InvVector(v);
-  EXPECT_EQ(Values(v), (L{0.5, 2, 0.25}));
+  EXPECT_EQ(Values(v), (Row{0.5, 2, 0.25}));
   SquareVector(v);
-  EXPECT_EQ(Values(v), (L{0.25, 4, 0.0625}));
+  EXPECT_EQ(Values(v), (Row{0.25, 4, 0.0625}));
   auto twos = Vec<TypeParam>({8, 0.5, 1024});
   Log2Vector(twos);
-  EXPECT_EQ(Values(twos), (L{3, -1, 10}));
+  EXPECT_EQ(Values(twos), (Row{3, -1, 10}));
   auto logs = Vec<TypeParam>({1, 100, 7.38905609893065022723L});
   auto lns = logs;
   Log10Vector(logs);
@@ -42,7 +38,7 @@ TYPED_TEST(FloatTransform, ValuesAndChecksBeforeAnyWrite) {
   EXPECT_NEAR(double(Values(lns)[2]), 2, 1e-6);
   auto m = Vec<TypeParam>({0, 1, -4});
   LinearTransformVector(m, 2, 1);
-  EXPECT_EQ(Values(m), (L{1, 3, -7}));
+  EXPECT_EQ(Values(m), (Row{1, 3, -7}));
   ExpectRaisesUntouched(rsVectorNeg, Vec<TypeParam>({4, -1, 9}), [](V& x) { SqrtVector(x); });
   ExpectRaisesUntouched(rsVectorZero, Vec<TypeParam>({2, 0, 5}), [](V& x) { InvVector(x); });
   const auto p = Vec<TypeParam>({3, 1, 0});
@@ -109,7 +105,7 @@ TEST(TransformVector, FunctionsLambdasAndChecks) {
   Extended offset = 0.25L;
   TQENFloatVector g{1, 2};
   TransformVector(g, [offset](Extended x) { return x + offset; });
-  EXPECT_EQ(Values(g), (L{1.25, 2.25}));
+  EXPECT_EQ(Values(g), (Row{1.25, 2.25}));
   int calls = 0;
   TQENSingleVector empty;
   ExpectRaises(rsVectorIsEmpty,
@@ -125,14 +121,14 @@ TYPED_TEST_SUITE(WholeVector, testing::RuleElements);
 
 TYPED_TEST(WholeVector, FillClearReverseCopyAndMagnitude) {
   auto v = Vec<TypeParam>({1, 2, 3});
-  EXPECT_EQ(Values(ReverseVector(v)), (L{3, 2, 1}));
+  EXPECT_EQ(Values(ReverseVector(v)), (Row{3, 2, 1}));
   auto copy = CopyVector(v);
   EXPECT_NE(copy.data(), v.data());
   FillVector(v, 7);
-  EXPECT_EQ(Values(v), (L{7, 7, 7}));
-  EXPECT_EQ(Values(copy), (L{1, 2, 3}));
+  EXPECT_EQ(Values(v), (Row{7, 7, 7}));
+  EXPECT_EQ(Values(copy), (Row{1, 2, 3}));
   ClearVector(v);
-  EXPECT_EQ(Values(v), (L{0, 0, 0}));
+  EXPECT_EQ(Values(v), (Row{0, 0, 0}));
   std::vector<TypeParam> empty;
   FillVector(empty, 1);
   EXPECT_TRUE(empty.empty() && ReverseVector(empty).empty() && CopyVector(empty).empty());
@@ -151,19 +147,20 @@ TEST(MovingAverage, WindowsOffsetsAndCheckOrder) {
   const TQENDoubleVector v{1, 2, 3, 4, 5};
   const struct {
     LongWord window, offset;
-    L expected;
+    Row expected;
   } cases[] = {{3, 0, {2, 3, 4, 0, 0}},        {3, 2, {0, 0, 2, 3, 4}}, {3, 1, {0, 2, 3, 4, 0}},
                {3, 9, {0, 0, 2, 3, 4}},        {5, 0, {3, 0, 0, 0, 0}}, {1, 4, {1, 2, 3, 4, 5}},
                {2, 0, {1.5, 2.5, 3.5, 4.5, 0}}};
   for (const auto& c : cases) EXPECT_EQ(Values(MovingAverage(v, c.window, c.offset)), c.expected);
-  EXPECT_EQ(Values(MovingAverage(TQENSingleVector{1, 2}, 2, 0)), (L{1.5, 0}));
+  EXPECT_EQ(Values(MovingAverage(TQENSingleVector{1, 2}, 2, 0)), (Row{1.5, 0}));
   ExpectRaises(rsVectorIsEmpty, [] { MovingAverage(TQENFloatVector{}, 0, 0); });
   ExpectRaises(rsValueNotZero, [&] { MovingAverage(v, 0, 0); });
   ExpectRaises(rsInvalidValue, [&] { MovingAverage(v, 6, 0); });
   ExpectRaises(rsInvalidValue, [&] { MovingAverage(v, 4294967295u, 0); });
   // Each window is summed afresh in Extended: 2^70 + 1 rounds to 2^70, so a running total
   // would give the window [1, 1] the sum 1; and 2^53 + 3 is no Double.
-  EXPECT_EQ(Values(MovingAverage(TQENFloatVector{0x1p70L, 1, 1, 1}, 2, 0)), (L{0x1p69L, 1, 1, 0}));
+  EXPECT_EQ(Values(MovingAverage(TQENFloatVector{0x1p70L, 1, 1, 1}, 2, 0)),
+            (Row{0x1p69L, 1, 1, 0}));
   EXPECT_EQ(MovingAverage(TQENDoubleVector{0x1p53, 3}, 2, 0)[0], 0x1p52 + 2);
 }
 
@@ -175,12 +172,12 @@ TYPED_TEST(TwoVectors, SumsDifferencesAndLengths) {
   using V = std::vector<TypeParam>;
   const auto a = Vec<TypeParam>({1, 2, -3});
   const auto b = Vec<TypeParam>({10, 20, 30});
-  EXPECT_EQ(Values(AddVectors(a, b)), (L{11, 22, 27}));
-  EXPECT_EQ(Values(SubtractVectors(a, b)), (L{-9, -18, -33}));
+  EXPECT_EQ(Values(AddVectors(a, b)), (Row{11, 22, 27}));
+  EXPECT_EQ(Values(SubtractVectors(a, b)), (Row{-9, -18, -33}));
   auto c = a;
   AddToVector(c, b);
   SubtractFromVector(c, a);
-  EXPECT_EQ(Values(c), (L{10, 20, 30}));
+  EXPECT_EQ(Values(c), (Row{10, 20, 30}));
   EXPECT_TRUE(AddVectors(V{}, V{}).empty());
   const auto three = Vec<TypeParam>({1, 2, 3});
   ExpectRaises(rsSameDimensions, [&] { AddVectors(b, V{1}); });
@@ -239,10 +236,10 @@ TEST(Products, TypeRules) {
 
 TEST(Conversions, WidenExactlyBySignedness) {
   const Double d[] = {0.1, -2.5};
-  EXPECT_EQ(Values(Array2FloatVector(std::span<const Double>(d))), (L{Extended(0.1), -2.5L}));
-  EXPECT_EQ(Values(Vector2FloatVector(TQENInt64Vector{INT64_MAX})), (L{0x1p63L - 1}));
-  EXPECT_EQ(Values(Vector2FloatVector(TQENLWordVector{4294967295u})), (L{4294967295.0L}));
-  EXPECT_EQ(Values(Vector2FloatVector(TQENSIntVector{-128})), (L{-128}));
+  EXPECT_EQ(Values(Array2FloatVector(std::span<const Double>(d))), (Row{Extended(0.1), -2.5L}));
+  EXPECT_EQ(Values(Vector2FloatVector(TQENInt64Vector{INT64_MAX})), (Row{0x1p63L - 1}));
+  EXPECT_EQ(Values(Vector2FloatVector(TQENLWordVector{4294967295u})), (Row{4294967295.0L}));
+  EXPECT_EQ(Values(Vector2FloatVector(TQENSIntVector{-128})), (Row{-128}));
   EXPECT_TRUE(Array2FloatVector(std::span<const Byte>()).empty());
   const LongWord lw[] = {4294967295u, 0};
   EXPECT_EQ(Array2Int64Vector(std::span<const LongWord>(lw)), (TQENInt64Vector{4294967295, 0}));

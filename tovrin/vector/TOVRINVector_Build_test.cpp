@@ -9,10 +9,7 @@
 namespace tovrin {
 namespace {
 
-using testing::ExpectRaises;
-using testing::Values;
-using testing::Vec;
-using L = std::vector<Extended>;
+using namespace testing;
 
 template <typename T>
 class VectorBuild : public ::testing::Test {};
@@ -22,11 +19,11 @@ TYPED_TEST(VectorBuild, AppendInsertAndDelete) {
   std::vector<TypeParam> v;
   AppendValue2Vector(v, 4);
   AppendValue2Vector(v, 9);
-  EXPECT_EQ(Values(v), (L{4, 9}));
+  EXPECT_EQ(Values(v), (Row{4, 9}));
   // An index inside 0..size inserts there; any other appends.
   const struct {
     LongInt index;
-    L expected;
+    Row expected;
   } cases[] = {{0, {7, 1, 2}},       {1, {1, 7, 2}},
                {2, {1, 2, 7}},       {-1, {1, 2, 7}},
                {1000000, {1, 2, 7}}, {std::numeric_limits<LongInt>::min(), {1, 2, 7}}};
@@ -37,10 +34,10 @@ TYPED_TEST(VectorBuild, AppendInsertAndDelete) {
   }
   std::vector<TypeParam> empty;
   AddValue2Vector(empty, 7, -5);
-  EXPECT_EQ(Values(empty), (L{7}));
+  EXPECT_EQ(Values(empty), (Row{7}));
   auto d = Vec<TypeParam>({1, 2, 3});
   for (LongInt index : {0, 2, -1}) DeleteValueFromVector(d, index);  // the last two are outside
-  EXPECT_EQ(Values(d), (L{2, 3}));
+  EXPECT_EQ(Values(d), (Row{2, 3}));
   DeleteValueFromVector(d, 1);
   DeleteValueFromVector(d, 0);
   EXPECT_TRUE(d.empty());

@@ -16,10 +16,7 @@
 namespace tovrin {
 namespace {
 
-using testing::SameBits;
-using testing::Values;
-using testing::Vec;
-using L = std::vector<Extended>;
+using namespace testing;
 
 template <typename T>
 class Sort : public ::testing::Test {};
@@ -34,7 +31,7 @@ TYPED_TEST(Sort, AgreesWithStdSort) {
       std::vector<TypeParam> v;
       std::uniform_int_distribution<int> pick(0, spread);
       for (int i = 0; i < size; ++i) v.push_back(TypeParam(pick(gen)));
-      L expected = Values(v);
+      Row expected = Values(v);
       std::sort(expected.begin(), expected.end());
       QSortVector(v, true);
       EXPECT_EQ(Values(v), expected) << size;
@@ -48,7 +45,7 @@ TYPED_TEST(Sort, AgreesWithStdSort) {
 TEST(Sort, OrdersExactlyAndKeepsNaNs) {
   TQENFloatVector v{1.0L + 0x1p-63L, 1.0L, -0x1p-16000L, 0.0L};
   QSortVector(v, true);
-  EXPECT_EQ(Values(v), (L{-0x1p-16000L, 0.0L, 1.0L, 1.0L + 0x1p-63L}));
+  EXPECT_EQ(Values(v), (Row{-0x1p-16000L, 0.0L, 1.0L, 1.0L + 0x1p-63L}));
   TQENInt64Vector w{INT64_MAX, INT64_MIN, 0, -1};
   QSortVector(w, false);
   EXPECT_EQ(w, (TQENInt64Vector{INT64_MAX, 0, -1, INT64_MIN}));
@@ -270,8 +267,7 @@ TEST(Rank, MatchesTheFirstMatchScan) {
     using T = typename decltype(v)::value_type;
     for (std::size_t i = 0; i < n; ++i) {
       const long double c = centres[centre(gen)];
-      v.push_back(
-          static_cast<testing::ValueOf<T>>(c + nudge(gen) * step * std::max(1.0L, std::fabs(c))));
+      v.push_back(static_cast<ValueOf<T>>(c + nudge(gen) * step * std::max(1.0L, std::fabs(c))));
     }
     return v;
   };
