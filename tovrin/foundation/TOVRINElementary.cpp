@@ -75,8 +75,8 @@ struct TwoPart {
   const Extended r = rHi + rLo;
   const Extended r2 = r * r;
   // (Coefficients in double where their rounding is far below the result's.)
-  const Extended q = r2 * (0.5L + r * (1.0 / 6)) +
-                     r2 * r2 * ((1.0 / 24) + r * (1.0 / 120) + r2 * (1.0 / 720));
+  const Extended q =
+      r2 * (0.5L + r * (1.0 / 6)) + r2 * r2 * ((1.0 / 24) + r * (1.0 / 120) + r2 * (1.0 / 720));
   const Extended p = rHi + (rLo + q);  // e^r - 1
   const auto j = static_cast<int>(n & 255);
   const auto m = static_cast<int>(n >> 8);
@@ -114,8 +114,7 @@ struct LnReduced {
   const Extended r = LnTableR[j];
   // m = mHi + mLo, 32 bits each: mHi r and mLo r are exact, and so is mHi r - 1.
   const Extended mHi = static_cast<Extended>(static_cast<std::int64_t>(s >> 32)) * 0x1p-31L;
-  const Extended mLo =
-      static_cast<Extended>(static_cast<std::int64_t>(s & 0xFFFFFFFFu)) * 0x1p-63L;
+  const Extended mLo = static_cast<Extended>(static_cast<std::int64_t>(s & 0xFFFFFFFFu)) * 0x1p-63L;
   const Extended a = mHi * r - 1;
   const Extended b = mLo * r;
   // Fast two-sum: |a| >= |b| whenever a + b is inexact.
@@ -128,7 +127,9 @@ struct LnReduced {
 [[gnu::always_inline]] inline Extended LnHead(const LnReduced& q) {
   return static_cast<Extended>(q.k) * Ln2Hi + LnTableHi[q.j];  // (not in double)
 }
-[[gnu::always_inline]] inline Extended LnTail(const LnReduced& q) { return q.k * Ln2Lo + LnTableLo[q.j]; }
+[[gnu::always_inline]] inline Extended LnTail(const LnReduced& q) {
+  return q.k * Ln2Lo + LnTableLo[q.j];
+}
 
 // ln x = hi + lo with a relative error of about 2^-85, for a positive finite x.
 [[gnu::always_inline]] inline TwoPart LnTwoPart(Extended x) {
@@ -144,10 +145,9 @@ struct LnReduced {
   const Extended halfLo = ts.lo * (ts.hi + ts.lo * 0.5L);
   const Extended s2 = s - half;
   const Extended e2 = (s - s2) - half;
-  const Extended p3 =
-      t * t2 *
-      ((1.0L / 3) - t * 0.25L + t2 * (0.2 - t * (1.0 / 6)) +
-       t2 * t2 * ((1.0 / 7) - t * 0.125L + t2 * ((1.0 / 9) - t * 0.1)));
+  const Extended p3 = t * t2 *
+                      ((1.0L / 3) - t * 0.25L + t2 * (0.2 - t * (1.0 / 6)) +
+                       t2 * t2 * ((1.0 / 7) - t * 0.125L + t2 * ((1.0 / 9) - t * 0.1)));
   // ln(1 + t + tl) = t + tl - t^2/2 - t tl + t^3/3 ...
   const Extended lo = e + e2 + ((q.tl * (1 - t) - halfLo + LnTail(q)) + p3);
   const Extended hi = s2 + lo;

@@ -43,12 +43,29 @@ Extended NormalUpper(const Pair& z) {
   return 0.5L * e;
 }
 
-// e^(-z^2 / 2) for z = hi + lo, with z^2 carried exactly (its rounding would cost z^2 / 2 units
-// in the last place); 0 beyond |z| = 152, where it is below the smallest subnormal.
+// The upper half (32 bits) of x for |x| <= 2^8000 (Veltkamp's split): products of two such
+// halves are exact, and x minus its half is exact too.
+Extended UpperHalf(Extended x) {
+  const Extended t = 4294967297.0L * x;  // 2^32 + 1
+  return t - (t - x);
+}
+
+// e^(-z^2 / 2) for z = h + l with h of 32 bits and |l| < 2^-31 |h|: z^2 = h^2 + (2 h + l) l,
+// the first term exact, the sum renormalised for Exp80 (the rounding of z^2 in one piece would
+// cost z^2 / 2 units in the last place).
+Extended ExpMinusHalfSquareOfHalves(Extended h, Extended l) {
+  const Extended h2 = h * h;
+  const Extended rest = (h + h + l) * l;
+  const Extended s = h2 + rest;
+  return Exp80(-0.5L * s, -0.5L * (rest - (s - h2)));
+}
+
+// e^(-z^2 / 2) for z = hi + lo (|lo| a few units in the last place of hi); 0 beyond |z| = 152,
+// where it is below the smallest subnormal.
 Extended ExpMinusHalfSquare(Extended hi, Extended lo) {
   if (!(std::fabs(hi) < 152.0L)) return std::isnan(hi) ? kNaN : 0.0L;
-  const Pair s = detail::ExactProduct(hi, hi);
-  return Exp80(-0.5L * s.hi, -0.5L * (s.lo + 2.0L * hi * lo));
+  const Extended h = UpperHalf(hi);
+  return ExpMinusHalfSquareOfHalves(h, (hi - h) + lo);
 }
 
 // (X - Mean) / StdDev to twice the working precision.
@@ -56,13 +73,21 @@ Pair Standardized(Extended Mean, Extended StdDev, Extended X) {
   return detail::Quotient(detail::ExactSum(X, -Mean), Pair{StdDev});
 }
 
-// Scales within 2^(+-16000) have a normal reciprocal and split without overflow.
-bool ScaleInRange(Extended s) { return s >= 0x1p-16000L && s <= 0x1p16000L; }
+// Scales within 2^(+-1000) have a normal reciprocal and split without overflow (the bounds are
+// doubles, cheap to load).
+bool ScaleInRange(Extended s) { return s >= 0x1p-1000 && s <= 0x1p1000; }
 
-// The normal density at X. z = (X - Mean) / StdDev is carried to twice the precision with one
-// division: hi = (X - Mean) / StdDev through the reciprocal is within two units in the last
-// place of the quotient, so its remainder is exact all the same and lo is that remainder over
-// StdDev.
+// q = n / d to twice the precision with the reciprocal r = 1 / d given (d within
+// ScaleInRange, |n r| below 2^8000): h is the upper half of n r, so h times either half of d is
+// exact, n - h d is exact (it is 2^-31 of n at most) and l is that remainder times r. One
+// division in all, and few values alive at once for the eight x87 registers.
+Pair HalvesOfQuotient(Extended n, Extended nlo, Extended d, Extended r) {
+  const Extended h = UpperHalf(n * r);
+  const Extended d_hi = UpperHalf(d);
+  return {h, (((n - h * d_hi) - h * (d - d_hi)) + nlo) * r};
+}
+
+// The normal density at X, z = (X - Mean) / StdDev carried to twice the precision.
 Extended NormalDensity(Extended Mean, Extended StdDev, Extended X) {
   if (!ScaleInRange(StdDev)) {
     const Pair z = Standardized(Mean, StdDev, X);
@@ -70,10 +95,10 @@ Extended NormalDensity(Extended Mean, Extended StdDev, Extended X) {
   }
   const Extended inverse = 1.0L / StdDev;
   const Pair d = detail::ExactSum(X, -Mean);
-  const Extended hi = d.hi * inverse;
-  const Pair p = detail::ExactProduct(hi, StdDev);
-  const Extended lo = (((d.hi - p.hi) - p.lo) + d.lo) * inverse;
-  return kInvSqrt2Pi * inverse * ExpMinusHalfSquare(hi, lo);
+  const Extended rounded = d.hi * inverse;
+  if (!(std::fabs(rounded) < 152.0L)) return std::isnan(rounded) ? kNaN : 0.0L;
+  const Pair z = HalvesOfQuotient(d.hi, d.lo, StdDev, inverse);
+  return kInvSqrt2Pi * inverse * ExpMinusHalfSquareOfHalves(z.hi, z.lo);
 }
 
 #include "tovrin/statistics/TOVRINPrecise_InvNormal.inc"
@@ -591,10 +616,10 @@ Extended ExpMinusRatio(Extended X, Extended Mean, bool density) {
     return density ? e / Mean : e;
   }
   const Extended inverse = 1.0L / Mean;
-  const Extended hi = X * inverse;
-  if (!(hi < 12000.0L)) return std::isnan(hi) ? kNaN : 0.0L;
-  const Pair p = detail::ExactProduct(hi, Mean);
-  const Extended e = Exp80(-hi, -(((X - p.hi) - p.lo) * inverse));
+  if (!(X * inverse < 12000.0L)) return std::isnan(X * inverse) ? kNaN : 0.0L;
+  const Pair q = HalvesOfQuotient(X, 0.0L, Mean, inverse);
+  const Extended s = q.hi + q.lo;
+  const Extended e = Exp80(-s, (s - q.hi) - q.lo);
   return density ? e * inverse : e;
 }
 }  // namespace
