@@ -139,9 +139,9 @@ Extended InverseNormalLess(Extended P) {
 
 // First estimate of the x with P(a, x) = p and Q(a, x) = q: for a = 1/2, Q = 2 P(Z > sqrt(2x))
 // exactly; for a >= 1 Wilson and Hilferty's cube; otherwise, or where that fails, the lower
-// tail's power law x^a / Gamma(a + 1) (with its first correction, e^-x ~ 1 - a x / (a + 1))
-// while x is small, and the upper tail's x^(a - 1) e^-x / Gamma(a) (1 + (a - 1) / x) beyond,
-// solved by two fixed-point steps.
+// tail's power law x^a / Gamma(a + 1) in the lower tail or while x is small (with its first
+// correction x e^(x / (a + 1)) below x = a + 1), and the upper tail's
+// x^(a - 1) e^-x / Gamma(a) (1 + (a - 1) / x) beyond, solved by two fixed-point steps.
 Extended InverseGammaStart(Extended a, Extended p, Extended q) {
   const bool use_lower = p <= q;
   if (a == 0.5L && !use_lower) {
@@ -155,8 +155,8 @@ Extended InverseGammaStart(Extended a, Extended p, Extended q) {
     if (base > 0.1L) return a * base * base * base;
   }
   Extended x = std::exp((std::log(p) + LnGamma(a + 1.0L)) / a);
-  if (x < 0.5L || (use_lower && !(x > 1.0L))) {
-    x *= std::exp(x / (a + 1.0L));
+  if (use_lower || x < 0.5L) {
+    if (x < a + 1.0L) x *= std::exp(x / (a + 1.0L));
   } else {
     const Extended level = -std::log(q) - LnGamma(a);
     x = std::fmax(1.0L, level);
