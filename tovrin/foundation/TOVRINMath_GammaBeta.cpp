@@ -28,6 +28,7 @@
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINMath.h"
 #include "tovrin/foundation/detail/Elementary.h"
+#include "tovrin/foundation/detail/ExactArithmetic.h"
 #include "tovrin/foundation/detail/IncompleteTails.h"
 
 namespace tovrin {
@@ -175,8 +176,8 @@ Extended LnGammaFinite(Extended x) {
   return kLnPi - std::log(y) - std::log(std::fabs(SinPi(x))) - LnGammaFinite(y);
 }
 
-// Error-free transformations: s + e = a + b and p + e = a * b exactly (Knuth's TwoSum and
-// Dekker's product with Veltkamp's 32/32 split of the 64-bit significand).
+// Error-free transformations: s + e = a + b and p + e = a * b exactly
+// (detail/ExactArithmetic.h).
 struct ExactPair {
   Extended hi;
   Extended lo;
@@ -184,12 +185,10 @@ struct ExactPair {
 
 ExactPair TwoSum(Extended a, Extended b) {
   const Extended s = a + b;
-  const Extended bb = s - a;
-  return {s, (a - (s - bb)) + (b - bb)};
+  return {s, detail::SumError(a, b, s)};
 }
 
 ExactPair TwoProduct(Extended a, Extended b) {
-  constexpr Extended kSplitter = 4294967297.0L;  // 2^32 + 1
   // The split multiplies by 2^32 + 1, which overflows for factors near the top of the range:
   // such a factor is scaled down by a power of two first and the pair scaled back, both exact.
   constexpr Extended kSplitLimit = 0x1p16000L;
@@ -204,13 +203,7 @@ ExactPair TwoProduct(Extended a, Extended b) {
     return {r.hi * kUp, r.lo * kUp};
   }
   const Extended p = a * b;
-  const Extended ta = kSplitter * a;
-  const Extended a_hi = ta - (ta - a);
-  const Extended a_lo = a - a_hi;
-  const Extended tb = kSplitter * b;
-  const Extended b_hi = tb - (tb - b);
-  const Extended b_lo = b - b_hi;
-  return {p, ((a_hi * b_hi - p) + a_hi * b_lo + a_lo * b_hi) + a_lo * b_lo};
+  return {p, detail::ProductError(a, b, p)};
 }
 
 // s - (s + t) u for an exact u, with the products and the first difference carried exactly:

@@ -6,6 +6,7 @@
 // call per draw).
 #include "tovrin/random/TOVRINRandom.h"
 
+#include "tovrin/foundation/detail/Elementary.h"
 #include "tovrin/foundation/detail/Wrapping.h"
 
 #include <algorithm>
@@ -23,6 +24,8 @@ namespace tovrin {
 
 namespace {
 
+using detail::Exp80;
+using detail::Ln80;
 using detail::RaiseMathError;
 
 // The two literal guards of the methods: the literal 5.0E-324 held as an Extended (not the
@@ -299,8 +302,7 @@ Extended StandardNormal(Gen& gen) {
     }
     if (q > 0.27846) continue;
     v = LevaV(rawV);
-    if (static_cast<Extended>(v) * v <
-        -4.0L * static_cast<Extended>(u) * u * std::log(Extended{u})) {
+    if (static_cast<Extended>(v) * v < -4.0L * static_cast<Extended>(u) * u * Ln80(Extended{u})) {
       break;
     }
   }
@@ -330,7 +332,7 @@ Extended ExponentialVariate(Gen& gen) {
   do {
     u = gen();
   } while (!(u > kTiny));
-  return -std::log(u);
+  return -Ln80(u);
 }
 
 // ---------------------------------------------------------------------------------------------
@@ -340,8 +342,9 @@ Extended ExponentialVariate(Gen& gen) {
 // only where the two sides lie within the bound below does the Extended logarithm decide.
 //
 // ln x in double for a positive x in the normal double range, with a bound on its distance
-// from std::log(x) in Extended: rounding x to double moves ln x by 1.2e-16, the double log is
-// within an ulp (2.3e-16 |ln x|) and so is the Extended one; 5e-16 (1 + |ln x|) covers all.
+// from the Extended logarithm (Ln80, or std::log where the C library's is still used):
+// rounding x to double moves ln x by 1.2e-16, the double log is within an ulp
+// (2.3e-16 |ln x|) and so are the Extended ones; 5e-16 (1 + |ln x|) covers all.
 struct BoundedLog {
   double value;
   double bound;
@@ -392,7 +395,7 @@ Extended GammaLargeShape(Extended shape, Gen& gen) {
       if (settled == Settled::kYes) return d * t;
       if (settled == Settled::kNo) continue;
     }
-    if (std::log(u) < 0.5L * x2 + d * (1 - t + std::log(t))) return d * t;
+    if (Ln80(u) < 0.5L * x2 + d * (1 - t + Ln80(t))) return d * t;
   }
 }
 
@@ -401,7 +404,7 @@ template <typename Gen>
 Extended GammaSmallShape(Extended shape, Gen& gen) {
   if (shape < kTiny) RaiseMathError(rsShapeTooSmall);
   const Extended t = 1 - shape;
-  const Extended p = t / (t + shape * std::exp(-t));
+  const Extended p = t / (t + shape * Exp80(-t));
   // Below the floor w0 = p (Tiny / t)^Shape the body's candidate would underflow: such a draw
   // gives 0 at once. The power is costly, so w0 (and t ln t, needed by the tail only) are
   // computed on first use. Since Tiny / t <= 1E-304 and p <= 1, w0 <= exp(-699 Shape): a
@@ -418,6 +421,9 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
   bool haveW0 = false;
   Extended tLnT = 0;
   bool haveTLnT = false;
+  BoundedLog logT{};  // ln t in double, formed on first use like t ln t
+  bool haveLogT = false;
+  bool logTValid = false;
   for (;;) {
     const Extended u = gen();
     if (u >= 1) continue;
@@ -426,10 +432,13 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
     Extended wError = -1;  // -1: w is not known yet
     const bool tail = u > p;
     if (tail) {
-      x = t - std::log((1 - u) / (1 - p));
+      x = t - Ln80((1 - u) / (1 - p));
       BoundedLog logX;
-      BoundedLog logT;
-      if (DoubleLog(x, logX) && DoubleLog(t, logT)) {
+      if (!haveLogT) {
+        logTValid = DoubleLog(t, logT);
+        haveLogT = true;
+      }
+      if (DoubleLog(x, logX) && logTValid) {
         const Extended lnX = logX.value;
         const Extended lnT = logT.value;
         w = t * lnX - t * lnT;
@@ -467,14 +476,14 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
     }
     if (tail) {
       if (!haveTLnT) {
-        tLnT = t * std::log(t);
+        tLnT = t * Ln80(t);
         haveTLnT = true;
       }
-      w = t * std::log(x) - tLnT;
+      w = t * Ln80(x) - tLnT;
     }
     if (w < 1 - u2) return x;
     if (u2 <= 0) return x;
-    if (u2 * (1 + w) < 1 && w < -std::log(u2)) return x;
+    if (u2 * (1 + w) < 1 && w < -Ln80(u2)) return x;
   }
 }
 
@@ -1336,126 +1345,50 @@ void Randomize() {
 }
 
 // ---------------------------------------------------------------------------------------------
-// The generators: each overload is a forward to its method.
+// The generators, one row each: result, public name, parameters, method, arguments. A row
+// writes both overloads: the one that takes a TRandomGenFunction runs the method on it through
+// WithSource (a known engine behind it is drawn inline, giving the same uniforms), its twin runs
+// the method on a ThreadSource.
+#define TOVRIN_RANDOM_GENERATORS(X)                                                            \
+  X(Extended, Random_Normal, (), StandardNormal, ())                                           \
+  X(Extended, Random_Normal, (Extended Mean, Extended StdDev), NormalVariate, (Mean, StdDev))  \
+  X(Extended, Random_LogNormal, (Extended Mean, Extended StdDev), LogNormalVariate,            \
+    (Mean, StdDev))                                                                            \
+  X(Extended, Random_Gamma, (Extended Shape), GammaVariate, (Shape))                           \
+  X(Extended, Random_ChiSq, (LongInt DF), ChiSquareVariate, (DF))                              \
+  X(Extended, Random_Exponential, (), ExponentialVariate, ())                                  \
+  X(Extended, Random_Weibull, (Extended Shape), WeibullVariate, (Shape))                       \
+  X(Extended, Random_Beta, (Extended A, Extended B), BetaVariate, (A, B))                      \
+  X(Extended, Random_T, (LongInt DF), StudentTVariate, (DF))                                   \
+  X(void, Random_MVNorm,                                                                       \
+    (const TQENFloatVector& Means, const TQENFloatVector& Covariance, TQENFloatVector& Factor, \
+     TQENFloatVector& Variate, LongInt& ErrorCode),                                            \
+    MultivariateNormal, (Means, Covariance, Factor, Variate, ErrorCode))                       \
+  X(Extended, Random_Inv_Gauss, (Extended Lambda, Extended Omega), InverseGaussianVariate,     \
+    (Lambda, Omega))                                                                           \
+  X(Int64, Random_Binomial1, (LongInt N, Extended P), BinomialFromMode, (N, P))                \
+  X(Int64, Random_Binomial2, (Int64 N, Extended P), BinomialVariate, (N, P))                   \
+  X(Int64, Random_Neg_Binomial, (Extended R, Extended P), NegativeBinomialVariate, (R, P))     \
+  X(Extended, Random_von_Mises, (Extended K), VonMisesVariate, (K))                            \
+  X(Extended, Random_Cauchy, (), CauchyVariate, ())                                            \
+  X(Int64, Random_Poisson, (const Extended& Mu), PoissonVariate, (Mu))
 
-Extended Random_Normal(TRandomGenFunction Gen) {
-  return WithSource(Gen, [](auto& gen) { return StandardNormal(gen); });
-}
-Extended Random_Normal() {
-  ThreadSource gen;
-  return StandardNormal(gen);
-}
-Extended Random_Normal(Extended Mean, Extended StdDev, TRandomGenFunction Gen) {
-  return WithSource(Gen, [=](auto& gen) { return NormalVariate(Mean, StdDev, gen); });
-}
-Extended Random_Normal(Extended Mean, Extended StdDev) {
-  ThreadSource gen;
-  return NormalVariate(Mean, StdDev, gen);
-}
-Extended Random_LogNormal(Extended Mean, Extended StdDev, TRandomGenFunction Gen) {
-  return LogNormalVariate(Mean, StdDev, Gen);
-}
-Extended Random_LogNormal(Extended Mean, Extended StdDev) {
-  ThreadSource gen;
-  return LogNormalVariate(Mean, StdDev, gen);
-}
+// A parenthesised list without its parentheses, followed by a comma unless it is empty.
+#define TOVRIN_LEADING(...) __VA_ARGS__ __VA_OPT__(, )
+#define TOVRIN_UNPARENTHESISED(...) __VA_ARGS__
 
-Extended Random_Gamma(Extended Shape, TRandomGenFunction Gen) {
-  return WithSource(Gen, [Shape](auto& gen) { return GammaVariate(Shape, gen); });
-}
-Extended Random_Gamma(Extended Shape) {
-  ThreadSource gen;
-  return GammaVariate(Shape, gen);
-}
-Extended Random_ChiSq(LongInt DF, TRandomGenFunction Gen) { return ChiSquareVariate(DF, Gen); }
-Extended Random_ChiSq(LongInt DF) {
-  ThreadSource gen;
-  return ChiSquareVariate(DF, gen);
-}
-Extended Random_Exponential(TRandomGenFunction Gen) { return ExponentialVariate(Gen); }
-Extended Random_Exponential() {
-  ThreadSource gen;
-  return ExponentialVariate(gen);
-}
-Extended Random_Weibull(Extended Shape, TRandomGenFunction Gen) {
-  return WeibullVariate(Shape, Gen);
-}
-Extended Random_Weibull(Extended Shape) {
-  ThreadSource gen;
-  return WeibullVariate(Shape, gen);
-}
-
-Extended Random_Beta(Extended A, Extended B, TRandomGenFunction Gen) {
-  return BetaVariate(A, B, Gen);
-}
-Extended Random_Beta(Extended A, Extended B) {
-  ThreadSource gen;
-  return BetaVariate(A, B, gen);
-}
-Extended Random_T(LongInt DF, TRandomGenFunction Gen) { return StudentTVariate(DF, Gen); }
-Extended Random_T(LongInt DF) {
-  ThreadSource gen;
-  return StudentTVariate(DF, gen);
-}
-
-void Random_MVNorm(const TQENFloatVector& Means, const TQENFloatVector& Covariance,
-                   TQENFloatVector& Factor, TQENFloatVector& Variate, LongInt& ErrorCode,
-                   TRandomGenFunction Gen) {
-  MultivariateNormal(Means, Covariance, Factor, Variate, ErrorCode, Gen);
-}
-void Random_MVNorm(const TQENFloatVector& Means, const TQENFloatVector& Covariance,
-                   TQENFloatVector& Factor, TQENFloatVector& Variate, LongInt& ErrorCode) {
-  ThreadSource gen;
-  MultivariateNormal(Means, Covariance, Factor, Variate, ErrorCode, gen);
-}
-
-Extended Random_Inv_Gauss(Extended Lambda, Extended Omega, TRandomGenFunction Gen) {
-  return InverseGaussianVariate(Lambda, Omega, Gen);
-}
-Extended Random_Inv_Gauss(Extended Lambda, Extended Omega) {
-  ThreadSource gen;
-  return InverseGaussianVariate(Lambda, Omega, gen);
-}
-
-Int64 Random_Binomial1(LongInt N, Extended P, TRandomGenFunction Gen) {
-  return BinomialFromMode(N, P, Gen);
-}
-Int64 Random_Binomial1(LongInt N, Extended P) {
-  ThreadSource gen;
-  return BinomialFromMode(N, P, gen);
-}
-Int64 Random_Binomial2(Int64 N, Extended P, TRandomGenFunction Gen) {
-  return WithSource(Gen, [N, P](auto& gen) { return BinomialVariate(N, P, gen); });
-}
-Int64 Random_Binomial2(Int64 N, Extended P) {
-  ThreadSource gen;
-  return BinomialVariate(N, P, gen);
-}
-Int64 Random_Neg_Binomial(Extended R, Extended P, TRandomGenFunction Gen) {
-  return NegativeBinomialVariate(R, P, Gen);
-}
-Int64 Random_Neg_Binomial(Extended R, Extended P) {
-  ThreadSource gen;
-  return NegativeBinomialVariate(R, P, gen);
-}
-
-Extended Random_von_Mises(Extended K, TRandomGenFunction Gen) { return VonMisesVariate(K, Gen); }
-Extended Random_von_Mises(Extended K) {
-  ThreadSource gen;
-  return VonMisesVariate(K, gen);
-}
-Extended Random_Cauchy(TRandomGenFunction Gen) { return CauchyVariate(Gen); }
-Extended Random_Cauchy() {
-  ThreadSource gen;
-  return CauchyVariate(gen);
-}
-
-Int64 Random_Poisson(const Extended& Mu, TRandomGenFunction Gen) {
-  return WithSource(Gen, [&Mu](auto& gen) { return PoissonVariate(Mu, gen); });
-}
-Int64 Random_Poisson(const Extended& Mu) {
-  ThreadSource gen;
-  return PoissonVariate(Mu, gen);
-}
+#define TOVRIN_DEFINE_GENERATOR(Result, Name, Params, Method, Args)                           \
+  Result Name(TOVRIN_LEADING Params TRandomGenFunction Gen) {                                 \
+    return WithSource(Gen, [&](auto& source) { return Method(TOVRIN_LEADING Args source); }); \
+  }                                                                                           \
+  Result Name(TOVRIN_UNPARENTHESISED Params) {                                                \
+    ThreadSource gen;                                                                         \
+    return Method(TOVRIN_LEADING Args gen);                                                   \
+  }
+TOVRIN_RANDOM_GENERATORS(TOVRIN_DEFINE_GENERATOR)
+#undef TOVRIN_DEFINE_GENERATOR
+#undef TOVRIN_UNPARENTHESISED
+#undef TOVRIN_LEADING
+#undef TOVRIN_RANDOM_GENERATORS
 
 }  // namespace tovrin
