@@ -37,9 +37,7 @@ TOVRIN_CREATORS(ShortInt, SInt)
 
 // --- Every element type ---------------------------------------------------------------------
 
-template <typename T>
-class MatrixAllTypes : public ::testing::Test {};
-TYPED_TEST_SUITE(MatrixAllTypes, testing::AllElements);
+TOVRIN_TYPED_SUITE(MatrixAllTypes, testing::AllElements);
 
 TYPED_TEST(MatrixAllTypes, CreatorsAndRowAndColumnCounts) {
   const auto m = Creators<TypeParam>::Create(2, 3);
@@ -119,9 +117,7 @@ TYPED_TEST(MatrixAllTypes, ToFloatMatrixKeepsTheShapeAndTheValues) {
 
 // --- Arithmetic element types ---------------------------------------------------------------
 
-template <typename T>
-class MatrixArithmetic : public ::testing::Test {};
-TYPED_TEST_SUITE(MatrixArithmetic, testing::ArithmeticElements);
+TOVRIN_TYPED_SUITE(MatrixArithmetic, testing::ArithmeticElements);
 
 TYPED_TEST(MatrixArithmetic, AddAndSubtract) {
   const auto a = Mat<TypeParam>({{1, 2, 3}, {4, 5, 6}});
@@ -257,9 +253,7 @@ TEST(MatrixFloatArithmetic, ExtendedConstantsAreNotRoundedFirst) {
 
 // --- Element-wise functions -----------------------------------------------------------------
 
-template <typename T>
-class MatrixElementWise : public ::testing::Test {};
-TYPED_TEST_SUITE(MatrixElementWise, testing::FloatElements);
+TOVRIN_TYPED_SUITE(MatrixElementWise, testing::FloatElements);
 
 TYPED_TEST(MatrixElementWise, Values) {
   auto m = Mat<TypeParam>({{3, -2}, {1.5}, {}});

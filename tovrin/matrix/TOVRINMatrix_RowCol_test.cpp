@@ -17,9 +17,7 @@ using namespace testing;
 
 // --- Every element type ---------------------------------------------------------------------
 
-template <typename T>
-class RowColAllTypes : public ::testing::Test {};
-TYPED_TEST_SUITE(RowColAllTypes, testing::AllElements);
+TOVRIN_TYPED_SUITE(RowColAllTypes, testing::AllElements);
 
 TYPED_TEST(RowColAllTypes, SwapRowsAndCols) {
   using M = Matrix<TypeParam>;
@@ -241,9 +239,7 @@ TYPED_TEST(RowColAllTypes, Transpose) {
 
 // --- Scaling and adding (arithmetic types) --------------------------------------------------
 
-template <typename T>
-class RowColArithmetic : public ::testing::Test {};
-TYPED_TEST_SUITE(RowColArithmetic, testing::ArithmeticElements);
+TOVRIN_TYPED_SUITE(RowColArithmetic, testing::ArithmeticElements);
 
 TYPED_TEST(RowColArithmetic, ScaleRowsAndColumns) {
   using M = Matrix<TypeParam>;
@@ -311,9 +307,7 @@ TEST(RowColIntegers, ScalingAndAddingWrap) {
 
 // --- Matrix product -------------------------------------------------------------------------
 
-template <typename T>
-class RowColProduct : public ::testing::Test {};
-TYPED_TEST_SUITE(RowColProduct, testing::FloatElements);
+TOVRIN_TYPED_SUITE(RowColProduct, testing::FloatElements);
 
 TYPED_TEST(RowColProduct, ShapesAndValues) {
   using M = Matrix<TypeParam>;
@@ -365,11 +359,9 @@ TEST(RowColProductRounding, TermsAndSumsInExtendedResultRoundedOnce) {
 
 // --- Sums -----------------------------------------------------------------------------------
 
-template <typename T>
-class RowColSums : public ::testing::Test {};
 using SumTypes = ::testing::Types<PackedExtended, Double, Single, Int64, LongWord, SmallInt, Word,
                                   ShortInt, Byte>;
-TYPED_TEST_SUITE(RowColSums, SumTypes);
+TOVRIN_TYPED_SUITE(RowColSums, SumTypes);
 
 TYPED_TEST(RowColSums, SumsAndChecks) {
   const auto m = Mat<TypeParam>({{1, 2, 3}, {4, 5, 6}});
