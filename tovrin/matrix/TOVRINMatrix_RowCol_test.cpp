@@ -83,10 +83,7 @@ TYPED_TEST(RowColAllTypes, SortsLeaveOneRowOrOneColumnAlone) {
 
 TYPED_TEST(RowColAllTypes, SortRowsOnAColumn) {
   using M = Matrix<TypeParam>;
-  auto m = Mat<TypeParam>({{3, 0}, {1, 0}, {2, 0}});
-  QSortMatrixRowsOnCol(m, 0, true);
-  EXPECT_EQ(Values(m), (Rows{{1, 0}, {2, 0}, {3, 0}}));
-  m = Mat<TypeParam>({{7, 3}, {8, 1}, {9, 2}, {6, 5}});
+  auto m = Mat<TypeParam>({{7, 3}, {8, 1}, {9, 2}, {6, 5}});
   QSortMatrixRowsOnCol(m, 1, false);
   EXPECT_EQ(Values(m), (Rows{{6, 5}, {7, 3}, {9, 2}, {8, 1}}));
   const auto sq = Mat<TypeParam>({{2, 1}, {1, 2}});
