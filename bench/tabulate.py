@@ -124,6 +124,14 @@ def currency_rows():
              "llroundl loop", "BM_PlainLoopLlroundl_Float")]
 
 
+def elementary_rows():
+    r = [("`Exp80`", "BM_Exp80", "expl", "BM_Expl"), ("`Exp80`", "BM_Exp80", "exp (double)", "BM_ExpDouble"),
+         ("`Exp80(hi, lo)`", "BM_Exp80Split", "expl", "BM_Expl"),
+         ("`Ln80`", "BM_Ln80", "logl", "BM_Logl"), ("`Ln80`", "BM_Ln80", "log (double)", "BM_LogDouble"),
+         ("`Pow80`", "BM_Pow80", "powl", "BM_Powl"), ("`Pow80`", "BM_Pow80", "pow (double)", "BM_PowDouble")]
+    return [(what + ", per call", ours, peer, p) for what, ours, peer, p in r]
+
+
 DISTRIBUTIONS = ["NormalLess", "InvNormalLess", "IncompleteGamma", "ChiSquareLess", "InvChiSquareLess",
                  "StudentTLess", "InvStudentTLess", "FDistLess", "InvFDistLess", "BetaDistLess",
                  "BinomialLess", "PoissonLess"]
@@ -142,6 +150,7 @@ SECTIONS = [
     ("distributions_bench", "Distributions (reference-table rows, per call)",
      [("`%s`" % d, d + "/tovrin", "Boost.Math", d + "/boost") for d in DISTRIBUTIONS]),
     ("random_bench", "Random variates", random_rows()),
+    ("elementary_bench", "80-bit elementary functions", elementary_rows()),
     ("currency_bench", "Money vectors", currency_rows()),
 ]
 

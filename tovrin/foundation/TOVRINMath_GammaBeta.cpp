@@ -27,6 +27,7 @@
 #include "tovrin/foundation/TOVRINErrors.h"
 #include "tovrin/foundation/TOVRINMath.h"
 #include "tovrin/foundation/detail/Elementary.h"
+#include "tovrin/foundation/detail/ExactArithmetic.h"
 #include "tovrin/foundation/detail/IncompleteTails.h"
 
 namespace tovrin {
@@ -174,8 +175,8 @@ Extended LnGammaFinite(Extended x) {
   return kLnPi - std::log(y) - std::log(std::fabs(SinPi(x))) - LnGammaFinite(y);
 }
 
-// Error-free transformations: s + e = a + b and p + e = a * b exactly (Knuth's TwoSum and
-// Dekker's product with Veltkamp's 32/32 split of the 64-bit significand).
+// Error-free transformations: s + e = a + b and p + e = a * b exactly
+// (detail/ExactArithmetic.h).
 struct ExactPair {
   Extended hi;
   Extended lo;
@@ -183,12 +184,10 @@ struct ExactPair {
 
 ExactPair TwoSum(Extended a, Extended b) {
   const Extended s = a + b;
-  const Extended bb = s - a;
-  return {s, (a - (s - bb)) + (b - bb)};
+  return {s, detail::SumError(a, b, s)};
 }
 
 ExactPair TwoProduct(Extended a, Extended b) {
-  constexpr Extended kSplitter = 4294967297.0L;  // 2^32 + 1
   // The split multiplies by 2^32 + 1, which overflows for factors near the top of the range:
   // such a factor is scaled down by a power of two first and the pair scaled back, both exact.
   constexpr Extended kSplitLimit = 0x1p16000L;
@@ -203,13 +202,7 @@ ExactPair TwoProduct(Extended a, Extended b) {
     return {r.hi * kUp, r.lo * kUp};
   }
   const Extended p = a * b;
-  const Extended ta = kSplitter * a;
-  const Extended a_hi = ta - (ta - a);
-  const Extended a_lo = a - a_hi;
-  const Extended tb = kSplitter * b;
-  const Extended b_hi = tb - (tb - b);
-  const Extended b_lo = b - b_hi;
-  return {p, ((a_hi * b_hi - p) + a_hi * b_lo + a_lo * b_hi) + a_lo * b_lo};
+  return {p, detail::ProductError(a, b, p)};
 }
 
 // s - (s + t) u for an exact u, with the products and the first difference carried exactly:
@@ -487,10 +480,20 @@ Extended BetaContinuedFraction(const BetaPoint& p, Extended a, Extended b, Exten
     bn = bnp1;
     bnp1 = t;
     const Extended r0 = r;
-    r = anp1 / bnp1;
-    if (!(std::fabs(r - r0) > kEpsilon * r)) break;
-    an /= bnp1;
-    bn /= bnp1;
+    if (p.precise_powers) {
+      // The precise family rescales by one reciprocal instead of three quotients (a rounding
+      // more in each ratio, which the next step's rescaling does not carry forward).
+      const Extended scale = 1.0L / bnp1;
+      r = anp1 * scale;
+      if (!(std::fabs(r - r0) > kEpsilon * r)) break;
+      an *= scale;
+      bn *= scale;
+    } else {
+      r = anp1 / bnp1;
+      if (!(std::fabs(r - r0) > kEpsilon * r)) break;
+      an /= bnp1;
+      bn /= bnp1;
+    }
     anp1 = r;
     bnp1 = 1.0L;
   }
@@ -1084,6 +1087,8 @@ namespace detail {
 
 Extended PrecisePower(Extended X, Extended A) {
   if (A == 0.5L) return std::sqrt(X);
+  // |ln X| >= |X - 1| / max(X, 1): beyond the limit by that bound, the logarithm is not needed.
+  if (std::fabs(A * (X - 1.0L)) > kExpLogPowerLimit * std::fmax(X, 1.0L)) return Pow80(X, A);
   const Extended e = A * Ln80(X);
   if (std::fabs(e) <= kExpLogPowerLimit) return Exp80(e);
   return Pow80(X, A);

@@ -6,6 +6,7 @@
 // call per draw).
 #include "tovrin/random/TOVRINRandom.h"
 
+#include "tovrin/foundation/detail/Elementary.h"
 #include "tovrin/foundation/detail/Wrapping.h"
 
 #include <algorithm>
@@ -16,12 +17,15 @@
 #include <cstring>
 #include <functional>
 #include <mutex>
+#include <random>
 #include <thread>
 
 namespace tovrin {
 
 namespace {
 
+using detail::Exp80;
+using detail::Ln80;
 using detail::RaiseMathError;
 
 // The two literal guards of the methods: the literal 5.0E-324 held as an Extended (not the
@@ -70,12 +74,8 @@ inline std::uint64_t NextBits(ThreadStream& stream) {
   return result;
 }
 
-// bits * 2^-64, exact in the 64-bit mantissa. The word is loaded as a signed integer and moved
-// up by 2^63, which avoids the branch of an unsigned conversion.
-inline Extended UniformFromBits(std::uint64_t bits) {
-  const auto shifted = static_cast<std::int64_t>(bits ^ 0x8000000000000000ULL);
-  return (static_cast<Extended>(shifted) + 0x1p63L) * 0x1p-64L;
-}
+using detail::UniformDoubleFromBits;
+using detail::UniformFromBits;
 
 // The process seed. Only the slow paths (a thread joining a seed, a new seed) take the lock;
 // a draw reads the atomic generation and nothing else that is shared.
@@ -106,23 +106,39 @@ class ThreadSource {
  public:
   ThreadSource() : stream_(CurrentStream()) {}
   Extended operator()() { return UniformFromBits(NextBits(stream_)); }
-  // The next uniform rounded to double, without the trip through the x87 unit: rounding the
-  // 64-bit word to 53 bits and scaling by 2^-64 rounds the exact uniform the same way. A word
-  // of 2^63 or more is halved first with its last bit kept as a sticky bit (it lies below the
-  // rounding position), which rounds the same way; the choice is made without a branch,
-  // which would go either way at random.
-  double NextDouble() {
-    const std::uint64_t bits = NextBits(stream_);
-    const std::uint64_t high = bits >> 63;
-    const std::uint64_t mask = 0 - high;
-    const std::uint64_t word = bits ^ ((bits ^ ((bits >> 1) | (bits & 1))) & mask);
-    const auto factor = static_cast<double>(static_cast<std::int64_t>(high + 1));  // 1 or 2
-    return static_cast<double>(static_cast<std::int64_t>(word)) * 0x1p-64 * factor;
-  }
+  // The next uniform rounded to double.
+  double NextDouble() { return UniformDoubleFromBits(NextBits(stream_)); }
 
  private:
   ThreadStream& stream_;
 };
+
+// The standard Mersenne Twisters passed as a TRandomGenFunction: the generators draw their
+// words inline instead of through the reference, the same uniforms in the same order.
+template <typename Engine>
+class EngineSource {
+ public:
+  explicit EngineSource(Engine& engine) : engine_(engine) {}
+  Extended operator()() { return UniformFromBits(detail::EngineWord64(engine_)); }
+  double NextDouble() { return UniformDoubleFromBits(detail::EngineWord64(engine_)); }
+
+ private:
+  Engine& engine_;
+};
+
+// body(source) with the engine behind gen drawn inline where it is a known one.
+template <typename Body>
+auto WithSource(TRandomGenFunction gen, Body body) {
+  if (auto* engine = gen.EngineOf<std::mt19937_64>()) {
+    EngineSource<std::mt19937_64> source(*engine);
+    return body(source);
+  }
+  if (auto* engine = gen.EngineOf<std::mt19937>()) {
+    EngineSource<std::mt19937> source(*engine);
+    return body(source);
+  }
+  return body(gen);
+}
 
 // ---------------------------------------------------------------------------------------------
 // Conversions to integers. Truncating NaN or a value past the Int64 range has no integer
@@ -243,42 +259,50 @@ Extended TruncExtended(Extended x) {
 // A uniform rounded to double.
 template <typename Gen>
 double DrawDouble(Gen& gen) {
-  return static_cast<double>(gen());
+  return gen.NextDouble();
 }
-double DrawDouble(ThreadSource& gen) { return gen.NextDouble(); }
 
 // Leva's ratio of uniforms. The uniforms, the transformed v and the intermediates x, y, q are
 // held as doubles (the published method's precision); each of them is computed in Extended
 // arithmetic with Extended constants and rounded once when it is stored, like every other
 // value of the library. The comparisons, the logarithmic test and the ratio are Extended.
 //
-// v enters the result, so it is always worked out that way. x, y and q only steer the two
-// bounds: plain double arithmetic gives q within 1e-15 of the stored value, which settles both
-// bounds alike unless q lies within 1e-9 of one of them, and only then is the Extended form
-// computed. The Extended bounds 0.27597 and 0.27846 lie above their nearest doubles and below
-// the next ones, so for a double q, q < 0.27597L is q <= 0.27597 and q > 0.27846L is q > 0.27846.
+// v enters the result, so it is worked out that way whenever it is used: on acceptance and for
+// the logarithmic test. x, y and q only steer the two bounds: plain double arithmetic on the
+// uniforms, v taken as (v - 0.5) 1.7156 in double (within 5e-16 of the stored v), gives q within
+// 2e-15 of the stored value, which settles both bounds alike unless q lies within 1e-9 of one
+// of them, and only then is the Extended form computed. So the Extended v stays off the path of
+// the rejections. The Extended bounds 0.27597 and 0.27846 lie above their nearest doubles and
+// below the next ones, so for a double q, q < 0.27597L is q <= 0.27597 and q > 0.27846L is
+// q > 0.27846.
+inline double LevaV(double v) { return static_cast<double>((v - 0.5L) * 1.7156L); }
+
 template <typename Gen>
 Extended StandardNormal(Gen& gen) {
   double u;
   double v;
   for (;;) {
     u = DrawDouble(gen);
-    v = DrawDouble(gen);
-    v = static_cast<double>((v - 0.5L) * 1.7156L);
+    const double rawV = DrawDouble(gen);
+    const double vNear = (rawV - 0.5) * 1.7156;
     double x = u - 0.449871;
-    double y = std::fabs(v) + 0.386595;
+    double y = std::fabs(vNear) + 0.386595;
     double q = x * x + y * (0.196 * y - 0.25472 * x);
-    if (std::fabs(q - 0.27597) < 1e-9 || std::fabs(q - 0.27846) < 1e-9) {
+    if (std::fabs(q - 0.27597) < 1e-9 || std::fabs(q - 0.27846) < 1e-9) [[unlikely]] {
+      v = LevaV(rawV);
       x = static_cast<double>(u - 0.449871L);
       y = static_cast<double>(std::fabs(v) + 0.386595L);
       const Extended xe = x;
       const Extended ye = y;
       q = static_cast<double>(xe * xe + ye * (0.196L * ye - 0.25472L * xe));
     }
-    if (q <= 0.27597) break;
+    if (q <= 0.27597) {
+      v = LevaV(rawV);
+      break;
+    }
     if (q > 0.27846) continue;
-    if (static_cast<Extended>(v) * v <
-        -4.0L * static_cast<Extended>(u) * u * std::log(Extended{u})) {
+    v = LevaV(rawV);
+    if (static_cast<Extended>(v) * v < -4.0L * static_cast<Extended>(u) * u * Ln80(Extended{u})) {
       break;
     }
   }
@@ -308,7 +332,7 @@ Extended ExponentialVariate(Gen& gen) {
   do {
     u = gen();
   } while (!(u > kTiny));
-  return -std::log(u);
+  return -Ln80(u);
 }
 
 // ---------------------------------------------------------------------------------------------
@@ -318,8 +342,9 @@ Extended ExponentialVariate(Gen& gen) {
 // only where the two sides lie within the bound below does the Extended logarithm decide.
 //
 // ln x in double for a positive x in the normal double range, with a bound on its distance
-// from std::log(x) in Extended: rounding x to double moves ln x by 1.2e-16, the double log is
-// within an ulp (2.3e-16 |ln x|) and so is the Extended one; 5e-16 (1 + |ln x|) covers all.
+// from the Extended logarithm (Ln80, or std::log where the C library's is still used):
+// rounding x to double moves ln x by 1.2e-16, the double log is within an ulp
+// (2.3e-16 |ln x|) and so are the Extended ones; 5e-16 (1 + |ln x|) covers all.
 struct BoundedLog {
   double value;
   double bound;
@@ -370,7 +395,7 @@ Extended GammaLargeShape(Extended shape, Gen& gen) {
       if (settled == Settled::kYes) return d * t;
       if (settled == Settled::kNo) continue;
     }
-    if (std::log(u) < 0.5L * x2 + d * (1 - t + std::log(t))) return d * t;
+    if (Ln80(u) < 0.5L * x2 + d * (1 - t + Ln80(t))) return d * t;
   }
 }
 
@@ -379,7 +404,7 @@ template <typename Gen>
 Extended GammaSmallShape(Extended shape, Gen& gen) {
   if (shape < kTiny) RaiseMathError(rsShapeTooSmall);
   const Extended t = 1 - shape;
-  const Extended p = t / (t + shape * std::exp(-t));
+  const Extended p = t / (t + shape * Exp80(-t));
   // Below the floor w0 = p (Tiny / t)^Shape the body's candidate would underflow: such a draw
   // gives 0 at once. The power is costly, so w0 (and t ln t, needed by the tail only) are
   // computed on first use. Since Tiny / t <= 1E-304 and p <= 1, w0 <= exp(-699 Shape): a
@@ -396,6 +421,9 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
   bool haveW0 = false;
   Extended tLnT = 0;
   bool haveTLnT = false;
+  BoundedLog logT{};  // ln t in double, formed on first use like t ln t
+  bool haveLogT = false;
+  bool logTValid = false;
   for (;;) {
     const Extended u = gen();
     if (u >= 1) continue;
@@ -404,10 +432,13 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
     Extended wError = -1;  // -1: w is not known yet
     const bool tail = u > p;
     if (tail) {
-      x = t - std::log((1 - u) / (1 - p));
+      x = t - Ln80((1 - u) / (1 - p));
       BoundedLog logX;
-      BoundedLog logT;
-      if (DoubleLog(x, logX) && DoubleLog(t, logT)) {
+      if (!haveLogT) {
+        logTValid = DoubleLog(t, logT);
+        haveLogT = true;
+      }
+      if (DoubleLog(x, logX) && logTValid) {
         const Extended lnX = logX.value;
         const Extended lnT = logT.value;
         w = t * lnX - t * lnT;
@@ -445,14 +476,14 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
     }
     if (tail) {
       if (!haveTLnT) {
-        tLnT = t * std::log(t);
+        tLnT = t * Ln80(t);
         haveTLnT = true;
       }
-      w = t * std::log(x) - tLnT;
+      w = t * Ln80(x) - tLnT;
     }
     if (w < 1 - u2) return x;
     if (u2 <= 0) return x;
-    if (u2 * (1 + w) < 1 && w < -std::log(u2)) return x;
+    if (u2 * (1 + w) < 1 && w < -Ln80(u2)) return x;
   }
 }
 
@@ -1314,120 +1345,50 @@ void Randomize() {
 }
 
 // ---------------------------------------------------------------------------------------------
-// The generators: each overload is a forward to its method.
+// The generators, one row each: result, public name, parameters, method, arguments. A row
+// writes both overloads: the one that takes a TRandomGenFunction runs the method on it through
+// WithSource (a known engine behind it is drawn inline, giving the same uniforms), its twin runs
+// the method on a ThreadSource.
+#define TOVRIN_RANDOM_GENERATORS(X)                                                            \
+  X(Extended, Random_Normal, (), StandardNormal, ())                                           \
+  X(Extended, Random_Normal, (Extended Mean, Extended StdDev), NormalVariate, (Mean, StdDev))  \
+  X(Extended, Random_LogNormal, (Extended Mean, Extended StdDev), LogNormalVariate,            \
+    (Mean, StdDev))                                                                            \
+  X(Extended, Random_Gamma, (Extended Shape), GammaVariate, (Shape))                           \
+  X(Extended, Random_ChiSq, (LongInt DF), ChiSquareVariate, (DF))                              \
+  X(Extended, Random_Exponential, (), ExponentialVariate, ())                                  \
+  X(Extended, Random_Weibull, (Extended Shape), WeibullVariate, (Shape))                       \
+  X(Extended, Random_Beta, (Extended A, Extended B), BetaVariate, (A, B))                      \
+  X(Extended, Random_T, (LongInt DF), StudentTVariate, (DF))                                   \
+  X(void, Random_MVNorm,                                                                       \
+    (const TQENFloatVector& Means, const TQENFloatVector& Covariance, TQENFloatVector& Factor, \
+     TQENFloatVector& Variate, LongInt& ErrorCode),                                            \
+    MultivariateNormal, (Means, Covariance, Factor, Variate, ErrorCode))                       \
+  X(Extended, Random_Inv_Gauss, (Extended Lambda, Extended Omega), InverseGaussianVariate,     \
+    (Lambda, Omega))                                                                           \
+  X(Int64, Random_Binomial1, (LongInt N, Extended P), BinomialFromMode, (N, P))                \
+  X(Int64, Random_Binomial2, (Int64 N, Extended P), BinomialVariate, (N, P))                   \
+  X(Int64, Random_Neg_Binomial, (Extended R, Extended P), NegativeBinomialVariate, (R, P))     \
+  X(Extended, Random_von_Mises, (Extended K), VonMisesVariate, (K))                            \
+  X(Extended, Random_Cauchy, (), CauchyVariate, ())                                            \
+  X(Int64, Random_Poisson, (const Extended& Mu), PoissonVariate, (Mu))
 
-Extended Random_Normal(TRandomGenFunction Gen) { return StandardNormal(Gen); }
-Extended Random_Normal() {
-  ThreadSource gen;
-  return StandardNormal(gen);
-}
-Extended Random_Normal(Extended Mean, Extended StdDev, TRandomGenFunction Gen) {
-  return NormalVariate(Mean, StdDev, Gen);
-}
-Extended Random_Normal(Extended Mean, Extended StdDev) {
-  ThreadSource gen;
-  return NormalVariate(Mean, StdDev, gen);
-}
-Extended Random_LogNormal(Extended Mean, Extended StdDev, TRandomGenFunction Gen) {
-  return LogNormalVariate(Mean, StdDev, Gen);
-}
-Extended Random_LogNormal(Extended Mean, Extended StdDev) {
-  ThreadSource gen;
-  return LogNormalVariate(Mean, StdDev, gen);
-}
+// A parenthesised list without its parentheses, followed by a comma unless it is empty.
+#define TOVRIN_LEADING(...) __VA_ARGS__ __VA_OPT__(, )
+#define TOVRIN_UNPARENTHESISED(...) __VA_ARGS__
 
-Extended Random_Gamma(Extended Shape, TRandomGenFunction Gen) { return GammaVariate(Shape, Gen); }
-Extended Random_Gamma(Extended Shape) {
-  ThreadSource gen;
-  return GammaVariate(Shape, gen);
-}
-Extended Random_ChiSq(LongInt DF, TRandomGenFunction Gen) { return ChiSquareVariate(DF, Gen); }
-Extended Random_ChiSq(LongInt DF) {
-  ThreadSource gen;
-  return ChiSquareVariate(DF, gen);
-}
-Extended Random_Exponential(TRandomGenFunction Gen) { return ExponentialVariate(Gen); }
-Extended Random_Exponential() {
-  ThreadSource gen;
-  return ExponentialVariate(gen);
-}
-Extended Random_Weibull(Extended Shape, TRandomGenFunction Gen) {
-  return WeibullVariate(Shape, Gen);
-}
-Extended Random_Weibull(Extended Shape) {
-  ThreadSource gen;
-  return WeibullVariate(Shape, gen);
-}
-
-Extended Random_Beta(Extended A, Extended B, TRandomGenFunction Gen) {
-  return BetaVariate(A, B, Gen);
-}
-Extended Random_Beta(Extended A, Extended B) {
-  ThreadSource gen;
-  return BetaVariate(A, B, gen);
-}
-Extended Random_T(LongInt DF, TRandomGenFunction Gen) { return StudentTVariate(DF, Gen); }
-Extended Random_T(LongInt DF) {
-  ThreadSource gen;
-  return StudentTVariate(DF, gen);
-}
-
-void Random_MVNorm(const TQENFloatVector& Means, const TQENFloatVector& Covariance,
-                   TQENFloatVector& Factor, TQENFloatVector& Variate, LongInt& ErrorCode,
-                   TRandomGenFunction Gen) {
-  MultivariateNormal(Means, Covariance, Factor, Variate, ErrorCode, Gen);
-}
-void Random_MVNorm(const TQENFloatVector& Means, const TQENFloatVector& Covariance,
-                   TQENFloatVector& Factor, TQENFloatVector& Variate, LongInt& ErrorCode) {
-  ThreadSource gen;
-  MultivariateNormal(Means, Covariance, Factor, Variate, ErrorCode, gen);
-}
-
-Extended Random_Inv_Gauss(Extended Lambda, Extended Omega, TRandomGenFunction Gen) {
-  return InverseGaussianVariate(Lambda, Omega, Gen);
-}
-Extended Random_Inv_Gauss(Extended Lambda, Extended Omega) {
-  ThreadSource gen;
-  return InverseGaussianVariate(Lambda, Omega, gen);
-}
-
-Int64 Random_Binomial1(LongInt N, Extended P, TRandomGenFunction Gen) {
-  return BinomialFromMode(N, P, Gen);
-}
-Int64 Random_Binomial1(LongInt N, Extended P) {
-  ThreadSource gen;
-  return BinomialFromMode(N, P, gen);
-}
-Int64 Random_Binomial2(Int64 N, Extended P, TRandomGenFunction Gen) {
-  return BinomialVariate(N, P, Gen);
-}
-Int64 Random_Binomial2(Int64 N, Extended P) {
-  ThreadSource gen;
-  return BinomialVariate(N, P, gen);
-}
-Int64 Random_Neg_Binomial(Extended R, Extended P, TRandomGenFunction Gen) {
-  return NegativeBinomialVariate(R, P, Gen);
-}
-Int64 Random_Neg_Binomial(Extended R, Extended P) {
-  ThreadSource gen;
-  return NegativeBinomialVariate(R, P, gen);
-}
-
-Extended Random_von_Mises(Extended K, TRandomGenFunction Gen) { return VonMisesVariate(K, Gen); }
-Extended Random_von_Mises(Extended K) {
-  ThreadSource gen;
-  return VonMisesVariate(K, gen);
-}
-Extended Random_Cauchy(TRandomGenFunction Gen) { return CauchyVariate(Gen); }
-Extended Random_Cauchy() {
-  ThreadSource gen;
-  return CauchyVariate(gen);
-}
-
-Int64 Random_Poisson(const Extended& Mu, TRandomGenFunction Gen) { return PoissonVariate(Mu, Gen); }
-Int64 Random_Poisson(const Extended& Mu) {
-  ThreadSource gen;
-  return PoissonVariate(Mu, gen);
-}
+#define TOVRIN_DEFINE_GENERATOR(Result, Name, Params, Method, Args)                           \
+  Result Name(TOVRIN_LEADING Params TRandomGenFunction Gen) {                                 \
+    return WithSource(Gen, [&](auto& source) { return Method(TOVRIN_LEADING Args source); }); \
+  }                                                                                           \
+  Result Name(TOVRIN_UNPARENTHESISED Params) {                                                \
+    ThreadSource gen;                                                                         \
+    return Method(TOVRIN_LEADING Args gen);                                                   \
+  }
+TOVRIN_RANDOM_GENERATORS(TOVRIN_DEFINE_GENERATOR)
+#undef TOVRIN_DEFINE_GENERATOR
+#undef TOVRIN_UNPARENTHESISED
+#undef TOVRIN_LEADING
+#undef TOVRIN_RANDOM_GENERATORS
 
 }  // namespace tovrin

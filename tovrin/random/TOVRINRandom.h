@@ -11,8 +11,10 @@
 // the Int64 range raises rsInvalidValue instead (the conversion would be undefined).
 #pragma once
 
+#include <concepts>
 #include <cstdint>
 #include <memory>
+#include <random>
 #include <type_traits>
 
 #include "tovrin/foundation/TOVRINFoundation.h"
@@ -40,40 +42,110 @@ Extended VerdanRandom();
 void SetRandSeed(std::uint64_t Seed);
 void Randomize();
 
+namespace detail {
+// bits * 2^-64, exact in the 64-bit mantissa. The word is loaded as a signed integer and moved
+// up by 2^63, which avoids the branch of an unsigned conversion.
+inline Extended UniformFromBits(std::uint64_t bits) {
+  const auto shifted = static_cast<std::int64_t>(bits ^ 0x8000000000000000ULL);
+  return (static_cast<Extended>(shifted) + 0x1p63L) * 0x1p-64L;
+}
+// The same uniform rounded to double, without the trip through the 80-bit type: the top 53
+// bits and the last 11, each exact as a double, added with one rounding to nearest, which is
+// the rounding of the exact uniform.
+inline double UniformDoubleFromBits(std::uint64_t bits) {
+  return static_cast<double>(static_cast<std::int64_t>(bits >> 11)) * 0x1p-53 +
+         static_cast<double>(static_cast<std::int64_t>(bits & 0x7FF)) * 0x1p-64;
+}
+// The 64 bits of one uniform from an engine of 64 full bits, or of two words of one of 32 (the
+// first giving the low half), as std::generate_canonical<long double, 64> combines them.
+template <typename T>
+inline std::uint64_t EngineWord64(T& engine) {
+  if constexpr (static_cast<std::uint64_t>(T::max()) == 0xFFFFFFFFULL) {
+    const auto low = static_cast<std::uint64_t>(engine());
+    return low | (static_cast<std::uint64_t>(engine()) << 32);
+  } else {
+    return static_cast<std::uint64_t>(engine());
+  }
+}
+}  // namespace detail
+
 // A reference to a uniform source: a function of no arguments returning an Extended uniform on
 // [0, 1). It accepts a plain function (`Extended MyUniform()`), a function pointer, or any
 // callable object such as a capturing lambda. It does not own or copy the callable: it holds a
 // pointer to it, so the callable must outlive every call made through the reference (a lambda
 // written in the argument list of a generator call lives long enough). Copying the reference
 // and calling through it never allocates. A function pointer passed in must not be null.
+//
+// A uniform random bit generator (std::mt19937_64, std::mt19937, ...) is accepted too, by
+// reference like a callable, and gives the uniforms std::generate_canonical<long double, 64>
+// would make of it: word * 2^-64 for a 64-bit engine, (first + second * 2^32) * 2^-64 for a
+// 32-bit one. Those two kinds are converted without a detour; the generators that work with
+// uniforms rounded to double (the normal) take them rounded from the bits directly.
 class TRandomGenFunction {
  public:
   template <typename F>
   requires(!std::is_same_v<std::remove_cvref_t<F>, TRandomGenFunction> &&
+           !std::uniform_random_bit_generator<std::remove_cvref_t<F>> &&
            std::is_invocable_r_v<Extended, F&>) TRandomGenFunction(F&& Source)
   noexcept {  // NOLINT: implicit by design
     using T = std::remove_reference_t<F>;
     using Plain = std::remove_cvref_t<F>;
     if constexpr (std::is_function_v<T>) {
       target_.function = reinterpret_cast<void (*)()>(&Source);
-      call_ = &CallFunction<T*>;
+      calls_ = &kCalls<CallFunction<T*>>;
     } else if constexpr (std::is_pointer_v<Plain> &&
                          std::is_function_v<std::remove_pointer_t<Plain>>) {
       target_.function = reinterpret_cast<void (*)()>(Source);
-      call_ = &CallFunction<Plain>;
+      calls_ = &kCalls<CallFunction<Plain>>;
     } else {
       target_.object = const_cast<void*>(static_cast<const void*>(std::addressof(Source)));
-      call_ = &CallObject<T>;
+      calls_ = &kCalls<CallObject<T>>;
     }
   }
 
-  Extended operator()() const { return call_(target_); }
+  template <typename G>
+  requires(std::uniform_random_bit_generator<std::remove_cvref_t<G>> &&
+           !std::is_const_v<std::remove_reference_t<G>>) TRandomGenFunction(G&& Engine)
+  noexcept {  // NOLINT: implicit by design
+    using T = std::remove_reference_t<G>;
+    target_.object = static_cast<void*>(std::addressof(Engine));
+    if constexpr (kFullWords<T>) {
+      calls_ = &kEngineCalls<T>;
+    } else {
+      calls_ = &kCalls<CallCanonical<T>>;
+    }
+  }
+
+  Extended operator()() const { return calls_->extended(target_); }
+  // The next uniform rounded to double: static_cast<double>((*this)()), which a bit generator
+  // gives without the 80-bit value.
+  double NextDouble() const { return calls_->rounded(target_); }
+  // The engine this reference was made from if it is a bit generator of type T (one of 32 or
+  // 64 full bits), else null: a generator may then draw its words inline.
+  template <typename T>
+  T* EngineOf() const {
+    if constexpr (kFullWords<T>) {
+      if (calls_ == &kEngineCalls<T>) return static_cast<T*>(target_.object);
+    }
+    return nullptr;
+  }
 
  private:
   union Target {
     void* object;
     void (*function)();
   };
+  struct Calls {
+    Extended (*extended)(Target);
+    double (*rounded)(Target);
+  };
+  template <Extended (*Call)(Target)>
+  static double Rounded(Target t) {
+    return static_cast<double>(Call(t));
+  }
+  template <Extended (*Call)(Target)>
+  static constexpr Calls kCalls{Call, &Rounded<Call>};
+
   template <typename Pointer>
   static Extended CallFunction(Target t) {
     return static_cast<Extended>(reinterpret_cast<Pointer>(t.function)());
@@ -83,8 +155,32 @@ class TRandomGenFunction {
     return static_cast<Extended>((*static_cast<T*>(t.object))());
   }
 
+  // Engines whose words are 32 or 64 full bits.
+  template <typename T>
+  static constexpr bool kFullWords = T::min() == 0 &&
+                                     (static_cast<std::uint64_t>(T::max()) == 0xFFFFFFFFULL ||
+                                      static_cast<std::uint64_t>(T::max()) == ~std::uint64_t{0});
+  template <typename T>
+  static std::uint64_t Word64(Target t) {
+    return detail::EngineWord64(*static_cast<T*>(t.object));
+  }
+  template <typename T>
+  static Extended EngineUniform(Target t) {
+    return detail::UniformFromBits(Word64<T>(t));
+  }
+  template <typename T>
+  static double EngineDouble(Target t) {
+    return detail::UniformDoubleFromBits(Word64<T>(t));
+  }
+  template <typename T>
+  static constexpr Calls kEngineCalls{&EngineUniform<T>, &EngineDouble<T>};
+  template <typename T>
+  static Extended CallCanonical(Target t) {
+    return std::generate_canonical<long double, 64>(*static_cast<T*>(t.object));
+  }
+
   Target target_;
-  Extended (*call_)(Target);
+  const Calls* calls_;
 };
 
 // --- Normal and log-normal ---

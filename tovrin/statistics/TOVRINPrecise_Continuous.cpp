@@ -4,47 +4,27 @@
 #include <limits>
 #include <utility>
 
-#include "tovrin/foundation/TOVRINErrors.h"
-#include "tovrin/foundation/TOVRINMath.h"
-#include "tovrin/foundation/detail/IncompleteTails.h"
-#include "tovrin/statistics/TOVRINPrecise.h"
 #include "tovrin/statistics/TOVRINStatistics_Continuous.h"
-#include "tovrin/statistics/detail/PairArithmetic.h"
+#include "tovrin/statistics/detail/PreciseCommon.h"
 
 namespace tovrin::precise {
 namespace {
 
-using detail::Pair;
-using detail::RaiseMathError;
-using detail::Tails;
+using namespace common;  // NOLINT: the family's shared names
+using detail::Exp80;
+using detail::Ln80;
 
-constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
-constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
 // 1/sqrt(2) as hi + lo, 1/sqrt(2 pi) and 2/sqrt(pi).
 constexpr Extended kInvSqrt2 = 0.707106781186547524381894036516L;
 constexpr Extended kInvSqrt2Lo = 1.895032558893257079655062e-20L;
 constexpr Extended kInvSqrt2Pi = 0.398942280401432677939946059934381868L;
 constexpr Extended kTwoOverSqrtPi = 1.12837916709551257389615890312154517L;
 
-// --- Checks, as the classic functions make them ---------------------------------------------
+// --- Checks, as the classic functions make them (detail/DistributionChecks.h) ---------------
 
-void CheckStdDev(Extended StdDev) {
-  if (!FloatIsPositive(StdDev)) RaiseMathError(rsStdDev);
-}
-void CheckInverseStdDev(Extended StdDev) {
-  if (FloatIsZero(StdDev) || FloatIsNegative(StdDev)) RaiseMathError(rsStdDev);
-}
-void CheckOpenProbability(Extended P) {
-  if (!(P > 0 && P < 1)) RaiseMathError(rsValue01);
-}
-void CheckClosedProbability(Extended P) {
-  if (!(P >= 0 && P <= 1)) RaiseMathError(rsValue01Inc);
-}
+// Degrees of freedom are Extended here.
 void CheckDF(Extended DF) {
   if (!(DF > 0)) RaiseMathError(rsDF);
-}
-void CheckBetaShapes(Extended A, Extended B) {
-  if (!(A > 0) || !(B > 0)) RaiseMathError(rsValueGZero);
 }
 
 // --- Normal tails -----------------------------------------------------------------------------
@@ -58,17 +38,34 @@ Extended NormalUpper(const Pair& z) {
   // The correction is x.lo erfc'(x.hi), at most 2 x^2 units in the last place of erfc for
   // x > 0 and less than one below: below x = 2 it is not worth its exp.
   if (x.lo != 0.0L && x.hi > 2.0L && x.hi < 110.0L) {
-    e -= x.lo * kTwoOverSqrtPi * std::exp(-x.hi * x.hi);
+    e -= x.lo * kTwoOverSqrtPi * Exp80(-x.hi * x.hi);
   }
   return 0.5L * e;
 }
 
-// exp(-z^2 / 2) for z = hi + lo, with z^2 carried exactly.
-Extended ExpMinusHalfSquare(const Pair& z) {
-  Pair s = detail::ExactProduct(z.hi, z.hi);
-  if (!(s.hi < 30000.0L)) return std::isnan(s.hi) ? kNaN : 0.0L;
-  s.lo += 2.0L * z.hi * z.lo;
-  return std::exp(-0.5L * s.hi) * (1.0L - 0.5L * s.lo);
+// The upper half (32 bits) of x for |x| <= 2^8000 (Veltkamp's split): products of two such
+// halves are exact, and x minus its half is exact too.
+Extended UpperHalf(Extended x) {
+  const Extended t = 4294967297.0L * x;  // 2^32 + 1
+  return t - (t - x);
+}
+
+// e^(-z^2 / 2) for z = h + l with h of 32 bits and |l| < 2^-31 |h|: z^2 = h^2 + (2 h + l) l,
+// the first term exact, the sum renormalised for Exp80 (the rounding of z^2 in one piece would
+// cost z^2 / 2 units in the last place).
+Extended ExpMinusHalfSquareOfHalves(Extended h, Extended l) {
+  const Extended h2 = h * h;
+  const Extended rest = (h + h + l) * l;
+  const Extended s = h2 + rest;
+  return Exp80(-0.5L * s, -0.5L * (rest - (s - h2)));
+}
+
+// e^(-z^2 / 2) for z = hi + lo (|lo| a few units in the last place of hi); 0 beyond |z| = 152,
+// where it is below the smallest subnormal.
+Extended ExpMinusHalfSquare(Extended hi, Extended lo) {
+  if (!(std::fabs(hi) < 152.0L)) return std::isnan(hi) ? kNaN : 0.0L;
+  const Extended h = UpperHalf(hi);
+  return ExpMinusHalfSquareOfHalves(h, (hi - h) + lo);
 }
 
 // (X - Mean) / StdDev to twice the working precision.
@@ -76,27 +73,61 @@ Pair Standardized(Extended Mean, Extended StdDev, Extended X) {
   return detail::Quotient(detail::ExactSum(X, -Mean), Pair{StdDev});
 }
 
-// The z >= 0 with P(Z > z) = p, for 0 < p <= 1/2: Wichura's AS 241 (the classic InvNormalLess,
-// good to about 1e-16) as the first estimate, then Halley steps on erf near the centre and on
-// the upper tail beyond. Halley's method triples the correct digits, so once a step is below
-// 1e-7 relative the result is exact to the working precision and no further step is needed.
-Extended InverseNormalUpper(Extended p) {
-  if (p == 0.5L) return 0.0L;
-  const bool central = p > 0.3L;
-  Extended z = -tovrin::InvNormalLess(p);
-  for (int i = 0; i < 20; ++i) {
-    // The tail and density need no argument carried to twice the precision here: an error of
-    // z^2 eps in Q(z) moves the root by only z eps.
-    const Extended density = kInvSqrt2Pi * std::exp(-0.5L * z * z);
-    // u = f / f' for f increasing in z (0.5 erf(z / sqrt 2) - (0.5 - p), or p - Q(z)).
-    const Extended x = z * kInvSqrt2;
-    const Extended f = central ? 0.5L * std::erf(x) - (0.5L - p) : p - 0.5L * std::erfc(x);
-    const Extended u = f / density;
-    const Extended step = u / (1.0L + 0.5L * u * z);
-    z -= step;
-    if (!(std::fabs(step) > 1e-7L * std::fabs(z))) break;
+// Scales within 2^(+-1000) have a normal reciprocal and split without overflow (the bounds are
+// doubles, cheap to load).
+bool ScaleInRange(Extended s) { return s >= 0x1p-1000 && s <= 0x1p1000; }
+
+// q = n / d to twice the precision with the reciprocal r = 1 / d given (d within
+// ScaleInRange, |n r| below 2^8000): h is the upper half of n r, so h times either half of d is
+// exact, n - h d is exact (it is 2^-31 of n at most) and l is that remainder times r. One
+// division in all, and few values alive at once for the eight x87 registers.
+Pair HalvesOfQuotient(Extended n, Extended nlo, Extended d, Extended r) {
+  const Extended h = UpperHalf(n * r);
+  const Extended d_hi = UpperHalf(d);
+  return {h, (((n - h * d_hi) - h * (d - d_hi)) + nlo) * r};
+}
+
+// The normal density at X, z = (X - Mean) / StdDev carried to twice the precision.
+Extended NormalDensity(Extended Mean, Extended StdDev, Extended X) {
+  if (!ScaleInRange(StdDev)) {
+    const Pair z = Standardized(Mean, StdDev, X);
+    return kInvSqrt2Pi * ExpMinusHalfSquare(z.hi, z.lo) / StdDev;
   }
-  return z;
+  const Extended inverse = 1.0L / StdDev;
+  const Pair d = detail::ExactSum(X, -Mean);
+  const Extended rounded = d.hi * inverse;
+  if (!(std::fabs(rounded) < 152.0L)) return std::isnan(rounded) ? kNaN : 0.0L;
+  const Pair z = HalvesOfQuotient(d.hi, d.lo, StdDev, inverse);
+  return kInvSqrt2Pi * inverse * ExpMinusHalfSquareOfHalves(z.hi, z.lo);
+}
+
+#include "tovrin/statistics/TOVRINPrecise_InvNormal.inc"
+
+// c[0] + c[1] t + ... + c[N-1] t^(N-1) as Horner's rule in t^2 over the pairs c[i] + c[i+1] t:
+// half the dependent steps of the plain rule, the same rounding for coefficients of one sign.
+template <int N>
+Extended Polynomial(const Extended (&c)[N], Extended t) {
+  const Extended t2 = t * t;
+  Extended v = N % 2 == 1 ? c[N - 1] : c[N - 2] + c[N - 1] * t;
+  for (int i = N % 2 == 1 ? N - 3 : N - 4; i >= 0; i -= 2) v = v * t2 + (c[i] + c[i + 1] * t);
+  return v;
+}
+
+// The z >= 0 with P(Z > z) = p, for 0 < p <= 1/2, from the rational approximations fitted by
+// TOVRINPrecise_InvNormal.py (about 1e-20 relative): in q = 1/2 - p for p >= 0.075, beyond in
+// r = sqrt(-ln p) on six intervals up to the smallest subnormal p. No correction step follows:
+// the rounding of ln p moves z by about one unit in the last place.
+Extended InverseNormalUpper(Extended p) {
+  if (p >= 0.075L) {
+    const Extended q = 0.5L - p;
+    const Extended v = kInvNormalCentralEdge - q * q;
+    return q * Polynomial(kInvNormalCentralP, v) / Polynomial(kInvNormalCentralQ, v);
+  }
+  const Extended r = std::sqrt(-Ln80(p));
+  int k = 0;
+  while (k + 1 < kInvNormalTailRegions && r >= kInvNormalTailStart[k + 1]) ++k;
+  const Extended s = r - kInvNormalTailStart[k];
+  return r * Polynomial(kInvNormalTailP[k], s) / Polynomial(kInvNormalTailQ[k], s);
 }
 
 // The z with P(Z < z) = P for 0 < P < 1 (1 - P is exact where it is used).
@@ -108,9 +139,9 @@ Extended InverseNormalLess(Extended P) {
 
 // First estimate of the x with P(a, x) = p and Q(a, x) = q: for a = 1/2, Q = 2 P(Z > sqrt(2x))
 // exactly; for a >= 1 Wilson and Hilferty's cube; otherwise, or where that fails, the lower
-// tail's power law x^a / Gamma(a + 1) (with its first correction, e^-x ~ 1 - a x / (a + 1))
-// while x is small, and the upper tail's x^(a - 1) e^-x / Gamma(a) (1 + (a - 1) / x) beyond,
-// solved by two fixed-point steps.
+// tail's power law x^a / Gamma(a + 1) in the lower tail or while x is small (with its first
+// correction x e^(x / (a + 1)) below x = a + 1), and the upper tail's
+// x^(a - 1) e^-x / Gamma(a) (1 + (a - 1) / x) beyond, solved by two fixed-point steps.
 Extended InverseGammaStart(Extended a, Extended p, Extended q) {
   const bool use_lower = p <= q;
   if (a == 0.5L && !use_lower) {
@@ -124,8 +155,8 @@ Extended InverseGammaStart(Extended a, Extended p, Extended q) {
     if (base > 0.1L) return a * base * base * base;
   }
   Extended x = std::exp((std::log(p) + LnGamma(a + 1.0L)) / a);
-  if (x < 0.5L || (use_lower && !(x > 1.0L))) {
-    x *= std::exp(x / (a + 1.0L));
+  if (use_lower || x < 0.5L) {
+    if (x < a + 1.0L) x *= std::exp(x / (a + 1.0L));
   } else {
     const Extended level = -std::log(q) - LnGamma(a);
     x = std::fmax(1.0L, level);
@@ -309,7 +340,7 @@ Extended BetaDensityAt(const std::pair<Pair, Pair>& xy, Extended A, Extended B) 
 
 // === Standard normal ============================================================================
 
-Extended NormalZ(Extended Z) { return kInvSqrt2Pi * ExpMinusHalfSquare(Pair{Z}); }
+Extended NormalZ(Extended Z) { return kInvSqrt2Pi * ExpMinusHalfSquare(Z, 0.0L); }
 
 Extended NormalLess(Extended Z) { return NormalUpper(Pair{-Z}); }
 
@@ -331,11 +362,7 @@ Extended ZAlpha(Extended Alpha) { return InvNormalDistGreater(0, 1, Alpha); }
 
 Extended NormalPDF(Extended Mean, Extended StdDev, Extended X) {
   CheckStdDev(StdDev);
-  // Within four standard deviations the plain quotient is enough: its rounding moves the
-  // exponent z^2 / 2 by at most 16 units in the last place of 1, far inside the bound.
-  const Extended z = (X - Mean) / StdDev;
-  if (std::fabs(z) < 4.0L) return kInvSqrt2Pi * std::exp(-0.5L * z * z) / StdDev;
-  return kInvSqrt2Pi * ExpMinusHalfSquare(Standardized(Mean, StdDev, X)) / StdDev;
+  return NormalDensity(Mean, StdDev, X);
 }
 
 Extended NormalDistLess(Extended Mean, Extended StdDev, Extended X) {
@@ -366,28 +393,28 @@ Extended InvNormalDistGreater(Extended Mean, Extended StdDev, Extended P) {
 Extended LogNormalPDF(Extended Mean, Extended StdDev, Extended X) {
   CheckStdDev(StdDev);
   if (!(X > 0)) RaiseMathError(rsValueGZero);
-  return NormalPDF(Mean, StdDev, std::log(X)) / X;
+  return NormalDensity(Mean, StdDev, Ln80(X)) / X;
 }
 
 Extended LogNormalLess(Extended Mean, Extended StdDev, Extended X) {
   CheckStdDev(StdDev);
   if (std::isnan(X)) return kNaN;
   if (X <= 0) return 0;
-  return NormalDistLess(Mean, StdDev, std::log(X));
+  return NormalDistLess(Mean, StdDev, Ln80(X));
 }
 
 Extended LogNormalGreater(Extended Mean, Extended StdDev, Extended X) {
   CheckStdDev(StdDev);
   if (std::isnan(X)) return kNaN;
   if (X <= 0) return 1;
-  return NormalDistGreater(Mean, StdDev, std::log(X));
+  return NormalDistGreater(Mean, StdDev, Ln80(X));
 }
 
 namespace {
 // exp(Mean + StdDev z) with the exponent carried to twice the working precision.
 Extended ExpOfAffine(Extended Mean, Extended StdDev, Extended z) {
   const Pair e = detail::Sum(detail::ExactProduct(StdDev, z), Pair{Mean});
-  return std::exp(e.hi) * (1.0L + e.lo);
+  return Exp80(e.hi, e.lo);
 }
 }  // namespace
 
@@ -578,86 +605,108 @@ Extended ExponentialLess(Extended Mean, Extended X) {
 }
 
 namespace {
-// e^-q for q = X / Mean >= 0. The rounding of q moves e^-q by q units in the last place, so
-// below q = 16 the rounded quotient serves; beyond, q is carried to twice the precision.
-Extended ExpMinusRatio(Extended X, Extended Mean) {
-  const Extended rounded = X / Mean;
-  if (rounded < 16.0L) return std::exp(-rounded);
-  const Pair q = detail::Quotient(Pair{X}, Pair{Mean});
-  if (!(q.hi < 12000.0L)) return std::isnan(q.hi) ? kNaN : 0.0L;
-  return std::exp(-q.hi) * (1.0L - q.lo);
+// e^-q for q = X / Mean >= 0, divided by Mean as well for the density. The rounding of q
+// would move e^-q by q units in the last place, so q is carried to twice the precision, with
+// one division as for the normal density.
+Extended ExpMinusRatio(Extended X, Extended Mean, bool density) {
+  if (!ScaleInRange(Mean)) {
+    const Pair q = detail::Quotient(Pair{X}, Pair{Mean});
+    if (!(q.hi < 12000.0L)) return std::isnan(q.hi) ? kNaN : 0.0L;
+    const Extended e = Exp80(-q.hi, -q.lo);
+    return density ? e / Mean : e;
+  }
+  const Extended inverse = 1.0L / Mean;
+  if (!(X * inverse < 12000.0L)) return std::isnan(X * inverse) ? kNaN : 0.0L;
+  const Pair q = HalvesOfQuotient(X, 0.0L, Mean, inverse);
+  const Extended s = q.hi + q.lo;
+  const Extended e = Exp80(-s, (s - q.hi) - q.lo);
+  return density ? e * inverse : e;
 }
 }  // namespace
 
 Extended ExponentialGreater(Extended Mean, Extended X) {
   if (Mean <= 0 || X < 0) RaiseMathError(rsExpDistInvalid);
-  return ExpMinusRatio(X, Mean);
+  return ExpMinusRatio(X, Mean, false);
 }
 
 Extended ExponentialPDF(Extended X, Extended Mean) {
   if (!(Mean > 0) || X < 0) RaiseMathError(rsExpDistInvalid);
-  return ExpMinusRatio(X, Mean) / Mean;
+  return ExpMinusRatio(X, Mean, true);
 }
 
 // === Beta =======================================================================================
 
-Extended BetaDistLess(Extended X, Extended A, Extended B) {
+namespace {
+// The point (x, 1 - x) after the checks: X on [0, 1] (width 1), or X mapped from
+// [Lower, Upper] (the width of the interval).
+struct BetaPoint {
+  std::pair<Pair, Pair> xy;
+  Extended width;
+};
+BetaPoint CheckedBetaPoint(Extended X, Extended A, Extended B) {
   CheckBetaShapes(A, B);
-  return BetaDistTails(UnitPoint(X), A, B).lower;
+  return {UnitPoint(X), 1.0L};
+}
+BetaPoint CheckedBetaPoint(Extended X, Extended A, Extended B, Extended Lower, Extended Upper) {
+  const auto [low, high] = BetaInterval(Lower, Upper);
+  CheckBetaShapes(A, B);
+  return {IntervalPoint(X, low, high), high - low};
+}
+
+// The root with P below it (above it for Greater) after the checks, on [0, 1] or mapped to
+// [Lower, Upper] from whichever end is nearer.
+detail::BetaRoot CheckedBetaRoot(Extended P, Extended A, Extended B, bool greater) {
+  CheckClosedProbability(P);
+  CheckBetaShapes(A, B);
+  return greater ? BetaRoot(1.0L - P, P, A, B) : BetaRoot(P, 1.0L - P, A, B);
+}
+Extended CheckedBetaRoot(Extended P, Extended A, Extended B, Extended Lower, Extended Upper,
+                         bool greater) {
+  const auto [low, high] = BetaInterval(Lower, Upper);
+  const detail::BetaRoot r = CheckedBetaRoot(P, A, B, greater);
+  return r.x <= 0.5L ? low + (high - low) * r.x : high - (high - low) * r.y;
+}
+}  // namespace
+
+Extended BetaDistLess(Extended X, Extended A, Extended B) {
+  return BetaDistTails(CheckedBetaPoint(X, A, B).xy, A, B).lower;
 }
 
 Extended BetaDistLess(Extended X, Extended A, Extended B, Extended Lower, Extended Upper) {
-  const auto [low, high] = BetaInterval(Lower, Upper);
-  CheckBetaShapes(A, B);
-  return BetaDistTails(IntervalPoint(X, low, high), A, B).lower;
+  return BetaDistTails(CheckedBetaPoint(X, A, B, Lower, Upper).xy, A, B).lower;
 }
 
 Extended BetaDistGreater(Extended X, Extended A, Extended B) {
-  CheckBetaShapes(A, B);
-  return BetaDistTails(UnitPoint(X), A, B).upper;
+  return BetaDistTails(CheckedBetaPoint(X, A, B).xy, A, B).upper;
 }
 
 Extended BetaDistGreater(Extended X, Extended A, Extended B, Extended Lower, Extended Upper) {
-  const auto [low, high] = BetaInterval(Lower, Upper);
-  CheckBetaShapes(A, B);
-  return BetaDistTails(IntervalPoint(X, low, high), A, B).upper;
+  return BetaDistTails(CheckedBetaPoint(X, A, B, Lower, Upper).xy, A, B).upper;
 }
 
 Extended InvBetaDistLess(Extended P, Extended A, Extended B) {
-  CheckClosedProbability(P);
-  CheckBetaShapes(A, B);
-  return BetaRoot(P, 1.0L - P, A, B).x;
+  return CheckedBetaRoot(P, A, B, false).x;
 }
 
 Extended InvBetaDistLess(Extended P, Extended A, Extended B, Extended Lower, Extended Upper) {
-  const auto [low, high] = BetaInterval(Lower, Upper);
-  const detail::BetaRoot r =
-      (CheckClosedProbability(P), CheckBetaShapes(A, B), BetaRoot(P, 1.0L - P, A, B));
-  return r.x <= 0.5L ? low + (high - low) * r.x : high - (high - low) * r.y;
+  return CheckedBetaRoot(P, A, B, Lower, Upper, false);
 }
 
 Extended InvBetaDistGreater(Extended P, Extended A, Extended B) {
-  CheckClosedProbability(P);
-  CheckBetaShapes(A, B);
-  return BetaRoot(1.0L - P, P, A, B).x;
+  return CheckedBetaRoot(P, A, B, true).x;
 }
 
 Extended InvBetaDistGreater(Extended P, Extended A, Extended B, Extended Lower, Extended Upper) {
-  const auto [low, high] = BetaInterval(Lower, Upper);
-  const detail::BetaRoot r =
-      (CheckClosedProbability(P), CheckBetaShapes(A, B), BetaRoot(1.0L - P, P, A, B));
-  return r.x <= 0.5L ? low + (high - low) * r.x : high - (high - low) * r.y;
+  return CheckedBetaRoot(P, A, B, Lower, Upper, true);
 }
 
 Extended BetaPDF(Extended X, Extended A, Extended B) {
-  CheckBetaShapes(A, B);
-  return BetaDensityAt(UnitPoint(X), A, B);
+  return BetaDensityAt(CheckedBetaPoint(X, A, B).xy, A, B);
 }
 
 Extended BetaPDF(Extended X, Extended A, Extended B, Extended Lower, Extended Upper) {
-  const auto [low, high] = BetaInterval(Lower, Upper);
-  CheckBetaShapes(A, B);
-  return BetaDensityAt(IntervalPoint(X, low, high), A, B) / (high - low);
+  const BetaPoint point = CheckedBetaPoint(X, A, B, Lower, Upper);
+  return BetaDensityAt(point.xy, A, B) / point.width;
 }
 
 }  // namespace tovrin::precise

@@ -9,21 +9,13 @@
 #include <cstdint>
 #include <limits>
 
-#include "tovrin/foundation/TOVRINErrors.h"
-#include "tovrin/foundation/TOVRINMath.h"
-#include "tovrin/foundation/detail/Elementary.h"
-#include "tovrin/foundation/detail/IncompleteTails.h"
-#include "tovrin/statistics/TOVRINPrecise.h"
-#include "tovrin/statistics/detail/PairArithmetic.h"
+#include "tovrin/statistics/detail/PreciseCommon.h"
 
 namespace tovrin::precise {
 namespace {
 
-using detail::Pair;
-using detail::RaiseMathError;
-using detail::Tails;
+using namespace common;  // NOLINT: the family's shared names
 
-constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
 constexpr Extended kEpsilon = std::numeric_limits<Extended>::epsilon();
 constexpr Extended kTwoPi = 6.28318530717958647692528676655900577L;
 
@@ -40,7 +32,9 @@ constexpr Extended kStirlingErrorOfCount[] = {
 Extended StirlingError(Extended n) {
   if (n < 12.0L) {
     if (!(n > 0.0L)) return 0.0L;
-    if (n == std::floor(n)) return kStirlingErrorOfCount[static_cast<int>(n) - 1];
+    // Truncated through double: SSE's conversion needs no switch of the x87 rounding mode.
+    const int k = static_cast<int>(static_cast<double>(n));
+    if (k == n) return kStirlingErrorOfCount[k - 1];
   }
   return detail::StirlingRemainder(n);
 }
@@ -156,10 +150,6 @@ void CheckBinomial(Extended P, LongWord N, LongWord R) {
 
 // --- Hypergeometric ---------------------------------------------------------------------------
 
-void CheckHyperGeometric(LongWord N, LongWord S, LongWord M) {
-  if (N == 0 || S == 0 || N < S || N < M) RaiseMathError(rsHyperGeometricInvalid);
-}
-
 // The counts that can occur, [first, last].
 struct CountRange {
   std::int64_t first;
@@ -227,10 +217,6 @@ Tails HyperGeometricSplit(LongWord N, LongWord S, LongWord M, std::int64_t x) {
   return {1.0L - above, above};
 }
 
-void CheckPoisson(Extended Mean) {
-  if (Mean <= 0) RaiseMathError(rsPoissonInvalid);
-}
-
 }  // namespace
 
 // === Binomial ===================================================================================
@@ -274,16 +260,21 @@ Extended HyperGeometricEq(LongWord N, LongWord S, LongWord M, LongWord X) {
   return HyperGeometricPoint(N, S, M, X);
 }
 
-Extended HyperGeometricLess(LongWord N, LongWord S, LongWord M, LongWord X) {
+namespace {
+// P(X < Cut) and P(X >= Cut) after the checks of Less and Greater at X.
+Tails CheckedHyperGeometricSplit(LongWord N, LongWord S, LongWord M, LongWord X, std::int64_t Cut) {
   CheckHyperGeometric(N, S, M);
   if (X > S) RaiseMathError(rsHyperGeometricInvalid);
-  return HyperGeometricSplit(N, S, M, X).lower;
+  return HyperGeometricSplit(N, S, M, Cut);
+}
+}  // namespace
+
+Extended HyperGeometricLess(LongWord N, LongWord S, LongWord M, LongWord X) {
+  return CheckedHyperGeometricSplit(N, S, M, X, X).lower;
 }
 
 Extended HyperGeometricGreater(LongWord N, LongWord S, LongWord M, LongWord X) {
-  CheckHyperGeometric(N, S, M);
-  if (X > S) RaiseMathError(rsHyperGeometricInvalid);
-  return HyperGeometricSplit(N, S, M, std::int64_t{X} + 1).upper;
+  return CheckedHyperGeometricSplit(N, S, M, X, std::int64_t{X} + 1).upper;
 }
 
 // === Poisson ====================================================================================

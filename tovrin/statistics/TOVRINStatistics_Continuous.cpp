@@ -6,22 +6,29 @@
 #include <limits>
 #include <utility>
 
+#include "tovrin/statistics/detail/DistributionChecks.h"
+
 namespace tovrin {
 namespace {
 
 using detail::RaiseMathError;
+using namespace detail::checks;  // NOLINT: the checks shared with the precise family
 
 constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
 constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
 
 // --- Density tables ---------------------------------------------------------------------------
 
-// Builds the N + 1 points XLow + i * step and their densities into local vectors and hands
+// The PDFValues tables: empties the outputs, runs Checks (which raise before anything is built),
+// then builds the N + 1 points XLow + i * step and their densities into local vectors and hands
 // them over only when every point is done, so that a raise leaves the caller's outputs empty.
 // With kZeroBelowZero a negative point gets density 0 without calling Density.
-template <bool kZeroBelowZero, typename Density>
-void FillDensityTable(Extended XLow, Extended XHigh, LongWord N, TQENFloatVector& XValues,
-                      TQENFloatVector& YValues, Density density) {
+template <bool kZeroBelowZero, typename Checks, typename Density>
+void DensityTable(Extended XLow, Extended XHigh, LongWord N, TQENFloatVector& XValues,
+                  TQENFloatVector& YValues, Checks checks, Density density) {
+  XValues.clear();
+  YValues.clear();
+  checks();
   const Extended step = N >= 1 ? (XHigh - XLow) / static_cast<Extended>(N) : Extended(0);
   const std::size_t count = static_cast<std::size_t>(N) + 1;
   TQENFloatVector xs(count);
@@ -35,32 +42,11 @@ void FillDensityTable(Extended XLow, Extended XHigh, LongWord N, TQENFloatVector
   YValues = std::move(ys);
 }
 
-void EmptyTable(TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  XValues.clear();
-  YValues.clear();
-}
-
 // --- Checks -----------------------------------------------------------------------------------
 
-void CheckStdDev(Extended StdDev) {
-  if (!FloatIsPositive(StdDev)) RaiseMathError(rsStdDev);
-}
-// The inverses reject a standard deviation that is zero within the tolerance or negative, so
-// QENTolerance itself passes here while CheckStdDev rejects it (and a NaN gives NaN).
-void CheckInverseStdDev(Extended StdDev) {
-  if (FloatIsZero(StdDev) || FloatIsNegative(StdDev)) RaiseMathError(rsStdDev);
-}
-void CheckOpenProbability(Extended P) {
-  if (!(P > 0 && P < 1)) RaiseMathError(rsValue01);
-}
-void CheckClosedProbability(Extended P) {
-  if (!(P >= 0 && P <= 1)) RaiseMathError(rsValue01Inc);
-}
+// The rest are in detail/DistributionChecks.h.
 void CheckDF(LongWord DF) {
   if (DF == 0) RaiseMathError(rsDF);
-}
-void CheckBetaShapes(Extended A, Extended B) {
-  if (!(A > 0) || !(B > 0)) RaiseMathError(rsValueGZero);
 }
 
 // --- Beta density, shared by the beta and F densities ------------------------------------------
@@ -189,15 +175,79 @@ Extended BisectProbability(Extended P, Extended Low, Extended High, Less less) {
   return mid;
 }
 
-// The same bisection for the t distribution, with the same midpoints and decisions, most of
-// them settled without evaluating StudentTLess.
+// The same bisection with the same midpoints and decisions, most of them settled without
+// evaluating Less.
 //
 // For each end of the bracket whose value has been established, an interval [lo, hi] holding
-// the exact distribution function F there is kept. On a bracket of one sign the density f is
-// monotone, so for a midpoint m beside an established end x
+// the exact distribution function F there is kept. Where the density f is monotone between a
+// midpoint m and an established end x,
 //   F(m) = F(x) + integral of f from x to m  lies within  F(x) + (m - x) [min f, max f],
-// the extremes of f on [x, m] being its values at x and m. f is evaluated in double; its
-// relative error is below 1.2e-15 |E| + 2.3e-16 (|ln scale| + 1) for the exponent
+// the extremes of f on [x, m] being its values at x and m; a unimodal f whose mode lies
+// between them reaches its largest value there instead. density(t, down, up) encloses f(t)
+// (both 0 where it cannot), modeBetween(a, b) tells whether the mode lies between a and b (and
+// then modeDensity(up) bounds f there), and error(m, lo, hi, fUp) bounds how far Less(m) lies
+// from F(m) for F(m) within [lo, hi] and f at most fUp about m (infinite where it is not known).
+// When the interval for F(m), widened by that error, lies beyond P + 1e-16 or below P - 1e-16
+// (with a margin for this function's own rounding), the evaluation could neither stop the
+// search nor decide the other way, and the midpoint is settled without it. Otherwise Less(m)
+// is evaluated and decides as in BisectProbability; its value, widened by the error, becomes
+// the interval at m.
+template <typename Less, typename Density, typename ModeBetween, typename ModeDensity,
+          typename Error>
+Extended BisectEnclosed(Extended P, Extended Low, Extended High, Less less, Density density,
+                        ModeBetween modeBetween, ModeDensity modeDensity, Error error) {
+  constexpr Extended kMargin = 1.01e-16L;
+  struct End {
+    Extended x;
+    Extended lo, hi;      // the exact F(x) lies within
+    Extended fDown, fUp;  // and f(x) within; fUp = 0 when unknown
+  };
+  End low{Low, 0, 1, 0, 0};
+  End high{High, 0, 1, 0, 0};
+  Extended mid = (Low + High) / 2;
+  for (int round = 0; round < 100; ++round) {
+    mid = (low.x + high.x) / 2;
+    Extended fDown, fUp;
+    density(mid, fDown, fUp);
+    // The established end with the narrower interval (both lie half the bracket away).
+    const End* end = nullptr;
+    if (low.fUp > 0) end = &low;
+    if (high.fUp > 0 && (end == nullptr || high.hi - high.lo < end->hi - end->lo)) end = &high;
+    if (fUp > 0 && end != nullptr) {
+      const Extended fLow = fDown < end->fDown ? fDown : end->fDown;
+      Extended fHigh = fUp > end->fUp ? fUp : end->fUp;
+      if (modeBetween(mid, end->x)) fHigh = modeDensity();
+      const Extended delta = mid - end->x;  // exact: both lie within a factor 1.25
+      const Extended lo0 = end->lo + delta * (delta >= 0 ? fLow : fHigh);
+      const Extended hi0 = end->hi + delta * (delta >= 0 ? fHigh : fLow);
+      const Extended pad = 0x1p-60L * (std::fabs(end->hi) + std::fabs(delta) * fHigh);
+      const Extended lo = lo0 - pad;
+      const Extended hi = hi0 + pad;
+      const Extended err = error(mid, lo, hi, fHigh);
+      if ((lo - err) - P > kMargin) {
+        high = End{mid, lo, hi, fDown, fUp};
+        continue;
+      }
+      if (P - (hi + err) > kMargin) {
+        low = End{mid, lo, hi, fDown, fUp};
+        continue;
+      }
+    }
+    const Extended value = less(mid);
+    if (std::fabs(value - P) < 1e-16L) break;
+    const Extended err = error(mid, value, value, fUp);
+    const End here{mid, value - err, value + err, fDown, std::isfinite(err) ? fUp : 0};
+    if (value > P) {
+      high = here;
+    } else {
+      low = here;
+    }
+  }
+  return mid;
+}
+
+// The t distribution: on a bracket of one sign the density f is monotone. f is evaluated in
+// double; its relative error is below 1.2e-15 |E| + 2.3e-16 (|ln scale| + 1) for the exponent
 // E = -(n + 1)/2 log1p(t^2 / n) (the argument, the logarithm, the product and exp, each within
 // 2 units in the last place, and the scale from the 80-bit gamma ratio), here bounded by
 // 2e-15 (|E| + |ln scale| + 1).
@@ -205,11 +255,7 @@ Extended BisectProbability(Extended P, Extended Low, Extended High, Less less) {
 //   Err(m) = 2e-16 Fside + max f 4 u (n + m^2) / (2 |m|) + 1e-18,
 // twice the documented error of IncompleteBeta (1e-16 relative to the two-sided tail 2 Fside,
 // Fside = min(F, 1 - F)), plus what the rounding of its argument n / (n + m^2) by 3 units
-// u = 2^-64 moves F, plus the rounding of the final sums. When the interval for F(m), widened
-// by Err(m), lies beyond P + 1e-16 or below P - 1e-16 (with a margin for this function's own
-// rounding), the evaluation could neither stop the search nor decide the other way, and the
-// midpoint is settled without it. Otherwise StudentTLess(m) is evaluated and decides as in
-// BisectProbability; its value, widened by Err(m), becomes the interval at m.
+// u = 2^-64 moves F, plus the rounding of the final sums.
 Extended BisectStudentT(Extended P, Extended Low, Extended High, LongWord DF) {
   const auto less = [DF](Extended t) { return StudentTLess(t, DF); };
   if (!(Low > 0 || High < 0) || !std::isfinite(Low) || !std::isfinite(High)) {
@@ -225,13 +271,7 @@ Extended BisectStudentT(Extended P, Extended Low, Extended High, LongWord DF) {
   const Extended inner = std::fabs(Low) < std::fabs(High) ? std::fabs(Low) : std::fabs(High);
   const Extended outer = std::fabs(Low) < std::fabs(High) ? std::fabs(High) : std::fabs(Low);
   const Extended argumentFactor = 0x1p-62L * (n + outer * outer) / (2 * inner);
-  constexpr Extended kMargin = 1.01e-16L;
 
-  struct End {
-    Extended x;
-    Extended lo, hi;      // the exact F(x) lies within
-    Extended fDown, fUp;  // and f(x) within; fUp = 0 when unknown
-  };
   // The density's bounds at t; both 0 where the double evaluation could lose range.
   const auto density = [&](Extended t, Extended& down, Extended& up) {
     const double td = static_cast<double>(t);
@@ -250,48 +290,9 @@ Extended BisectStudentT(Extended P, Extended Low, Extended High, LongWord DF) {
     const Extended side = m < 0 ? hi : 1 - lo;
     return 2e-16L * (side > 0 ? side : 0) + fUp * argumentFactor + 1e-18L;
   };
-
-  End low{Low, 0, 1, 0, 0};
-  End high{High, 0, 1, 0, 0};
-  Extended mid = (Low + High) / 2;
-  for (int round = 0; round < 100; ++round) {
-    mid = (low.x + high.x) / 2;
-    Extended fDown, fUp;
-    density(mid, fDown, fUp);
-    // The established end with the narrower interval (both lie half the bracket away).
-    const End* end = nullptr;
-    if (low.fUp > 0) end = &low;
-    if (high.fUp > 0 && (end == nullptr || high.hi - high.lo < end->hi - end->lo)) end = &high;
-    if (fUp > 0 && end != nullptr) {
-      const Extended fLow = fDown < end->fDown ? fDown : end->fDown;
-      const Extended fHigh = fUp > end->fUp ? fUp : end->fUp;
-      const Extended delta = mid - end->x;  // exact: both lie within a factor 1.25
-      const Extended lo0 = end->lo + delta * (delta >= 0 ? fLow : fHigh);
-      const Extended hi0 = end->hi + delta * (delta >= 0 ? fHigh : fLow);
-      const Extended pad = 0x1p-60L * (std::fabs(end->hi) + std::fabs(delta) * fHigh);
-      const Extended lo = lo0 - pad;
-      const Extended hi = hi0 + pad;
-      const Extended err = evaluationError(mid, lo, hi, fHigh);
-      if ((lo - err) - P > kMargin) {
-        high = End{mid, lo, hi, fDown, fUp};
-        continue;
-      }
-      if (P - (hi + err) > kMargin) {
-        low = End{mid, lo, hi, fDown, fUp};
-        continue;
-      }
-    }
-    const Extended value = less(mid);
-    if (std::fabs(value - P) < 1e-16L) break;
-    const Extended err = evaluationError(mid, value, value, fUp);
-    const End here{mid, value - err, value + err, fDown, fUp};
-    if (value > P) {
-      high = here;
-    } else {
-      low = here;
-    }
-  }
-  return mid;
+  return BisectEnclosed(
+      P, Low, High, less, density, [](Extended, Extended) { return false; },
+      [] { return Extended(0); }, evaluationError);
 }
 
 // --- AS 241 -----------------------------------------------------------------------------------
@@ -500,10 +501,9 @@ Extended NormalPDF(Extended Mean, Extended StdDev, Extended X) {
 
 void NormalPDFValues(Extended Mean, Extended StdDev, Extended XLow, Extended XHigh, LongWord N,
                      TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  EmptyTable(XValues, YValues);
-  CheckStdDev(StdDev);
-  FillDensityTable<false>(XLow, XHigh, N, XValues, YValues,
-                          [&](Extended x) { return NormalPDF(Mean, StdDev, x); });
+  DensityTable<false>(
+      XLow, XHigh, N, XValues, YValues, [&] { CheckStdDev(StdDev); },
+      [&](Extended x) { return NormalPDF(Mean, StdDev, x); });
 }
 
 Extended NormalDistLess(Extended Mean, Extended StdDev, Extended X) {
@@ -575,21 +575,31 @@ Extended InvLogNormalGreater(Extended Mean, Extended StdDev, Extended P) {
 
 void LogNormalPDFValues(Extended Mean, Extended StdDev, Extended XLow, Extended XHigh, LongWord N,
                         TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  EmptyTable(XValues, YValues);
-  CheckStdDev(StdDev);
-  // The points run monotonically from XLow to XHigh, so the smaller end decides.
-  const Extended step = N >= 1 ? (XHigh - XLow) / static_cast<Extended>(N) : Extended(0);
-  const Extended last = XLow + step * static_cast<Extended>(N);
-  if (!(XLow > 0) || !(last > 0)) RaiseMathError(rsValueGZero);
-  FillDensityTable<false>(XLow, XHigh, N, XValues, YValues,
-                          [&](Extended x) { return LogNormalPDF(Mean, StdDev, x); });
+  DensityTable<false>(
+      XLow, XHigh, N, XValues, YValues,
+      [&] {
+        CheckStdDev(StdDev);
+        // The points run monotonically from XLow to XHigh, so the smaller end decides.
+        const Extended step = N >= 1 ? (XHigh - XLow) / static_cast<Extended>(N) : Extended(0);
+        const Extended last = XLow + step * static_cast<Extended>(N);
+        if (!(XLow > 0) || !(last > 0)) RaiseMathError(rsValueGZero);
+      },
+      [&](Extended x) { return LogNormalPDF(Mean, StdDev, x); });
 }
 
 // === Incomplete gamma ===========================================================================
 
-Extended IncompleteGamma(Extended A, Extended X) {
-  if (X < 0) RaiseMathError(rsValueGEZero);
-  if (A <= 0) RaiseMathError(rsValueGZero);
+namespace {
+
+// LnGamma(A + 1) and LnGamma(A), for the series and the continued fraction of IncompleteGamma:
+// given by a caller that evaluates many points of one shape, else formed on the way.
+struct GammaLogs {
+  Extended lnGammaA1;
+  Extended lnGammaA;
+};
+
+// IncompleteGamma after its checks.
+Extended IncompleteGammaWith(Extended A, Extended X, const GammaLogs* logs) {
   if (std::isnan(A) || std::isnan(X)) return kNaN;
   Extended result = 0;
   if (FloatIsZero(X)) return result;
@@ -603,7 +613,8 @@ Extended IncompleteGamma(Extended A, Extended X) {
       term = term * X / b;
       sum += term;
     } while (term > QENTolerance);
-    const Extended e = A * std::log(X) - X - LnGamma(A + 1) + std::log(sum);
+    const Extended lnGammaA1 = logs != nullptr ? logs->lnGammaA1 : LnGamma(A + 1);
+    const Extended e = A * std::log(X) - X - lnGammaA1 + std::log(sum);
     if (e >= -88) result = std::exp(e);
     return result;
   }
@@ -636,10 +647,19 @@ Extended IncompleteGamma(Extended A, Extended X) {
       b1 /= kOverflow;
     }
   }
-  const Extended e = A * std::log(X) - X - LnGamma(A) + std::log(f);
+  const Extended lnGammaA = logs != nullptr ? logs->lnGammaA : LnGamma(A);
+  const Extended e = A * std::log(X) - X - lnGammaA + std::log(f);
   result = 1;
   if (e >= -88) result = 1 - std::exp(e);
   return result;
+}
+
+}  // namespace
+
+Extended IncompleteGamma(Extended A, Extended X) {
+  if (X < 0) RaiseMathError(rsValueGEZero);
+  if (A <= 0) RaiseMathError(rsValueGZero);
+  return IncompleteGammaWith(A, X, nullptr);
 }
 
 Extended IncompleteGamma2(Extended A, Extended X) {
@@ -668,12 +688,88 @@ Extended ChiSquareBetween(Extended X1, Extended X2, LongWord DF) {
   return ChiSquareLess(X2, DF) - ChiSquareLess(X1, DF);
 }
 
+namespace {
+
+// The bisection of InvChiSquareLess, settled by BisectEnclosed: ChiSquareLess(x) is
+// P(A, X) for A = DF / 2, X = x / 2, evaluated with LnGamma(A + 1) and LnGamma(A) formed once
+// (the same values). The density f(x) = X^(A - 1) e^-X / (2 Gamma(A)) is unimodal (decreasing
+// for A <= 1, else largest at X = A - 1) and is evaluated in double from the exponent
+// E = (A - 1) ln X - X - ln Gamma(A) - ln 2: rounding x to double, the logarithm, the products,
+// the sums and ln Gamma(A) in double move E by at most
+// 1.2e-15 (|A - 1| (|ln X| + 1) + X + |ln Gamma(A)| + 1), and exp adds 2.3e-16.
+//
+// Where IncompleteGamma takes its series (X <= 1 or X < A), its value differs from P(A, X) by
+//  - the series' tail beyond the first term at most QENTolerance: the later terms shrink by
+//    factors of at most rho = X / (A + 2) < 1, so the tail is below QENTolerance rho / (1 - rho),
+//    relative to the sum, which is at least 1;
+//  - the rounding of the sum's K terms, below (3 K + 1) u (u = 2^-64), where the terms fall
+//    below QENTolerance (above e^-27) after at most K = 40 + A + sqrt(108 A) of them: the
+//    products of X / (A + k) < A / (A + k) fall below e^-27 by then;
+//  - the rounding of the exponent e = A ln X - X - ln Gamma(A + 1) + ln(sum): the logarithms
+//    within 4 u, the product and the three sums within u of the parts' magnitudes, ln Gamma
+//    within 1e-17 (well above its measured error), ln(sum) <= X; and expl's 2 u.
+// On its continued fraction (the other X) no such bound is stated: there the error is infinite
+// and the midpoint is evaluated. IncompleteGamma's two cut-offs (0 for X below QENTolerance,
+// 1 above 1e8) are evaluated too.
+Extended BisectChiSquare(Extended P, Extended Low, Extended High, LongWord DF) {
+  const Extended a = static_cast<Extended>(DF) / 2;
+  const GammaLogs logs{LnGamma(a + 1), LnGamma(a)};
+  const auto less = [a, &logs](Extended x) { return IncompleteGammaWith(a, x / 2, &logs); };
+  if (!(Low >= 0) || !std::isfinite(High)) return BisectProbability(P, Low, High, less);
+  constexpr double kU = 0x1p-64;
+  const double aD = static_cast<double>(a);  // exact: DF < 2^32
+  const double lnGammaA = static_cast<double>(logs.lnGammaA);
+  const double lnGammaA1 = std::fabs(static_cast<double>(logs.lnGammaA1));
+  const double maxTerms = 40 + aD + std::sqrt(108 * aD);
+  const auto density = [&](Extended x, Extended& down, Extended& up) {
+    const double half = static_cast<double>(x) / 2;
+    down = up = 0;
+    if (!(half > 0)) return;
+    const double lnX = std::log(half);
+    const double exponent = (aD - 1) * lnX - half - lnGammaA - 0.6931471805599453;
+    const double error =
+        1.2e-15 * (std::fabs(aD - 1) * (std::fabs(lnX) + 1) + half + std::fabs(lnGammaA) + 1);
+    if (!(exponent > -700 && exponent < 700) || !(error < 1e-3)) return;
+    const double f = std::exp(exponent);
+    const double relative = 1.01 * error + 2.3e-16;
+    down = f - f * relative;
+    up = f + f * relative;
+  };
+  const Extended modeX = 2 * (a - 1);  // the mode in x, for A > 1
+  Extended modeUp = -1;                // formed on first use
+  const auto modeBetween = [&](Extended m, Extended x) {
+    return a > 1 && (m < modeX) != (x < modeX);
+  };
+  const auto modeDensity = [&] {
+    if (modeUp < 0) {
+      Extended down;
+      density(modeX, down, modeUp);
+      if (!(modeUp > 0)) modeUp = kInf;
+    }
+    return modeUp;
+  };
+  const auto evaluationError = [&](Extended m, Extended, Extended hi, Extended) {
+    const Extended x = m / 2;  // IncompleteGamma's own tests on its argument
+    if (!(x >= 2 * QENTolerance) || x > 1e8L || !(x <= 1 || x < a)) return kInf;
+    const double half = static_cast<double>(x);
+    const double rho = half / (aD + 2);
+    const double lnX = std::fabs(std::log(half));
+    const double relative =
+        1.01 * static_cast<double>(QENTolerance) * rho / (1 - rho) +
+        kU * (10 * aD * (lnX + 1e-3) + 12 * half + 4 * lnGammaA1 + 3 * maxTerms + 8) +
+        1e-17 * lnGammaA1;
+    return 1.02L * Extended(relative) * (hi > 0 ? hi : 0) + 1e-19L;
+  };
+  return BisectEnclosed(P, Low, High, less, density, modeBetween, modeDensity, evaluationError);
+}
+
+}  // namespace
+
 Extended InvChiSquareLess(Extended P, LongWord DF) {
   CheckDF(DF);
   const Extended g = AS91Start(P, static_cast<Extended>(DF));
   if (!(g >= 0)) RaiseMathError(rsValueGEZero);
-  return BisectProbability(P, MaxXY(Extended(0), g - g / 10), g + g / 10,
-                           [DF](Extended x) { return ChiSquareLess(x, DF); });
+  return BisectChiSquare(P, MaxXY(Extended(0), g - g / 10), g + g / 10, DF);
 }
 
 Extended InvChiSquareGreater(Extended P, LongWord DF) { return InvChiSquareLess(1 - P, DF); }
@@ -694,10 +790,9 @@ Extended ChiSquarePDF(Extended X, LongWord DF) {
 
 void ChiSquarePDFValues(LongWord DF, Extended XLow, Extended XHigh, LongWord N,
                         TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  EmptyTable(XValues, YValues);
-  CheckDF(DF);
-  FillDensityTable<true>(XLow, XHigh, N, XValues, YValues,
-                         [DF](Extended x) { return ChiSquarePDF(x, DF); });
+  DensityTable<true>(
+      XLow, XHigh, N, XValues, YValues, [&] { CheckDF(DF); },
+      [DF](Extended x) { return ChiSquarePDF(x, DF); });
 }
 
 // === F ==========================================================================================
@@ -796,10 +891,12 @@ Extended FDistPDF(Extended X, LongWord DF1, LongWord DF2) {
 
 void FDistPDFValues(LongWord DF1, LongWord DF2, Extended XLow, Extended XHigh, LongWord N,
                     TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  EmptyTable(XValues, YValues);
-  if (DF1 == 0 || DF2 == 0) RaiseMathError(rsDF);
-  FillDensityTable<true>(XLow, XHigh, N, XValues, YValues,
-                         [=](Extended x) { return FDistPDF(x, DF1, DF2); });
+  DensityTable<true>(
+      XLow, XHigh, N, XValues, YValues,
+      [&] {
+        if (DF1 == 0 || DF2 == 0) RaiseMathError(rsDF);
+      },
+      [=](Extended x) { return FDistPDF(x, DF1, DF2); });
 }
 
 // === Student t ==================================================================================
@@ -844,10 +941,9 @@ Extended StudentTPDF(Extended T, LongWord DF) {
 
 void StudentTPDFValues(LongWord DF, Extended XLow, Extended XHigh, LongWord N,
                        TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  EmptyTable(XValues, YValues);
-  CheckDF(DF);
-  FillDensityTable<false>(XLow, XHigh, N, XValues, YValues,
-                          [DF](Extended t) { return StudentTPDF(t, DF); });
+  DensityTable<false>(
+      XLow, XHigh, N, XValues, YValues, [&] { CheckDF(DF); },
+      [DF](Extended t) { return StudentTPDF(t, DF); });
 }
 
 // === Exponential ================================================================================
@@ -872,10 +968,12 @@ Extended ExponentialPDF(Extended X, Extended Mean) {
 
 void ExponentialPDFValues(Extended Mean, Extended XLow, Extended XHigh, LongWord N,
                           TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  EmptyTable(XValues, YValues);
-  if (!(Mean > 0)) RaiseMathError(rsExpDistInvalid);
-  FillDensityTable<true>(XLow, XHigh, N, XValues, YValues,
-                         [Mean](Extended x) { return ExponentialPDF(x, Mean); });
+  DensityTable<true>(
+      XLow, XHigh, N, XValues, YValues,
+      [&] {
+        if (!(Mean > 0)) RaiseMathError(rsExpDistInvalid);
+      },
+      [Mean](Extended x) { return ExponentialPDF(x, Mean); });
 }
 
 // === Beta =======================================================================================
@@ -953,19 +1051,20 @@ Extended BetaPDF(Extended X, Extended A, Extended B, Extended Lower, Extended Up
 
 void BetaPDFValues(Extended A, Extended B, Extended XLow, Extended XHigh, LongWord N,
                    TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  EmptyTable(XValues, YValues);
-  CheckBetaShapes(A, B);
-  FillDensityTable<false>(XLow, XHigh, N, XValues, YValues,
-                          [=](Extended x) { return BetaPDF(x, A, B); });
+  DensityTable<false>(
+      XLow, XHigh, N, XValues, YValues, [&] { CheckBetaShapes(A, B); },
+      [=](Extended x) { return BetaPDF(x, A, B); });
 }
 
 void BetaPDFValues(Extended A, Extended B, Extended Lower, Extended Upper, Extended XLow,
                    Extended XHigh, LongWord N, TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  EmptyTable(XValues, YValues);
-  BetaInterval(Lower, Upper);
-  CheckBetaShapes(A, B);
-  FillDensityTable<false>(XLow, XHigh, N, XValues, YValues,
-                          [=](Extended x) { return BetaPDF(x, A, B, Lower, Upper); });
+  DensityTable<false>(
+      XLow, XHigh, N, XValues, YValues,
+      [&] {
+        BetaInterval(Lower, Upper);
+        CheckBetaShapes(A, B);
+      },
+      [=](Extended x) { return BetaPDF(x, A, B, Lower, Upper); });
 }
 
 }  // namespace tovrin

@@ -7,11 +7,14 @@
 #include <utility>
 #include <vector>
 
+#include "tovrin/statistics/detail/DistributionChecks.h"
+
 namespace tovrin {
 namespace {
 
 using detail::RaiseMathError;
-using Count = std::uint64_t;  // counts one past a LongWord without wrapping
+using namespace detail::checks;  // NOLINT: the checks shared with the precise family
+using Count = std::uint64_t;     // counts one past a LongWord without wrapping
 
 constexpr LongWord kLargestFactorial = 1754;
 
@@ -81,10 +84,6 @@ Extended BinomialSumBelow(Extended P, LongWord N, Count Below) {
 
 // --- Hypergeometric ---------------------------------------------------------------------------
 
-void CheckHyperGeometric(LongWord N, LongWord S, LongWord M) {
-  if (N == 0 || S == 0 || N < S || N < M) RaiseMathError(rsHyperGeometricInvalid);
-}
-
 Extended HyperGeometricTerm(LongWord N, LongWord S, LongWord M, LongWord X) {
   if (X > MinXY(M, S)) return 0;
   // Fewer failures than the sample needs: the count cannot occur.
@@ -106,10 +105,6 @@ Extended HyperGeometricSumBelow(LongWord N, LongWord S, LongWord M, Count Below)
 }
 
 // --- Poisson ----------------------------------------------------------------------------------
-
-void CheckPoisson(Extended Mean) {
-  if (Mean <= 0) RaiseMathError(rsPoissonInvalid);
-}
 
 // Sum of the point probabilities of the counts 0..Below-1.
 Extended PoissonSumBelow(Extended Mean, Count Below) {

@@ -6,6 +6,7 @@
 #include <cmath>
 
 #include "tovrin/foundation/TOVRINGlobals.h"
+#include "tovrin/foundation/detail/ExactArithmetic.h"
 
 namespace tovrin::detail {
 
@@ -17,23 +18,15 @@ struct Pair {
 // a + b exactly (Knuth's TwoSum).
 inline Pair ExactSum(Extended a, Extended b) {
   const Extended s = a + b;
-  const Extended bb = s - a;
-  return {s, (a - (s - bb)) + (b - bb)};
+  return {s, SumError(a, b, s)};
 }
 
 // a * b exactly (Dekker's product with Veltkamp's split), for products inside the range; a
 // non-finite product comes back with lo = 0.
 inline Pair ExactProduct(Extended a, Extended b) {
-  constexpr Extended kSplitter = 4294967297.0L;  // 2^32 + 1
   const Extended p = a * b;
   if (!std::isfinite(p) || std::fabs(a) > 0x1p16000L || std::fabs(b) > 0x1p16000L) return {p};
-  const Extended ta = kSplitter * a;
-  const Extended a_hi = ta - (ta - a);
-  const Extended a_lo = a - a_hi;
-  const Extended tb = kSplitter * b;
-  const Extended b_hi = tb - (tb - b);
-  const Extended b_lo = b - b_hi;
-  return {p, ((a_hi * b_hi - p) + a_hi * b_lo + a_lo * b_hi) + a_lo * b_lo};
+  return {p, ProductError(a, b, p)};
 }
 
 inline Pair Renormalized(Extended hi, Extended lo) {
