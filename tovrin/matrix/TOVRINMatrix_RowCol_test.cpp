@@ -65,7 +65,7 @@ TYPED_TEST(RowColAllTypes, SwapsWithTheSwitchOffNeverPassARowEnd) {
   ExpectRaisesUntouched(rsMatrixRect, n, [](M& x) { SwapMatrixCols(x, 0, 2); });
 }
 
-TYPED_TEST(RowColAllTypes, SortsLeaveOneRowOrOneColumnAlone) {
+TYPED_TEST(RowColAllTypes, SortsOnAColumnOrARowAndTheirChecks) {
   using M = Matrix<TypeParam>;
   auto m = Mat<TypeParam>({{3}, {1}, {2}});
   QSortMatrixRowsOnCol(m, 5, true);  // no check at all
@@ -79,11 +79,7 @@ TYPED_TEST(RowColAllTypes, SortsLeaveOneRowOrOneColumnAlone) {
   QSortMatrixRowsOnCol(ragged, 9, true);
   QSortMatrixColsOnRow(ragged, 9, true);
   EXPECT_EQ(Values(ragged), (Rows{{3, 1, 2}, {1}}));
-}
-
-TYPED_TEST(RowColAllTypes, SortRowsOnAColumn) {
-  using M = Matrix<TypeParam>;
-  auto m = Mat<TypeParam>({{7, 3}, {8, 1}, {9, 2}, {6, 5}});
+  m = Mat<TypeParam>({{7, 3}, {8, 1}, {9, 2}, {6, 5}});
   QSortMatrixRowsOnCol(m, 1, false);
   EXPECT_EQ(Values(m), (Rows{{6, 5}, {7, 3}, {9, 2}, {8, 1}}));
   const auto sq = Mat<TypeParam>({{2, 1}, {1, 2}});
@@ -206,16 +202,7 @@ TYPED_TEST(RowColAllTypes, OverwriteWithPadding) {
   EXPECT_EQ(Values(r), (Rows{{4, 2}, {4}}));
 }
 
-TYPED_TEST(RowColAllTypes, CopyIsDeepAndKeepsTheShape) {
-  const auto m = Mat<TypeParam>({{1, 2}, {}, {3, 4, 5}});
-  auto c = CopyMatrix(m);
-  EXPECT_TRUE(SameBits(c, m));
-  c[0][0] = TypeParam(9);
-  EXPECT_EQ(Values(m)[0][0], 1.0L);
-  EXPECT_TRUE(CopyMatrix(Matrix<TypeParam>{}).empty());
-}
-
-TYPED_TEST(RowColAllTypes, Transpose) {
+TYPED_TEST(RowColAllTypes, TransposeAndADeepCopy) {
   using M = Matrix<TypeParam>;
   EXPECT_EQ(Values(TransposeMatrix(Mat<TypeParam>({{1, 2, 3}}))), (Rows{{1}, {2}, {3}}));
   EXPECT_EQ(Values(TransposeMatrix(Mat<TypeParam>({{1, 2, 3}, {4, 5, 6}}))),
@@ -232,6 +219,12 @@ TYPED_TEST(RowColAllTypes, Transpose) {
     ExpectRaises(rsMatrixRect, [] { TransposeMatrix(Mat<TypeParam>({{1, 2}, {3}})); });
     EXPECT_EQ(Values(TransposeMatrix(Mat<TypeParam>({{1, 2}, {3, 4, 5}}))), (Rows{{1, 3}, {2, 4}}));
   }
+  const auto m = Mat<TypeParam>({{1, 2}, {}, {3, 4, 5}});
+  auto c = CopyMatrix(m);
+  EXPECT_TRUE(SameBits(c, m));
+  c[0][0] = TypeParam(9);
+  EXPECT_EQ(Values(m)[0][0], 1.0L);
+  EXPECT_TRUE(CopyMatrix(Matrix<TypeParam>{}).empty());
 }
 
 // --- Scaling and adding (arithmetic types) --------------------------------------------------
