@@ -71,7 +71,7 @@ constexpr std::string_view kHelp =
 // The statistics after the count, in report order, with their JSON names.
 struct Statistic {
   std::string_view name;
-  TResStringId label;
+  TDescStatsStringId label;
   Extended (TQENDescStats::*get)() const;
 };
 constexpr std::array<Statistic, 17> kStatistics{{

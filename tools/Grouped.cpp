@@ -69,7 +69,7 @@ int RunGrouped(std::span<const std::string> Words) {
   const Extended population_sd = GroupedPopulationStdDev(freqs, start, width);
 
   const auto number = [&](Extended X) { return Float2EStr(X, decimals); };
-  const auto line = [&](TResStringId Label, Extended X) {
+  const auto line = [&](TDescStatsStringId Label, Extended X) {
     return LoadResString(Label) + "\t" + number(X) + "\n";
   };
   std::string text = "Number of Classes:\t" + std::to_string(freqs.size()) + "\n";

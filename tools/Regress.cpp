@@ -105,7 +105,7 @@ int RunRegress(std::span<const std::string> Words) {
   const Extended r = CoeffCorrelation(x, y);
   const Extended r2 = CoeffDetermination(x, y);
 
-  const auto line = [&](TResStringId Label, const std::string& Value) {
+  const auto line = [&](TDescStatsStringId Label, const std::string& Value) {
     return LoadResString(Label) + "\t" + Value + "\n";
   };
   const auto number = [&](Extended X) { return Float2EStr(X, decimals); };

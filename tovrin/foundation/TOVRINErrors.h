@@ -76,54 +76,6 @@ enum TResStringId : std::uint16_t {
   // Special functions
   rsArgOutsideDomain,
   rsGammaPole,
-  // Labels of the statistics reports
-  rsDSNoOfValues,
-  rsDSMaximum,
-  rsDSMinimum,
-  rsDSRange,
-  rsDSSum,
-  rsDSSumSQ,
-  rsDSMean,
-  rsDSMode,
-  rsDSNoMode,
-  rsDSMedian,
-  rsDSNEVariance,
-  rsDSNEStdDev,
-  rsDSVariance,
-  rsDSStdDev,
-  rsDSNEKurtosis,
-  rsDSSDKurtosis,
-  rsDSKurtosis,
-  rsDSNESkew,
-  rsDSSDSkew,
-  rsDSSkew,
-  rsDSQtr1,
-  rsDSQtr3,
-  rsDSIQR,
-  rsDSLowerFence,
-  rsDSUpperFence,
-  rsDSConfidenceIntervalM,
-  rsDSConfidenceIntervalV,
-  rsDSSignificance,
-  rsNotRejected,
-  rsNotRejectReason,
-  rsNullHypothesis,
-  rsPValue,
-  rsRejected,
-  rsRejectionRegion,
-  rsRejectReason,
-  rsTestStatistic,
-  rsDSCoeffCor,
-  rsDSCoeffDet,
-  rsDSRegressionLine,
-  rsDSSSE,
-  rsDSStdDevX,
-  rsDSStdDevY,
-  rsAlternateHypothesis,
-  rsDSConfidence,
-  rsDSCovar,
-  rsDSMeanX,
-  rsDSMeanY,
   rsResStringCount  // not an identifier: the number of identifiers
 };
 
@@ -132,7 +84,8 @@ std::string LoadResString(TResStringId Ident);
 // Replaces the text of an identifier (for translation). Raises std::out_of_range for a value
 // that is not an identifier.
 void SetResString(TResStringId Ident, std::string Text);
-// Restores every text to the library's own.
+// Restores every text of this table to the library's own (the statistics report labels have
+// their own table, TOVRIN_RS_DescStats.h).
 void ResetResStrings();
 // The identifier's name, e.g. "rsVectorIsEmpty".
 const char* ResStringName(TResStringId Ident);

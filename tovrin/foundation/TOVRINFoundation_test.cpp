@@ -278,19 +278,6 @@ TEST(ResStringTest, EveryIdentifierHasItsOwnTextAndName) {
   EXPECT_THROW(LoadResString(rsResStringCount), std::out_of_range);
 }
 
-TEST(ResStringTest, ReportLabelsHaveTheirPublishedTexts) {
-  EXPECT_EQ(LoadResString(rsDSNoOfValues), "Number of Values:");
-  EXPECT_EQ(LoadResString(rsDSSumSQ), "Sum of Squares:");
-  EXPECT_EQ(LoadResString(rsDSNoMode), "No Modal Value");
-  EXPECT_EQ(LoadResString(rsDSSDKurtosis), "Standard Deviation needs to be > 0 for Kurtosis");
-  EXPECT_EQ(LoadResString(rsDSUpperFence), "Upper Fence for Outliers:");
-  EXPECT_EQ(LoadResString(rsPValue), "p-Value:");
-  EXPECT_EQ(LoadResString(rsDSCoeffCor), "Coefficient of Correlation");
-  EXPECT_EQ(LoadResString(rsDSMeanY), "Mean of Y Values:");
-  // 47 report strings: rsDSNoOfValues through rsDSMeanY.
-  EXPECT_EQ(rsDSMeanY - rsDSNoOfValues + 1, 47);
-}
-
 TEST(ResStringTest, TextsCanBeReplacedAtRunTime) {
   SetResString(rsMatrixSqr, "La matrice doit être carrée");
   try {

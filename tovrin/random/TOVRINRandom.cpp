@@ -1345,126 +1345,50 @@ void Randomize() {
 }
 
 // ---------------------------------------------------------------------------------------------
-// The generators: each overload is a forward to its method.
+// The generators, one row each: result, public name, parameters, method, arguments. A row
+// writes both overloads: the one that takes a TRandomGenFunction runs the method on it through
+// WithSource (a known engine behind it is drawn inline, giving the same uniforms), its twin runs
+// the method on a ThreadSource.
+#define TOVRIN_RANDOM_GENERATORS(X)                                                            \
+  X(Extended, Random_Normal, (), StandardNormal, ())                                           \
+  X(Extended, Random_Normal, (Extended Mean, Extended StdDev), NormalVariate, (Mean, StdDev))  \
+  X(Extended, Random_LogNormal, (Extended Mean, Extended StdDev), LogNormalVariate,            \
+    (Mean, StdDev))                                                                            \
+  X(Extended, Random_Gamma, (Extended Shape), GammaVariate, (Shape))                           \
+  X(Extended, Random_ChiSq, (LongInt DF), ChiSquareVariate, (DF))                              \
+  X(Extended, Random_Exponential, (), ExponentialVariate, ())                                  \
+  X(Extended, Random_Weibull, (Extended Shape), WeibullVariate, (Shape))                       \
+  X(Extended, Random_Beta, (Extended A, Extended B), BetaVariate, (A, B))                      \
+  X(Extended, Random_T, (LongInt DF), StudentTVariate, (DF))                                   \
+  X(void, Random_MVNorm,                                                                       \
+    (const TQENFloatVector& Means, const TQENFloatVector& Covariance, TQENFloatVector& Factor, \
+     TQENFloatVector& Variate, LongInt& ErrorCode),                                            \
+    MultivariateNormal, (Means, Covariance, Factor, Variate, ErrorCode))                       \
+  X(Extended, Random_Inv_Gauss, (Extended Lambda, Extended Omega), InverseGaussianVariate,     \
+    (Lambda, Omega))                                                                           \
+  X(Int64, Random_Binomial1, (LongInt N, Extended P), BinomialFromMode, (N, P))                \
+  X(Int64, Random_Binomial2, (Int64 N, Extended P), BinomialVariate, (N, P))                   \
+  X(Int64, Random_Neg_Binomial, (Extended R, Extended P), NegativeBinomialVariate, (R, P))     \
+  X(Extended, Random_von_Mises, (Extended K), VonMisesVariate, (K))                            \
+  X(Extended, Random_Cauchy, (), CauchyVariate, ())                                            \
+  X(Int64, Random_Poisson, (const Extended& Mu), PoissonVariate, (Mu))
 
-Extended Random_Normal(TRandomGenFunction Gen) {
-  return WithSource(Gen, [](auto& gen) { return StandardNormal(gen); });
-}
-Extended Random_Normal() {
-  ThreadSource gen;
-  return StandardNormal(gen);
-}
-Extended Random_Normal(Extended Mean, Extended StdDev, TRandomGenFunction Gen) {
-  return WithSource(Gen, [=](auto& gen) { return NormalVariate(Mean, StdDev, gen); });
-}
-Extended Random_Normal(Extended Mean, Extended StdDev) {
-  ThreadSource gen;
-  return NormalVariate(Mean, StdDev, gen);
-}
-Extended Random_LogNormal(Extended Mean, Extended StdDev, TRandomGenFunction Gen) {
-  return LogNormalVariate(Mean, StdDev, Gen);
-}
-Extended Random_LogNormal(Extended Mean, Extended StdDev) {
-  ThreadSource gen;
-  return LogNormalVariate(Mean, StdDev, gen);
-}
+// A parenthesised list without its parentheses, followed by a comma unless it is empty.
+#define TOVRIN_LEADING(...) __VA_ARGS__ __VA_OPT__(, )
+#define TOVRIN_UNPARENTHESISED(...) __VA_ARGS__
 
-Extended Random_Gamma(Extended Shape, TRandomGenFunction Gen) {
-  return WithSource(Gen, [Shape](auto& gen) { return GammaVariate(Shape, gen); });
-}
-Extended Random_Gamma(Extended Shape) {
-  ThreadSource gen;
-  return GammaVariate(Shape, gen);
-}
-Extended Random_ChiSq(LongInt DF, TRandomGenFunction Gen) { return ChiSquareVariate(DF, Gen); }
-Extended Random_ChiSq(LongInt DF) {
-  ThreadSource gen;
-  return ChiSquareVariate(DF, gen);
-}
-Extended Random_Exponential(TRandomGenFunction Gen) { return ExponentialVariate(Gen); }
-Extended Random_Exponential() {
-  ThreadSource gen;
-  return ExponentialVariate(gen);
-}
-Extended Random_Weibull(Extended Shape, TRandomGenFunction Gen) {
-  return WeibullVariate(Shape, Gen);
-}
-Extended Random_Weibull(Extended Shape) {
-  ThreadSource gen;
-  return WeibullVariate(Shape, gen);
-}
-
-Extended Random_Beta(Extended A, Extended B, TRandomGenFunction Gen) {
-  return BetaVariate(A, B, Gen);
-}
-Extended Random_Beta(Extended A, Extended B) {
-  ThreadSource gen;
-  return BetaVariate(A, B, gen);
-}
-Extended Random_T(LongInt DF, TRandomGenFunction Gen) { return StudentTVariate(DF, Gen); }
-Extended Random_T(LongInt DF) {
-  ThreadSource gen;
-  return StudentTVariate(DF, gen);
-}
-
-void Random_MVNorm(const TQENFloatVector& Means, const TQENFloatVector& Covariance,
-                   TQENFloatVector& Factor, TQENFloatVector& Variate, LongInt& ErrorCode,
-                   TRandomGenFunction Gen) {
-  MultivariateNormal(Means, Covariance, Factor, Variate, ErrorCode, Gen);
-}
-void Random_MVNorm(const TQENFloatVector& Means, const TQENFloatVector& Covariance,
-                   TQENFloatVector& Factor, TQENFloatVector& Variate, LongInt& ErrorCode) {
-  ThreadSource gen;
-  MultivariateNormal(Means, Covariance, Factor, Variate, ErrorCode, gen);
-}
-
-Extended Random_Inv_Gauss(Extended Lambda, Extended Omega, TRandomGenFunction Gen) {
-  return InverseGaussianVariate(Lambda, Omega, Gen);
-}
-Extended Random_Inv_Gauss(Extended Lambda, Extended Omega) {
-  ThreadSource gen;
-  return InverseGaussianVariate(Lambda, Omega, gen);
-}
-
-Int64 Random_Binomial1(LongInt N, Extended P, TRandomGenFunction Gen) {
-  return BinomialFromMode(N, P, Gen);
-}
-Int64 Random_Binomial1(LongInt N, Extended P) {
-  ThreadSource gen;
-  return BinomialFromMode(N, P, gen);
-}
-Int64 Random_Binomial2(Int64 N, Extended P, TRandomGenFunction Gen) {
-  return WithSource(Gen, [N, P](auto& gen) { return BinomialVariate(N, P, gen); });
-}
-Int64 Random_Binomial2(Int64 N, Extended P) {
-  ThreadSource gen;
-  return BinomialVariate(N, P, gen);
-}
-Int64 Random_Neg_Binomial(Extended R, Extended P, TRandomGenFunction Gen) {
-  return NegativeBinomialVariate(R, P, Gen);
-}
-Int64 Random_Neg_Binomial(Extended R, Extended P) {
-  ThreadSource gen;
-  return NegativeBinomialVariate(R, P, gen);
-}
-
-Extended Random_von_Mises(Extended K, TRandomGenFunction Gen) { return VonMisesVariate(K, Gen); }
-Extended Random_von_Mises(Extended K) {
-  ThreadSource gen;
-  return VonMisesVariate(K, gen);
-}
-Extended Random_Cauchy(TRandomGenFunction Gen) { return CauchyVariate(Gen); }
-Extended Random_Cauchy() {
-  ThreadSource gen;
-  return CauchyVariate(gen);
-}
-
-Int64 Random_Poisson(const Extended& Mu, TRandomGenFunction Gen) {
-  return WithSource(Gen, [&Mu](auto& gen) { return PoissonVariate(Mu, gen); });
-}
-Int64 Random_Poisson(const Extended& Mu) {
-  ThreadSource gen;
-  return PoissonVariate(Mu, gen);
-}
+#define TOVRIN_DEFINE_GENERATOR(Result, Name, Params, Method, Args)                           \
+  Result Name(TOVRIN_LEADING Params TRandomGenFunction Gen) {                                 \
+    return WithSource(Gen, [&](auto& source) { return Method(TOVRIN_LEADING Args source); }); \
+  }                                                                                           \
+  Result Name(TOVRIN_UNPARENTHESISED Params) {                                                \
+    ThreadSource gen;                                                                         \
+    return Method(TOVRIN_LEADING Args gen);                                                   \
+  }
+TOVRIN_RANDOM_GENERATORS(TOVRIN_DEFINE_GENERATOR)
+#undef TOVRIN_DEFINE_GENERATOR
+#undef TOVRIN_UNPARENTHESISED
+#undef TOVRIN_LEADING
+#undef TOVRIN_RANDOM_GENERATORS
 
 }  // namespace tovrin

@@ -24,7 +24,7 @@ Int64 RoundToInt64(Extended X) {
   return static_cast<Int64>(r);
 }
 
-std::string Labelled(TResStringId Label, const std::string& Value) {
+std::string Labelled(TDescStatsStringId Label, const std::string& Value) {
   std::string line = LoadResString(Label);
   line += '\t';
   line += Value;
@@ -247,20 +247,15 @@ std::vector<std::string> TQENDescStats::DescStats() {
     report.push_back(Labelled(rsDSVariance, value(FVariance)));
     report.push_back(Labelled(rsDSStdDev, value(FStdDev)));
   }
-  if (n < 4) {
-    report.push_back(LoadResString(rsDSNEKurtosis));
-  } else if (FloatIsZero(FStdDev)) {
-    report.push_back(LoadResString(rsDSSDKurtosis));
-  } else {
-    report.push_back(Labelled(rsDSKurtosis, value(FKurtosis)));
-  }
-  if (n < 3) {
-    report.push_back(LoadResString(rsDSNESkew));
-  } else if (FloatIsZero(FStdDev)) {
-    report.push_back(LoadResString(rsDSSDSkew));
-  } else {
-    report.push_back(Labelled(rsDSSkew, value(FSkew)));
-  }
+  // Kurtosis and skew need a few values (whether or not the data are a population) and a spread.
+  const auto shape = [&](std::size_t least, TDescStatsStringId too_few, TDescStatsStringId flat,
+                         TDescStatsStringId label, Extended x) {
+    if (n < least) return LoadResString(too_few);
+    if (FloatIsZero(FStdDev)) return LoadResString(flat);
+    return Labelled(label, value(x));
+  };
+  report.push_back(shape(4, rsDSNEKurtosis, rsDSSDKurtosis, rsDSKurtosis, FKurtosis));
+  report.push_back(shape(3, rsDSNESkew, rsDSSDSkew, rsDSSkew, FSkew));
   report.push_back(Labelled(rsDSQtr1, value(FQtr1)));
   report.push_back(Labelled(rsDSQtr3, value(FQtr3)));
   report.push_back(Labelled(rsDSIQR, value(FIQR)));

@@ -136,28 +136,15 @@ class TQENDescStats {
 
   bool FInUpdate = false;
   Byte fDecimals = 4;
-  std::vector<std::string> FItems;
-  Extended fMax = 0;
-  Extended FMean = 0;
-  Extended FRange = 0;
-  Extended FMedian = 0;
-  Extended fMin = 0;
-  Extended FMode = 0;
-  bool FModeExists = false;
   bool FPopulation = false;
-  TQENFloatVector FSortedValues;
-  Extended FStdDev = 0;
-  Extended FSum = 0;
-  Extended FSumSq = 0;
+  std::vector<std::string> FItems;
   TQENFloatVector FValues;
-  Extended FVariance = 0;
-  Extended FSkew = 0;
-  Extended FKurtosis = 0;
-  Extended FQtr1 = 0;
-  Extended FQtr3 = 0;
-  Extended FIQR = 0;
-  Extended FFenceLower = 0;
-  Extended FFenceUpper = 0;
+  TQENFloatVector FSortedValues;
+  // The statistics of the last update.
+  Extended fMin = 0, fMax = 0, FRange = 0, FSum = 0, FSumSq = 0;
+  Extended FMean = 0, FMedian = 0, FMode = 0, FVariance = 0, FStdDev = 0, FSkew = 0, FKurtosis = 0;
+  Extended FQtr1 = 0, FQtr3 = 0, FIQR = 0, FFenceLower = 0, FFenceUpper = 0;
+  bool FModeExists = false;
 };
 
 }  // namespace tovrin

@@ -1,10 +1,11 @@
 // Tests of the TQENDescStats component. Expected report lines are exact arithmetic done by
 // hand (small samples) or exact rational arithmetic (python3 fractions) for Michelson's 1879
 // light-speed measurements, noted beside the table.
-#include <algorithm>
 #include <cmath>
 #include <limits>
+#include <set>
 #include <sstream>
+#include <stdexcept>
 #include <string>
 #include <vector>
 
@@ -187,18 +188,36 @@ TEST(DescStats, ModeDecimalsAndLabels) {
   SetResString(rsDSNoMode, "Kein Modalwert");
   half.SetDecimalPlaces(4);
   const Lines report = half.DescStats();
-  ResetResStrings();
+  ResetDescStatsStrings();
   EXPECT_EQ(report[6], "Average:\t1.5000");
   EXPECT_EQ(report[7], "Kein Modalwert");
-  std::vector<std::string> texts;
+  EXPECT_EQ(half.DescStats()[6], "Mean:\t1.5000");
+}
+
+// The labels' table: its own texts and names, none shared with another label or with an error
+// message of the foundation's table.
+TEST(DescStats, LabelsHaveTheirPublishedTextsAndNames) {
+  ASSERT_EQ(kLastDescStatsString - kFirstDescStatsString + 1, 47);
+  std::set<std::string> texts, names;
   for (int id = kFirstDescStatsString; id <= kLastDescStatsString; ++id) {
-    texts.push_back(LoadResString(static_cast<TResStringId>(id)));
+    const auto label = static_cast<TDescStatsStringId>(id);
+    EXPECT_TRUE(texts.insert(LoadResString(label)).second) << ResStringName(label);
+    EXPECT_TRUE(names.insert(ResStringName(label)).second) << ResStringName(label);
   }
-  ASSERT_EQ(texts.size(), 47u);
-  EXPECT_EQ(texts.front(), "Number of Values:");
-  EXPECT_EQ(texts.back(), "Mean of Y Values:");
-  std::sort(texts.begin(), texts.end());
-  EXPECT_EQ(std::adjacent_find(texts.begin(), texts.end()), texts.end());
+  for (int id = 0; id < rsResStringCount; ++id) {
+    const auto message = static_cast<TResStringId>(id);
+    EXPECT_EQ(texts.count(LoadResString(message)), 0u) << ResStringName(message);
+  }
+  EXPECT_EQ(LoadResString(rsDSNoOfValues), "Number of Values:");
+  EXPECT_EQ(LoadResString(rsDSSumSQ), "Sum of Squares:");
+  EXPECT_EQ(LoadResString(rsDSSDKurtosis), "Standard Deviation needs to be > 0 for Kurtosis");
+  EXPECT_EQ(LoadResString(rsDSUpperFence), "Upper Fence for Outliers:");
+  EXPECT_EQ(LoadResString(rsPValue), "p-Value:");
+  EXPECT_EQ(LoadResString(rsDSCoeffCor), "Coefficient of Correlation");
+  EXPECT_EQ(LoadResString(rsDSMeanY), "Mean of Y Values:");
+  EXPECT_STREQ(ResStringName(rsDSNoMode), "rsDSNoMode");
+  EXPECT_THROW(LoadResString(rsDescStatsStringCount), std::out_of_range);
+  EXPECT_THROW(SetResString(rsDescStatsStringCount, "x"), std::out_of_range);
 }
 
 TEST(DescStats, AddingAndDeleting) {

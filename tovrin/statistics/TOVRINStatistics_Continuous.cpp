@@ -19,12 +19,16 @@ constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
 
 // --- Density tables ---------------------------------------------------------------------------
 
-// Builds the N + 1 points XLow + i * step and their densities into local vectors and hands
+// The PDFValues tables: empties the outputs, runs Checks (which raise before anything is built),
+// then builds the N + 1 points XLow + i * step and their densities into local vectors and hands
 // them over only when every point is done, so that a raise leaves the caller's outputs empty.
 // With kZeroBelowZero a negative point gets density 0 without calling Density.
-template <bool kZeroBelowZero, typename Density>
-void FillDensityTable(Extended XLow, Extended XHigh, LongWord N, TQENFloatVector& XValues,
-                      TQENFloatVector& YValues, Density density) {
+template <bool kZeroBelowZero, typename Checks, typename Density>
+void DensityTable(Extended XLow, Extended XHigh, LongWord N, TQENFloatVector& XValues,
+                  TQENFloatVector& YValues, Checks checks, Density density) {
+  XValues.clear();
+  YValues.clear();
+  checks();
   const Extended step = N >= 1 ? (XHigh - XLow) / static_cast<Extended>(N) : Extended(0);
   const std::size_t count = static_cast<std::size_t>(N) + 1;
   TQENFloatVector xs(count);
@@ -36,11 +40,6 @@ void FillDensityTable(Extended XLow, Extended XHigh, LongWord N, TQENFloatVector
   }
   XValues = std::move(xs);
   YValues = std::move(ys);
-}
-
-void EmptyTable(TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  XValues.clear();
-  YValues.clear();
 }
 
 // --- Checks -----------------------------------------------------------------------------------
@@ -502,10 +501,9 @@ Extended NormalPDF(Extended Mean, Extended StdDev, Extended X) {
 
 void NormalPDFValues(Extended Mean, Extended StdDev, Extended XLow, Extended XHigh, LongWord N,
                      TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  EmptyTable(XValues, YValues);
-  CheckStdDev(StdDev);
-  FillDensityTable<false>(XLow, XHigh, N, XValues, YValues,
-                          [&](Extended x) { return NormalPDF(Mean, StdDev, x); });
+  DensityTable<false>(
+      XLow, XHigh, N, XValues, YValues, [&] { CheckStdDev(StdDev); },
+      [&](Extended x) { return NormalPDF(Mean, StdDev, x); });
 }
 
 Extended NormalDistLess(Extended Mean, Extended StdDev, Extended X) {
@@ -577,14 +575,16 @@ Extended InvLogNormalGreater(Extended Mean, Extended StdDev, Extended P) {
 
 void LogNormalPDFValues(Extended Mean, Extended StdDev, Extended XLow, Extended XHigh, LongWord N,
                         TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  EmptyTable(XValues, YValues);
-  CheckStdDev(StdDev);
-  // The points run monotonically from XLow to XHigh, so the smaller end decides.
-  const Extended step = N >= 1 ? (XHigh - XLow) / static_cast<Extended>(N) : Extended(0);
-  const Extended last = XLow + step * static_cast<Extended>(N);
-  if (!(XLow > 0) || !(last > 0)) RaiseMathError(rsValueGZero);
-  FillDensityTable<false>(XLow, XHigh, N, XValues, YValues,
-                          [&](Extended x) { return LogNormalPDF(Mean, StdDev, x); });
+  DensityTable<false>(
+      XLow, XHigh, N, XValues, YValues,
+      [&] {
+        CheckStdDev(StdDev);
+        // The points run monotonically from XLow to XHigh, so the smaller end decides.
+        const Extended step = N >= 1 ? (XHigh - XLow) / static_cast<Extended>(N) : Extended(0);
+        const Extended last = XLow + step * static_cast<Extended>(N);
+        if (!(XLow > 0) || !(last > 0)) RaiseMathError(rsValueGZero);
+      },
+      [&](Extended x) { return LogNormalPDF(Mean, StdDev, x); });
 }
 
 // === Incomplete gamma ===========================================================================
@@ -790,10 +790,9 @@ Extended ChiSquarePDF(Extended X, LongWord DF) {
 
 void ChiSquarePDFValues(LongWord DF, Extended XLow, Extended XHigh, LongWord N,
                         TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  EmptyTable(XValues, YValues);
-  CheckDF(DF);
-  FillDensityTable<true>(XLow, XHigh, N, XValues, YValues,
-                         [DF](Extended x) { return ChiSquarePDF(x, DF); });
+  DensityTable<true>(
+      XLow, XHigh, N, XValues, YValues, [&] { CheckDF(DF); },
+      [DF](Extended x) { return ChiSquarePDF(x, DF); });
 }
 
 // === F ==========================================================================================
@@ -892,10 +891,12 @@ Extended FDistPDF(Extended X, LongWord DF1, LongWord DF2) {
 
 void FDistPDFValues(LongWord DF1, LongWord DF2, Extended XLow, Extended XHigh, LongWord N,
                     TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  EmptyTable(XValues, YValues);
-  if (DF1 == 0 || DF2 == 0) RaiseMathError(rsDF);
-  FillDensityTable<true>(XLow, XHigh, N, XValues, YValues,
-                         [=](Extended x) { return FDistPDF(x, DF1, DF2); });
+  DensityTable<true>(
+      XLow, XHigh, N, XValues, YValues,
+      [&] {
+        if (DF1 == 0 || DF2 == 0) RaiseMathError(rsDF);
+      },
+      [=](Extended x) { return FDistPDF(x, DF1, DF2); });
 }
 
 // === Student t ==================================================================================
@@ -940,10 +941,9 @@ Extended StudentTPDF(Extended T, LongWord DF) {
 
 void StudentTPDFValues(LongWord DF, Extended XLow, Extended XHigh, LongWord N,
                        TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  EmptyTable(XValues, YValues);
-  CheckDF(DF);
-  FillDensityTable<false>(XLow, XHigh, N, XValues, YValues,
-                          [DF](Extended t) { return StudentTPDF(t, DF); });
+  DensityTable<false>(
+      XLow, XHigh, N, XValues, YValues, [&] { CheckDF(DF); },
+      [DF](Extended t) { return StudentTPDF(t, DF); });
 }
 
 // === Exponential ================================================================================
@@ -968,10 +968,12 @@ Extended ExponentialPDF(Extended X, Extended Mean) {
 
 void ExponentialPDFValues(Extended Mean, Extended XLow, Extended XHigh, LongWord N,
                           TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  EmptyTable(XValues, YValues);
-  if (!(Mean > 0)) RaiseMathError(rsExpDistInvalid);
-  FillDensityTable<true>(XLow, XHigh, N, XValues, YValues,
-                         [Mean](Extended x) { return ExponentialPDF(x, Mean); });
+  DensityTable<true>(
+      XLow, XHigh, N, XValues, YValues,
+      [&] {
+        if (!(Mean > 0)) RaiseMathError(rsExpDistInvalid);
+      },
+      [Mean](Extended x) { return ExponentialPDF(x, Mean); });
 }
 
 // === Beta =======================================================================================
@@ -1049,19 +1051,20 @@ Extended BetaPDF(Extended X, Extended A, Extended B, Extended Lower, Extended Up
 
 void BetaPDFValues(Extended A, Extended B, Extended XLow, Extended XHigh, LongWord N,
                    TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  EmptyTable(XValues, YValues);
-  CheckBetaShapes(A, B);
-  FillDensityTable<false>(XLow, XHigh, N, XValues, YValues,
-                          [=](Extended x) { return BetaPDF(x, A, B); });
+  DensityTable<false>(
+      XLow, XHigh, N, XValues, YValues, [&] { CheckBetaShapes(A, B); },
+      [=](Extended x) { return BetaPDF(x, A, B); });
 }
 
 void BetaPDFValues(Extended A, Extended B, Extended Lower, Extended Upper, Extended XLow,
                    Extended XHigh, LongWord N, TQENFloatVector& XValues, TQENFloatVector& YValues) {
-  EmptyTable(XValues, YValues);
-  BetaInterval(Lower, Upper);
-  CheckBetaShapes(A, B);
-  FillDensityTable<false>(XLow, XHigh, N, XValues, YValues,
-                          [=](Extended x) { return BetaPDF(x, A, B, Lower, Upper); });
+  DensityTable<false>(
+      XLow, XHigh, N, XValues, YValues,
+      [&] {
+        BetaInterval(Lower, Upper);
+        CheckBetaShapes(A, B);
+      },
+      [=](Extended x) { return BetaPDF(x, A, B, Lower, Upper); });
 }
 
 }  // namespace tovrin

@@ -1,7 +1,9 @@
 // The labels of the statistics reports (rsDSMean, rsDSNoMode, ...). They are resource
-// strings like every message of the library: LoadResString(rsDSMean) reads the text in force
-// and SetResString replaces it (for translation). The identifiers are members of
-// TResStringId (TOVRINErrors.h); this header is their home in the statistics subsystem.
+// strings like every message of the library, held in a table of the statistics subsystem:
+// LoadResString(rsDSMean) reads the text in force, SetResString replaces it (for translation)
+// and ResStringName names it, through the overloads below for TDescStatsStringId (the
+// foundation's table, TResStringId, holds the error messages). ResetDescStatsStrings restores
+// the labels' own texts. All are safe to call from several threads.
 //
 // The 25 labels of the TQENDescStats report, in report order:
 //   rsDSNoOfValues "Number of Values:"         rsDSMaximum "Maximum:"
@@ -40,12 +42,78 @@
 //   rsDSMeanX "Mean of X Values:"              rsDSMeanY "Mean of Y Values:"
 #pragma once
 
+#include <cstdint>
+#include <string>
+
 #include "tovrin/foundation/TOVRINErrors.h"
 
 namespace tovrin {
 
-// The first and the last of the 47 report labels in TResStringId; they are contiguous.
-inline constexpr TResStringId kFirstDescStatsString = rsDSNoOfValues;
-inline constexpr TResStringId kLastDescStatsString = rsDSMeanY;
+enum TDescStatsStringId : std::uint16_t {
+  // The TQENDescStats report, in report order
+  rsDSNoOfValues,
+  rsDSMaximum,
+  rsDSMinimum,
+  rsDSRange,
+  rsDSSum,
+  rsDSSumSQ,
+  rsDSMean,
+  rsDSMode,
+  rsDSNoMode,
+  rsDSMedian,
+  rsDSNEVariance,
+  rsDSNEStdDev,
+  rsDSVariance,
+  rsDSStdDev,
+  rsDSNEKurtosis,
+  rsDSSDKurtosis,
+  rsDSKurtosis,
+  rsDSNESkew,
+  rsDSSDSkew,
+  rsDSSkew,
+  rsDSQtr1,
+  rsDSQtr3,
+  rsDSIQR,
+  rsDSLowerFence,
+  rsDSUpperFence,
+  // Reports of paired data and of hypothesis tests
+  rsDSConfidenceIntervalM,
+  rsDSConfidenceIntervalV,
+  rsDSSignificance,
+  rsNotRejected,
+  rsNotRejectReason,
+  rsNullHypothesis,
+  rsPValue,
+  rsRejected,
+  rsRejectionRegion,
+  rsRejectReason,
+  rsTestStatistic,
+  rsDSCoeffCor,
+  rsDSCoeffDet,
+  rsDSRegressionLine,
+  rsDSSSE,
+  rsDSStdDevX,
+  rsDSStdDevY,
+  rsAlternateHypothesis,
+  rsDSConfidence,
+  rsDSCovar,
+  rsDSMeanX,
+  rsDSMeanY,
+  rsDescStatsStringCount  // not an identifier: the number of identifiers
+};
+
+// The first and the last of the 47 report labels; they are contiguous.
+inline constexpr TDescStatsStringId kFirstDescStatsString = rsDSNoOfValues;
+inline constexpr TDescStatsStringId kLastDescStatsString = rsDSMeanY;
+
+// The text in force for a label.
+std::string LoadResString(TDescStatsStringId Ident);
+// Replaces the text of a label (for translation). Raises std::out_of_range for a value that is
+// not an identifier.
+void SetResString(TDescStatsStringId Ident, std::string Text);
+// Restores every label to the library's own text.
+void ResetDescStatsStrings();
+// The identifier's name, e.g. "rsDSMean".
+const char* ResStringName(TDescStatsStringId Ident);
 
 }  // namespace tovrin
