@@ -18,9 +18,7 @@ namespace {
 
 using namespace testing;
 
-template <typename T>
-class Sort : public ::testing::Test {};
-TYPED_TEST_SUITE(Sort, testing::RuleElements);
+TOVRIN_TYPED_SUITE(Sort, testing::RuleElements);
 
 // Random vectors with many repeats come out as std::sort orders them; the empty and the
 // one-element vectors are left alone.
@@ -197,9 +195,7 @@ TEST(QuickSortPositions, ExchangesAsTracedByHand) {
   EXPECT_EQ(sortTagged({{1, 'a'}, {0, 'b'}, {1, 'c'}, {0, 'd'}}, true), "dbac");
 }
 
-template <typename T>
-class Rank : public ::testing::Test {};
-TYPED_TEST_SUITE(Rank, testing::RuleElements);
+TOVRIN_TYPED_SUITE(Rank, testing::RuleElements);
 
 TYPED_TEST(Rank, FirstPositionInTheSortedCopy) {
   const auto v = Vec<TypeParam>({10, 30, 20});
