@@ -78,7 +78,7 @@ def sets(rng, n):
     out.append(("Exp", "whole range [-11400, 11357]",
                 [("e", rand_ext(rng, -11400, 11357)) for _ in range(n)]))
     out.append(("Exp", "[-50, 50]", [("e", rand_ext(rng, -50, 50)) for _ in range(n)]))
-    out.append(("Exp", "near 0 (|x| = 2^-70 .. 2^-1)",
+    out.append(("Exp", "near 0 (magnitude 2^-70 .. 2^-1)",
                 [("e", (rng.choice((-1, 1)) * (rng.getrandbits(63) | (1 << 63)),
                         -63 - rng.randint(1, 70))) for _ in range(n)]))
     out.append(("Exp", "overflow end [11350, 11356.6]",
@@ -100,11 +100,11 @@ def sets(rng, n):
         lx = log(value(*x))
         y = extended((mpf(rng.random()) * 2 - 1) * z_max / lx)
         return ("p", x, y)
-    out.append(("Pow", "x in [2^-100, 2^100], |y ln x| < 11000",
+    out.append(("Pow", "x in [2^-100, 2^100], y ln x within +-11000",
                 [pow_case(rand_positive(rng, -100, 100), 11000) for _ in range(n)]))
-    out.append(("Pow", "x in [0.5, 2], |y ln x| < 50",
+    out.append(("Pow", "x in [0.5, 2], y ln x within +-50",
                 [pow_case(rand_ext(rng, 0.5, 2), 50) for _ in range(n)]))
-    out.append(("Pow", "x near 1 (1 +- 2^-60 .. 2^-4), |y ln x| < 11000",
+    out.append(("Pow", "x near 1 (1 +- 2^-60 .. 2^-4), y ln x within +-11000",
                 [pow_case(extended(1 + rng.choice((-1, 1)) * mpf(rng.random() + 0.5) *
                                    mpf(2) ** -rng.randint(4, 60)), 11000) for _ in range(n)]))
     def integer_case():
@@ -112,11 +112,11 @@ def sets(rng, n):
         ymax = int(11000 / abs(float(log(value(*x))) or 1))
         y = rng.randint(-min(ymax, 5000), min(ymax, 5000))
         return ("p", x, (y, 0))
-    out.append(("Pow", "x in [0.1, 10], integer |y| <= 5000", [integer_case() for _ in range(n)]))
+    out.append(("Pow", "x in [0.1, 10], integer y within +-5000", [integer_case() for _ in range(n)]))
     def negative_case():
         x = rand_ext(rng, -3, -0.3)
         return ("p", x, (rng.randint(-200, 200), 0))
-    out.append(("Pow", "x in [-3, -0.3], integer |y| <= 200",
+    out.append(("Pow", "x in [-3, -0.3], integer y within +-200",
                 [negative_case() for _ in range(n)]))
     return out
 

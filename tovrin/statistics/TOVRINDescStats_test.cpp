@@ -329,29 +329,19 @@ TEST(DescStatsStream, SavedFormAndRoundTrips) {
 }
 
 TEST(DescStatsStream, InfinitiesAndNaNSurviveEveryRoundTrip) {
-  TQENDescStats stats;
-  for (Extended v : {kInf, -kInf, std::numeric_limits<Extended>::quiet_NaN(), 2.5L}) {
-    stats.AddValue(v);
-  }
+  TQENDescStats stats = WithValues({kInf, -kInf, std::numeric_limits<Extended>::quiet_NaN(), 2.5L});
   EXPECT_EQ(stats.Items(), (Lines{"INF", "-INF", "NAN", "2.5"}));
-  const auto expectSame = [](const TQENDescStats& copy) {
+  const auto same = [](const TQENDescStats& copy) {
     const L v = Values(copy.Values());
-    ASSERT_EQ(v.size(), 4u);
-    EXPECT_EQ(v[0], kInf);
-    EXPECT_EQ(v[1], -kInf);
-    EXPECT_TRUE(std::isnan(v[2]));
-    EXPECT_EQ(v[3], 2.5L);
+    return v.size() == 4 && v[0] == kInf && v[1] == -kInf && std::isnan(v[2]) && v[3] == 2.5L;
   };
   std::stringstream stream;
   stats.SaveToStream(stream);
-  TQENDescStats loaded;
+  TQENDescStats loaded, set;
   loaded.LoadFromStream(stream);
-  expectSame(loaded);
-  TQENDescStats set;
   set.SetItems(stats.Items());
-  expectSame(set);
   stats.Loaded();
-  expectSame(stats);
+  EXPECT_TRUE(same(loaded) && same(set) && same(stats));
 }
 
 TEST(DescStatsStream, FailedLoadLeavesTheComponentAsItWas) {

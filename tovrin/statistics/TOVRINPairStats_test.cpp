@@ -12,8 +12,7 @@ namespace {
 
 #include "tovrin/statistics/TOVRINPairStats_reference.inc"
 
-using testing::ExpectRaises;
-using testing::RelNear;
+using namespace testing;  // NOLINT: the shared checks and constants
 
 TQENFloatVector Floats(const std::vector<long double>& values) {
   return TQENFloatVector(values.begin(), values.end());
@@ -47,16 +46,18 @@ TEST(PairRegressionLine, ValuesAndErrors) {
   EXPECT_TRUE(RelNear(GetSSE(x, y, kIntercept, kSlope), kSSEAboutFit));
   EXPECT_EQ(GetSSE(x, y, kGivenIntercept, kGivenSlope), kSSEAboutGiven);  // exact sums
   EXPECT_EQ(GetSSE(TQENFloatVector{}, TQENFloatVector{}, 1, 2), 0);
-  intercept = 7;
-  slope = 8;
+  intercept = 7, slope = 8;
   const TQENFloatVector empty;
-  ExpectRaises(rsSameDimensions, [&] {
-    GetRegressionLine(Floats({1, 2}), Floats({1}), intercept, slope);
-  });
-  ExpectRaises(rsSameDimensions, [&] { GetRegressionLine(empty, Floats({1}), intercept, slope); });
+  ExpectEachRaises(rsSameDimensions,
+                   {[&] {
+                      GetRegressionLine(Floats({1, 2}), Floats({1}), intercept, slope);
+                    },
+                    [&] { GetRegressionLine(empty, Floats({1}), intercept, slope); },
+                    [] {
+                      GetSSE(Floats({1, 2}), Floats({1, 2, 3}), 0, 1);
+                    }});
   ExpectRaises(rsVectorIsEmpty, [&] { GetRegressionLine(empty, empty, intercept, slope); });
   EXPECT_EQ(intercept * 10 + slope, 78);
-  ExpectRaises(rsSameDimensions, [] { GetSSE(Floats({1, 2}), Floats({1, 2, 3}), 0, 1); });
 }
 
 TEST(PairQuadraticCurve, ValuesAndErrors) {
@@ -71,20 +72,18 @@ TEST(PairQuadraticCurve, ValuesAndErrors) {
   EXPECT_TRUE(RelNear(a, kExactA, 1e-14L));
   EXPECT_TRUE(RelNear(b, kExactB, 1e-14L));
   EXPECT_TRUE(RelNear(c, kExactC, 1e-14L));
-  a = 1;
-  b = 2;
-  c = 3;
+  a = 1, b = 2, c = 3;
   ExpectRaises(rsSameDimensions, [&] {
     GetQuadraticCurve(Floats({1, 2, 3}), Floats({1, 2}), a, b, c);
   });
-  ExpectRaises(rsDivideByZero, [&] {
-    GetQuadraticCurve(Floats({1, 1, 1}), Floats({1, 2, 3}), a, b, c);
-  });
-  ExpectRaises(rsDivideByZero, [&] {
-    GetQuadraticCurve(Floats({1, 2, 1, 2}), Floats({1, 2, 3, 4}), a, b, c);
-  });
-  ExpectRaises(rsDivideByZero,
-               [&] { GetQuadraticCurve(TQENFloatVector{}, TQENFloatVector{}, a, b, c); });
+  ExpectEachRaises(rsDivideByZero,
+                   {[&] {
+                      GetQuadraticCurve(Floats({1, 1, 1}), Floats({1, 2, 3}), a, b, c);
+                    },
+                    [&] {
+                      GetQuadraticCurve(Floats({1, 2, 1, 2}), Floats({1, 2, 3, 4}), a, b, c);
+                    },
+                    [&] { GetQuadraticCurve(TQENFloatVector{}, TQENFloatVector{}, a, b, c); }});
   EXPECT_EQ(a * 100 + b * 10 + c, 123);
 }
 

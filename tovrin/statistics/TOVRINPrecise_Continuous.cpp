@@ -11,6 +11,8 @@ namespace tovrin::precise {
 namespace {
 
 using namespace common;  // NOLINT: the family's shared names
+using detail::Exp80;
+using detail::Ln80;
 
 // 1/sqrt(2) as hi + lo, 1/sqrt(2 pi) and 2/sqrt(pi).
 constexpr Extended kInvSqrt2 = 0.707106781186547524381894036516L;
@@ -36,22 +38,67 @@ Extended NormalUpper(const Pair& z) {
   // The correction is x.lo erfc'(x.hi), at most 2 x^2 units in the last place of erfc for
   // x > 0 and less than one below: below x = 2 it is not worth its exp.
   if (x.lo != 0.0L && x.hi > 2.0L && x.hi < 110.0L) {
-    e -= x.lo * kTwoOverSqrtPi * std::exp(-x.hi * x.hi);
+    e -= x.lo * kTwoOverSqrtPi * Exp80(-x.hi * x.hi);
   }
   return 0.5L * e;
 }
 
-// exp(-z^2 / 2) for z = hi + lo, with z^2 carried exactly.
-Extended ExpMinusHalfSquare(const Pair& z) {
-  Pair s = detail::ExactProduct(z.hi, z.hi);
-  if (!(s.hi < 30000.0L)) return std::isnan(s.hi) ? kNaN : 0.0L;
-  s.lo += 2.0L * z.hi * z.lo;
-  return std::exp(-0.5L * s.hi) * (1.0L - 0.5L * s.lo);
+// The upper half (32 bits) of x for |x| <= 2^8000 (Veltkamp's split): products of two such
+// halves are exact, and x minus its half is exact too.
+Extended UpperHalf(Extended x) {
+  const Extended t = 4294967297.0L * x;  // 2^32 + 1
+  return t - (t - x);
+}
+
+// e^(-z^2 / 2) for z = h + l with h of 32 bits and |l| < 2^-31 |h|: z^2 = h^2 + (2 h + l) l,
+// the first term exact, the sum renormalised for Exp80 (the rounding of z^2 in one piece would
+// cost z^2 / 2 units in the last place).
+Extended ExpMinusHalfSquareOfHalves(Extended h, Extended l) {
+  const Extended h2 = h * h;
+  const Extended rest = (h + h + l) * l;
+  const Extended s = h2 + rest;
+  return Exp80(-0.5L * s, -0.5L * (rest - (s - h2)));
+}
+
+// e^(-z^2 / 2) for z = hi + lo (|lo| a few units in the last place of hi); 0 beyond |z| = 152,
+// where it is below the smallest subnormal.
+Extended ExpMinusHalfSquare(Extended hi, Extended lo) {
+  if (!(std::fabs(hi) < 152.0L)) return std::isnan(hi) ? kNaN : 0.0L;
+  const Extended h = UpperHalf(hi);
+  return ExpMinusHalfSquareOfHalves(h, (hi - h) + lo);
 }
 
 // (X - Mean) / StdDev to twice the working precision.
 Pair Standardized(Extended Mean, Extended StdDev, Extended X) {
   return detail::Quotient(detail::ExactSum(X, -Mean), Pair{StdDev});
+}
+
+// Scales within 2^(+-1000) have a normal reciprocal and split without overflow (the bounds are
+// doubles, cheap to load).
+bool ScaleInRange(Extended s) { return s >= 0x1p-1000 && s <= 0x1p1000; }
+
+// q = n / d to twice the precision with the reciprocal r = 1 / d given (d within
+// ScaleInRange, |n r| below 2^8000): h is the upper half of n r, so h times either half of d is
+// exact, n - h d is exact (it is 2^-31 of n at most) and l is that remainder times r. One
+// division in all, and few values alive at once for the eight x87 registers.
+Pair HalvesOfQuotient(Extended n, Extended nlo, Extended d, Extended r) {
+  const Extended h = UpperHalf(n * r);
+  const Extended d_hi = UpperHalf(d);
+  return {h, (((n - h * d_hi) - h * (d - d_hi)) + nlo) * r};
+}
+
+// The normal density at X, z = (X - Mean) / StdDev carried to twice the precision.
+Extended NormalDensity(Extended Mean, Extended StdDev, Extended X) {
+  if (!ScaleInRange(StdDev)) {
+    const Pair z = Standardized(Mean, StdDev, X);
+    return kInvSqrt2Pi * ExpMinusHalfSquare(z.hi, z.lo) / StdDev;
+  }
+  const Extended inverse = 1.0L / StdDev;
+  const Pair d = detail::ExactSum(X, -Mean);
+  const Extended rounded = d.hi * inverse;
+  if (!(std::fabs(rounded) < 152.0L)) return std::isnan(rounded) ? kNaN : 0.0L;
+  const Pair z = HalvesOfQuotient(d.hi, d.lo, StdDev, inverse);
+  return kInvSqrt2Pi * inverse * ExpMinusHalfSquareOfHalves(z.hi, z.lo);
 }
 
 #include "tovrin/statistics/TOVRINPrecise_InvNormal.inc"
@@ -76,7 +123,7 @@ Extended InverseNormalUpper(Extended p) {
     const Extended v = kInvNormalCentralEdge - q * q;
     return q * Polynomial(kInvNormalCentralP, v) / Polynomial(kInvNormalCentralQ, v);
   }
-  const Extended r = std::sqrt(-std::log(p));
+  const Extended r = std::sqrt(-Ln80(p));
   int k = 0;
   while (k + 1 < kInvNormalTailRegions && r >= kInvNormalTailStart[k + 1]) ++k;
   const Extended s = r - kInvNormalTailStart[k];
@@ -293,7 +340,7 @@ Extended BetaDensityAt(const std::pair<Pair, Pair>& xy, Extended A, Extended B) 
 
 // === Standard normal ============================================================================
 
-Extended NormalZ(Extended Z) { return kInvSqrt2Pi * ExpMinusHalfSquare(Pair{Z}); }
+Extended NormalZ(Extended Z) { return kInvSqrt2Pi * ExpMinusHalfSquare(Z, 0.0L); }
 
 Extended NormalLess(Extended Z) { return NormalUpper(Pair{-Z}); }
 
@@ -315,11 +362,7 @@ Extended ZAlpha(Extended Alpha) { return InvNormalDistGreater(0, 1, Alpha); }
 
 Extended NormalPDF(Extended Mean, Extended StdDev, Extended X) {
   CheckStdDev(StdDev);
-  // Within four standard deviations the plain quotient is enough: its rounding moves the
-  // exponent z^2 / 2 by at most 16 units in the last place of 1, far inside the bound.
-  const Extended z = (X - Mean) / StdDev;
-  if (std::fabs(z) < 4.0L) return kInvSqrt2Pi * std::exp(-0.5L * z * z) / StdDev;
-  return kInvSqrt2Pi * ExpMinusHalfSquare(Standardized(Mean, StdDev, X)) / StdDev;
+  return NormalDensity(Mean, StdDev, X);
 }
 
 Extended NormalDistLess(Extended Mean, Extended StdDev, Extended X) {
@@ -350,28 +393,28 @@ Extended InvNormalDistGreater(Extended Mean, Extended StdDev, Extended P) {
 Extended LogNormalPDF(Extended Mean, Extended StdDev, Extended X) {
   CheckStdDev(StdDev);
   if (!(X > 0)) RaiseMathError(rsValueGZero);
-  return NormalPDF(Mean, StdDev, std::log(X)) / X;
+  return NormalDensity(Mean, StdDev, Ln80(X)) / X;
 }
 
 Extended LogNormalLess(Extended Mean, Extended StdDev, Extended X) {
   CheckStdDev(StdDev);
   if (std::isnan(X)) return kNaN;
   if (X <= 0) return 0;
-  return NormalDistLess(Mean, StdDev, std::log(X));
+  return NormalDistLess(Mean, StdDev, Ln80(X));
 }
 
 Extended LogNormalGreater(Extended Mean, Extended StdDev, Extended X) {
   CheckStdDev(StdDev);
   if (std::isnan(X)) return kNaN;
   if (X <= 0) return 1;
-  return NormalDistGreater(Mean, StdDev, std::log(X));
+  return NormalDistGreater(Mean, StdDev, Ln80(X));
 }
 
 namespace {
 // exp(Mean + StdDev z) with the exponent carried to twice the working precision.
 Extended ExpOfAffine(Extended Mean, Extended StdDev, Extended z) {
   const Pair e = detail::Sum(detail::ExactProduct(StdDev, z), Pair{Mean});
-  return std::exp(e.hi) * (1.0L + e.lo);
+  return Exp80(e.hi, e.lo);
 }
 }  // namespace
 
@@ -562,25 +605,33 @@ Extended ExponentialLess(Extended Mean, Extended X) {
 }
 
 namespace {
-// e^-q for q = X / Mean >= 0. The rounding of q moves e^-q by q units in the last place, so
-// below q = 16 the rounded quotient serves; beyond, q is carried to twice the precision.
-Extended ExpMinusRatio(Extended X, Extended Mean) {
-  const Extended rounded = X / Mean;
-  if (rounded < 16.0L) return std::exp(-rounded);
-  const Pair q = detail::Quotient(Pair{X}, Pair{Mean});
-  if (!(q.hi < 12000.0L)) return std::isnan(q.hi) ? kNaN : 0.0L;
-  return std::exp(-q.hi) * (1.0L - q.lo);
+// e^-q for q = X / Mean >= 0, divided by Mean as well for the density. The rounding of q
+// would move e^-q by q units in the last place, so q is carried to twice the precision, with
+// one division as for the normal density.
+Extended ExpMinusRatio(Extended X, Extended Mean, bool density) {
+  if (!ScaleInRange(Mean)) {
+    const Pair q = detail::Quotient(Pair{X}, Pair{Mean});
+    if (!(q.hi < 12000.0L)) return std::isnan(q.hi) ? kNaN : 0.0L;
+    const Extended e = Exp80(-q.hi, -q.lo);
+    return density ? e / Mean : e;
+  }
+  const Extended inverse = 1.0L / Mean;
+  if (!(X * inverse < 12000.0L)) return std::isnan(X * inverse) ? kNaN : 0.0L;
+  const Pair q = HalvesOfQuotient(X, 0.0L, Mean, inverse);
+  const Extended s = q.hi + q.lo;
+  const Extended e = Exp80(-s, (s - q.hi) - q.lo);
+  return density ? e * inverse : e;
 }
 }  // namespace
 
 Extended ExponentialGreater(Extended Mean, Extended X) {
   if (Mean <= 0 || X < 0) RaiseMathError(rsExpDistInvalid);
-  return ExpMinusRatio(X, Mean);
+  return ExpMinusRatio(X, Mean, false);
 }
 
 Extended ExponentialPDF(Extended X, Extended Mean) {
   if (!(Mean > 0) || X < 0) RaiseMathError(rsExpDistInvalid);
-  return ExpMinusRatio(X, Mean) / Mean;
+  return ExpMinusRatio(X, Mean, true);
 }
 
 // === Beta =======================================================================================

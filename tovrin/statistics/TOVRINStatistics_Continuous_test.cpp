@@ -4,11 +4,8 @@
 // inverses at their stopping rule divided by the density, plus a few roundings.
 #include <array>
 #include <cmath>
-#include <cstdint>
-#include <cstring>
 #include <functional>
 #include <limits>
-#include <string>
 #include <vector>
 
 #include "tovrin/statistics/TOVRINStatistics.h"
@@ -19,13 +16,7 @@ namespace {
 
 #include "tovrin/statistics/TOVRINStatistics_Distributions_reference.inc"
 
-using testing::ExpectEachRaises;
-using testing::ExpectRaises;
-using testing::Near;
-using testing::RelNear;
-constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
-constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
-constexpr Extended kEps = std::numeric_limits<Extended>::epsilon();  // 2^-63
+using namespace testing;  // NOLINT: the shared checks and constants
 LongWord DF(Extended v) { return static_cast<LongWord>(v); }
 
 TEST(Normal, AgainstReference) {
@@ -281,7 +272,7 @@ TEST(StudentT, InverseGivesTheRecordedResultsOverAGrid) {
   // Most halvings of the bisection are settled by bounds on the distribution function instead
   // of evaluating it; the results must be those of the plain bisection to the bit. The hash
   // (FNV-1a over the 10 value bytes of each result) was recorded from the plain bisection.
-  testing::ValueHash hash;
+  ValueHash hash;
   for (LongWord df : {1U, 2U, 3U, 4U, 5U, 7U, 9U, 15U, 40U, 300U, 5000U, 1000000U, 4000000000U}) {
     for (Extended p : {1e-300L, 1e-30L, 1e-12L, 1e-5L, 0.01L, 0.1L, 0.3L, 0.49L, 0.500000001L,
                        0.51L, 0.8L, 0.975L, 0.9999L, 1 - 1e-15L}) {
@@ -372,80 +363,55 @@ TEST(Beta, Checks) {
 }
 
 // Each density table with its density: the points (the requested ones plus an offset), the
-// zero below zero of the one-sided ones, one point for a count of 0, and a failed check that
-// leaves both outputs empty.
+// zero below zero of the one-sided ones, one point for a count of 0, and a failed check (a bad
+// parameter, or the points from 0 to 1) that leaves both outputs empty.
 TEST(PDFValues, PointsDensitiesAndChecks) {
   using V = TQENFloatVector;
   const struct {
-    std::function<void(Extended, Extended, LongWord, V&, V&)> table;
+    std::function<void(bool bad, Extended lo, Extended hi, LongWord n, V& x, V& y)> table;
     std::function<Extended(Extended)> density;
     bool zeroBelowZero;
-    std::function<void(V&, V&)> failing;
     TResStringId failure;
     Extended offset = 0;
   } cases[] = {
-      {[](Extended lo, Extended hi, LongWord n, V& x, V& y) {
-         NormalPDFValues(1, 2, lo, hi, n, x, y);
-       },
-       [](Extended x) { return NormalPDF(1, 2, x); }, false,
-       [](V& x, V& y) { NormalPDFValues(1, 0, 0, 1, 4, x, y); }, rsStdDev},
-      {[](Extended lo, Extended hi, LongWord n, V& x, V& y) {
-         LogNormalPDFValues(0, 1, lo + 4, hi + 4, n, x, y);
-       },
-       [](Extended x) { return LogNormalPDF(0, 1, x); }, false,
-       [](V& x, V& y) { LogNormalPDFValues(0, 1, 0, 2, 4, x, y); }, rsValueGZero, 4},
-      {[](Extended lo, Extended hi, LongWord n, V& x, V& y) {
-         ChiSquarePDFValues(3, lo, hi, n, x, y);
-       },
-       [](Extended x) { return ChiSquarePDF(x, 3); }, true,
-       [](V& x, V& y) { ChiSquarePDFValues(0, 0, 1, 4, x, y); }, rsDF},
-      {[](Extended lo, Extended hi, LongWord n, V& x, V& y) {
-         FDistPDFValues(3, 7, lo, hi, n, x, y);
-       },
-       [](Extended x) { return FDistPDF(x, 3, 7); }, true,
-       [](V& x, V& y) { FDistPDFValues(3, 0, 0, 1, 4, x, y); }, rsDF},
-      {[](Extended lo, Extended hi, LongWord n, V& x, V& y) {
-         StudentTPDFValues(5, lo, hi, n, x, y);
-       },
-       [](Extended x) { return StudentTPDF(x, 5); }, false,
-       [](V& x, V& y) { StudentTPDFValues(0, 0, 1, 4, x, y); }, rsDF},
-      {[](Extended lo, Extended hi, LongWord n, V& x, V& y) {
-         ExponentialPDFValues(2, lo, hi, n, x, y);
-       },
-       [](Extended x) { return ExponentialPDF(x, 2); }, true,
-       [](V& x, V& y) { ExponentialPDFValues(-2, 0, 1, 4, x, y); }, rsExpDistInvalid},
-      {[](Extended lo, Extended hi, LongWord n, V& x, V& y) {
-         BetaPDFValues(2, 3, lo, hi, n, x, y);
-       },
-       [](Extended x) { return BetaPDF(x, 2, 3); }, false,
-       [](V& x, V& y) { BetaPDFValues(0, 3, 0, 1, 4, x, y); }, rsValueGZero},
-      {[](Extended lo, Extended hi, LongWord n, V& x, V& y) {
-         BetaPDFValues(2, 3, 4, -1, lo, hi, n, x, y);
-       },
-       [](Extended x) { return BetaPDF(x, 2, 3, -1, 4); }, false,
-       [](V& x, V& y) { BetaPDFValues(2, 3, 1, 1, 0, 1, 4, x, y); }, rsSameValue},
+      {[](bool bad, auto&&... a) { NormalPDFValues(1, bad ? 0 : 2, a...); },
+       [](Extended x) { return NormalPDF(1, 2, x); }, false, rsStdDev},
+      {[](bool, auto&&... a) { LogNormalPDFValues(0, 1, a...); },
+       [](Extended x) { return LogNormalPDF(0, 1, x); }, false, rsValueGZero, 4},
+      {[](bool bad, auto&&... a) { ChiSquarePDFValues(bad ? 0 : 3, a...); },
+       [](Extended x) { return ChiSquarePDF(x, 3); }, true, rsDF},
+      {[](bool bad, auto&&... a) { FDistPDFValues(3, bad ? 0 : 7, a...); },
+       [](Extended x) { return FDistPDF(x, 3, 7); }, true, rsDF},
+      {[](bool bad, auto&&... a) { StudentTPDFValues(bad ? 0 : 5, a...); },
+       [](Extended x) { return StudentTPDF(x, 5); }, false, rsDF},
+      {[](bool bad, auto&&... a) { ExponentialPDFValues(bad ? -2 : 2, a...); },
+       [](Extended x) { return ExponentialPDF(x, 2); }, true, rsExpDistInvalid},
+      {[](bool bad, auto&&... a) { BetaPDFValues(bad ? 0 : 2, 3, a...); },
+       [](Extended x) { return BetaPDF(x, 2, 3); }, false, rsValueGZero},
+      {[](bool bad, auto&&... a) { BetaPDFValues(2, 3, bad ? 1 : 4, bad ? 1 : -1, a...); },
+       [](Extended x) { return BetaPDF(x, 2, 3, -1, 4); }, false, rsSameValue},
   };
   for (const auto& c : cases) {
     SCOPED_TRACE(ResStringName(c.failure));
     V xs{1, 2, 3}, ys{4};
-    c.table(-1, 1, 4, xs, ys);
+    c.table(false, c.offset - 1, c.offset + 1, 4, xs, ys);
     ASSERT_EQ(xs.size() * 10 + ys.size(), 55U);
     for (std::size_t i = 0; i < 5; ++i) {
       const Extended x = c.offset - 1 + 0.5L * static_cast<Extended>(i);  // exact
       EXPECT_EQ(Extended(xs[i]), x);
       EXPECT_EQ(Extended(ys[i]), c.zeroBelowZero && x < 0 ? 0 : c.density(x));
     }
-    c.table(0.25L, 0.75L, 0, xs, ys);
+    c.table(false, c.offset + 0.25L, c.offset + 0.75L, 0, xs, ys);
     ASSERT_EQ(xs.size() * 10 + ys.size(), 11U);
     EXPECT_EQ(Extended(xs[0]), c.offset + 0.25L);
     EXPECT_EQ(Extended(ys[0]), c.density(c.offset + 0.25L));
-    ExpectRaises(c.failure, [&] { c.failing(xs, ys); });
+    ExpectRaises(c.failure, [&] { c.table(true, 0, 1, 4, xs, ys); });
     EXPECT_TRUE(xs.empty() && ys.empty());
   }
   V xs, ys;
   ChiSquarePDFValues(2, 2, -2, 2, xs, ys);  // a descending range
-  EXPECT_EQ(testing::Values(xs), (std::vector<Extended>{2, 0, -2}));
-  EXPECT_EQ(testing::Values(ys), (std::vector<Extended>{ChiSquarePDF(2, 2), 0.5L, 0}));
+  EXPECT_EQ(Values(xs), (std::vector<Extended>{2, 0, -2}));
+  EXPECT_EQ(Values(ys), (std::vector<Extended>{ChiSquarePDF(2, 2), 0.5L, 0}));
 }
 
 }  // namespace

@@ -14,13 +14,7 @@ namespace {
 
 #include "tovrin/statistics/TOVRINStatistics_Distributions_reference.inc"
 
-using testing::ExpectEachRaises;
-using testing::ExpectRaises;
-using testing::Near;
-using testing::RelNear;
-constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
-constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
-constexpr Extended kEps = std::numeric_limits<Extended>::epsilon();
+using namespace testing;  // NOLINT: the shared checks and constants
 LongWord U(Extended v) { return static_cast<LongWord>(v); }
 
 TEST(Combinatorics, AgainstExactValues) {
@@ -186,8 +180,7 @@ TEST(Poisson, AgainstReferenceAndRules) {
 TEST(Discrete, TablesAndTheirChecks) {
   TQENFloatVector v{7, 7};
   BinomialPDFValues(4, 0.5L, v);
-  EXPECT_EQ(testing::Values(v),
-            (std::vector<Extended>{1 / 16.0L, 0.25L, 0.375L, 0.25L, 1 / 16.0L}));
+  EXPECT_EQ(Values(v), (std::vector<Extended>{1 / 16.0L, 0.25L, 0.375L, 0.25L, 1 / 16.0L}));
   const std::pair<LongInt, Extended> bad[] = {
       {4, -0.1L}, {4, 1.1L}, {4, kNaN}, {0, 0.5L}, {-3, 0.5L}};
   for (const auto& pair : bad) {

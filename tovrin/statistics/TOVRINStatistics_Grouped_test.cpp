@@ -11,8 +11,7 @@ namespace {
 
 #include "tovrin/statistics/TOVRINStatistics_Grouped_reference.inc"
 
-using testing::ExpectRaises;
-using testing::RelNear;
+using namespace testing;  // NOLINT: the shared checks and constants
 
 TEST(GroupedStatistics, HandExampleAndExactReference) {
   // [1, 2, 1] from 0 in steps of 10: midpoints 5, 15, 25; quartile targets 1 and 3 are met at
@@ -59,12 +58,13 @@ TEST(GroupedStatistics, HandExampleAndExactReference) {
 
 TEST(GroupedStatistics, ZeroAndSmallTotals) {
   const TQENLWordVector zeros = {0, 0}, one = {0, 1};
-  EXPECT_EQ(GroupedMean(zeros, 1, 2), 0);
-  EXPECT_EQ(GroupedSampleVariance(zeros, 1, 2), 0);
-  EXPECT_EQ(GroupedPopulationVariance(zeros, 1, 2), 0);
-  EXPECT_EQ(GetGroupedMeanDev(zeros, 1, 2, 0), 0);
-  EXPECT_EQ(GroupedSampleStdDev(one, 1, 2), 0);  // one observation: no sample variance
-  EXPECT_EQ(GroupedPopulationVariance(one, 1, 2), 0);
+  for (const Extended x :
+       {GroupedMean(zeros, 1, 2), GroupedSampleVariance(zeros, 1, 2),
+        GroupedPopulationVariance(zeros, 1, 2), GetGroupedMeanDev(zeros, 1, 2, 0),
+        GroupedSampleStdDev(one, 1, 2) /* no sample variance */,
+        GroupedPopulationVariance(one, 1, 2)}) {
+    EXPECT_EQ(x, 0);
+  }
   EXPECT_EQ(GroupedMean(one, 1, 2), 4);
 }
 
@@ -102,33 +102,31 @@ TEST(GroupedErrors, EmptySizeSpreadAndTargetsInOrder) {
   Extended a = 7, b = 8;
   std::array<Extended, 9> deciles{};
   deciles.fill(3);
-  ExpectRaises(rsVectorIsEmpty, [&] { GroupedMean(empty, 0, 1); });
-  ExpectRaises(rsVectorIsEmpty, [&] { GroupedMedian(empty, 0, 1); });
-  ExpectRaises(rsVectorIsEmpty, [&] { GroupedMode(empty, 0, 1, a); });
-  ExpectRaises(rsVectorIsEmpty, [&] { GroupedQuartiles(empty, 0, 1, a, b); });
-  ExpectRaises(rsVectorIsEmpty, [&] { GetGroupedDeciles(empty, 0, 1, deciles); });
-  ExpectRaises(rsVectorIsEmpty, [&] { GroupedSampleStdDev(empty, 0, 1); });
-  ExpectRaises(rsVectorIsEmpty, [&] { GroupedPopulationVariance(empty, 0, 1); });
-  ExpectRaises(rsVectorIsEmpty, [&] { GetGroupedMeanDev(empty, 0, 1, 0); });
-  ExpectRaises(rsVectorIsEmpty, [&] { GetGroupedPopulationKurtosis(empty, 0, 1, 0, 1); });
+  ExpectEachRaises(
+      rsVectorIsEmpty,
+      {[&] { GroupedMean(empty, 0, 1); }, [&] { GroupedMedian(empty, 0, 1); },
+       [&] { GroupedMode(empty, 0, 1, a); }, [&] { GroupedQuartiles(empty, 0, 1, a, b); },
+       [&] { GetGroupedDeciles(empty, 0, 1, deciles); }, [&] { GroupedSampleStdDev(empty, 0, 1); },
+       [&] { GroupedPopulationVariance(empty, 0, 1); }, [&] { GetGroupedMeanDev(empty, 0, 1, 0); },
+       [&] { GetGroupedPopulationKurtosis(empty, 0, 1, 0, 1); }});
   EXPECT_EQ(a * 10 + b, 78);
   EXPECT_EQ(deciles[8], 3);
   ExpectRaises(rsVectorIsEmpty, [&] { GroupedSums(empty, 0, 1, a, b); });
   EXPECT_EQ(a + b, 0);  // GroupedSums zeroes its outputs before it checks
-  ExpectRaises(rsVectorG2, [&] { GetGroupedSampleSkew(two, 0, 1, 0, 0); });  // before rsStdDev
-  ExpectRaises(rsVectorG2, [&] { GetGroupedPopulationSkew(two, 0, 1, 0, 0); });
-  ExpectRaises(rsVectorG3, [&] { GetGroupedSampleKurtosis(three, 0, 1, 0, 0); });
-  ExpectRaises(rsVectorG3, [&] { GetGroupedPopulationKurtosis(three, 0, 1, 0, 0); });
-  ExpectRaises(rsStdDev, [&] { GetGroupedSampleSkew(three, 0, 1, 0, 1e-13L); });
-  ExpectRaises(rsStdDev, [&] { GetGroupedPopulationKurtosis(kFreqs, 0, 1, 0, -1e-13L); });
+  ExpectEachRaises(rsVectorG2, {[&] { GetGroupedSampleSkew(two, 0, 1, 0, 0); },  // before rsStdDev
+                                [&] { GetGroupedPopulationSkew(two, 0, 1, 0, 0); }});
+  ExpectEachRaises(rsVectorG3, {[&] { GetGroupedSampleKurtosis(three, 0, 1, 0, 0); },
+                                [&] { GetGroupedPopulationKurtosis(three, 0, 1, 0, 0); }});
+  ExpectEachRaises(rsStdDev, {[&] { GetGroupedSampleSkew(three, 0, 1, 0, 1e-13L); },
+                              [&] { GetGroupedPopulationKurtosis(kFreqs, 0, 1, 0, -1e-13L); }});
   // F = 5e9, but the 32-bit cumulative frequencies are 1e9 and 5e9 - 2^32, so the median
   // target is never reached; with F = 4.5e9 only the third quartile's target is out of reach.
   const TQENLWordVector f = {1000000000u, 4000000000u}, g = {2000000000u, 2500000000u};
   a = 1;
   ExpectRaises(rsMedianNotFound, [&] { GroupedMedian(f, 0, 1); });
-  ExpectRaises(rsQuartilesNotFound, [&] { GroupedQuartiles(f, 0, 1, a, b); });
-  ExpectRaises(rsQuartilesNotFound, [&] { GroupedQuartiles(g, 0, 1, a, b); });
-  ExpectRaises(rsQuartilesNotFound, [&] { GetGroupedDeciles(f, 0, 1, deciles); });
+  ExpectEachRaises(rsQuartilesNotFound, {[&] { GroupedQuartiles(f, 0, 1, a, b); },
+                                         [&] { GroupedQuartiles(g, 0, 1, a, b); },
+                                         [&] { GetGroupedDeciles(f, 0, 1, deciles); }});
   EXPECT_EQ(a, 1);
   EXPECT_EQ(deciles[0], 3);  // the first deciles are reached, but nothing is written
 }

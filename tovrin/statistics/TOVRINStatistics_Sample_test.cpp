@@ -15,11 +15,7 @@ namespace {
 
 #include "tovrin/statistics/TOVRINStatistics_Sample_reference.inc"
 
-using testing::ExpectRaises;
-using testing::RelNear;
-using testing::SameBits;
-using testing::Values;
-using testing::Vec;
+using namespace testing;  // NOLINT: the shared checks and constants
 
 template <typename T>
 std::vector<T> From(const std::vector<long double>& values) {
@@ -31,7 +27,7 @@ TQENFloatVector Floats(std::initializer_list<long double> values) {
 
 template <typename T>
 class SampleFamilies : public ::testing::Test {};
-TYPED_TEST_SUITE(SampleFamilies, testing::BuildableElements);
+TYPED_TEST_SUITE(SampleFamilies, BuildableElements);
 
 // The two-pass variances hand SumSqDiffVector a centre rounded to Double and Single for those
 // element types, which the reference reproduces; the one-pass forms match the emulated
@@ -65,18 +61,15 @@ TYPED_TEST(SampleFamilies, MeanAndVariances) {
 
 TYPED_TEST(SampleFamilies, SizeErrorsLeaveOutputsAlone) {
   const std::vector<TypeParam> empty, one = Vec<TypeParam>({7});
-  ExpectRaises(rsVectorIsEmpty, [&] { QENMean(empty); });
-  ExpectRaises(rsVectorIsEmpty, [&] { PopulationVariance(empty); });
-  ExpectRaises(rsVectorIsEmpty, [&] { SampleStdDev(empty); });
-  ExpectRaises(rsVectorIsEmpty, [&] { GetMedian(empty); });
-  ExpectRaises(rsVectorG1, [&] { SampleVariance(one); });
-  ExpectRaises(rsVectorG1, [&] { SampleStdDev(one); });
-  EXPECT_EQ(PopulationStdDev(one), 0);
   Extended a = 11, b = 13;
-  ExpectRaises(rsVectorIsEmpty, [&] { SampleVarianceAndMean(empty, a, b); });
-  ExpectRaises(rsVectorIsEmpty, [&] { PopulationStdDevAndMean(empty, a, b); });
-  ExpectRaises(rsVectorG1, [&] { SampleVarianceAndMean(one, a, b); });
-  ExpectRaises(rsVectorG1, [&] { SampleStdDevAndMean(one, a, b); });
+  ExpectEachRaises(rsVectorIsEmpty, {[&] { QENMean(empty); }, [&] { PopulationVariance(empty); },
+                                     [&] { SampleStdDev(empty); }, [&] { GetMedian(empty); },
+                                     [&] { SampleVarianceAndMean(empty, a, b); },
+                                     [&] { PopulationStdDevAndMean(empty, a, b); }});
+  ExpectEachRaises(rsVectorG1, {[&] { SampleVariance(one); }, [&] { SampleStdDev(one); },
+                                [&] { SampleVarianceAndMean(one, a, b); },
+                                [&] { SampleStdDevAndMean(one, a, b); }});
+  EXPECT_EQ(PopulationStdDev(one), 0);
   EXPECT_EQ(a * 100 + b, 1113);
   PopulationVarianceAndMean(one, a, b);
   EXPECT_EQ(a * 100 + b, 7);
@@ -102,15 +95,14 @@ TYPED_TEST(SampleFamilies, MedianAndTrimmedMeans) {
   EXPECT_EQ(TrimmedMean(Vec<TypeParam>({5}), 0.3L), 5);
   // The range check comes before the emptiness check, the two shortcuts before the range.
   const V empty;
-  ExpectRaises(rsInvalidValue, [&] { TrimmedMean(empty, 0.7L); });
-  ExpectRaises(rsInvalidValue, [&] { TrimmedMean(x, -0.1L); });
-  ExpectRaises(rsInvalidValue, [&] { TrimmedMean(x, 0.51L); });
-  ExpectRaises(rsInvalidValue, [&] { ExcelTrimmedMean(x, 1.01L); });
-  ExpectRaises(rsInvalidValue, [&] { TrimmedMean(x, std::numeric_limits<Extended>::quiet_NaN()); });
-  ExpectRaises(rsVectorIsEmpty, [&] { TrimmedMean(empty, 0.2L); });
-  ExpectRaises(rsVectorIsEmpty, [&] { TrimmedMean(empty, 0); });     // through QENMean
-  ExpectRaises(rsVectorIsEmpty, [&] { TrimmedMean(empty, 0.5L); });  // through GetMedian
-  ExpectRaises(rsVectorIsEmpty, [&] { ExcelTrimmedMean(empty, 0.3L); });
+  ExpectEachRaises(rsInvalidValue,
+                   {[&] { TrimmedMean(empty, 0.7L); }, [&] { TrimmedMean(x, -0.1L); },
+                    [&] { TrimmedMean(x, 0.51L); }, [&] { ExcelTrimmedMean(x, 1.01L); },
+                    [&] { TrimmedMean(x, std::numeric_limits<Extended>::quiet_NaN()); }});
+  // 0 goes through QENMean, 0.5 through GetMedian.
+  ExpectEachRaises(rsVectorIsEmpty,
+                   {[&] { TrimmedMean(empty, 0.2L); }, [&] { TrimmedMean(empty, 0); },
+                    [&] { TrimmedMean(empty, 0.5L); }, [&] { ExcelTrimmedMean(empty, 0.3L); }});
 }
 
 // The accumulators and wrap-around that differ by element type.
@@ -232,8 +224,8 @@ TEST(SampleQuantiles, HandExamplesAndSinglePrecisionPositions) {
   EXPECT_EQ(d[2], 10 + 10 * (static_cast<long double>(1.1F) - 1));
   q1 = 1;
   d.fill(-4);
-  ExpectRaises(rsVectorIsEmpty, [&] { GetQuartiles(TQENFloatVector{}, q1, q3); });
-  ExpectRaises(rsVectorIsEmpty, [&] { GetDeciles(TQENFloatVector{}, d); });
+  ExpectEachRaises(rsVectorIsEmpty, {[&] { GetQuartiles(TQENFloatVector{}, q1, q3); },
+                                     [&] { GetDeciles(TQENFloatVector{}, d); }});
   EXPECT_EQ(q1 + d[0], -3);
 }
 
@@ -310,13 +302,12 @@ TEST(SampleStandardise, BothFormsAndTheirErrors) {
   EXPECT_EQ(Extended(y[0]), 0);
   auto z = From<PackedExtended>(kCentred);
   Standardise(z, 0, 1, false);
-  EXPECT_TRUE(testing::Near(QENMean(z), 0, 1e-17L));
+  EXPECT_TRUE(Near(QENMean(z), 0, 1e-17L));
   EXPECT_TRUE(RelNear(SampleVariance(z), 1, 1e-17L));
   z = From<PackedExtended>(kCentred);
   Standardise(z, 5, 3, true);
   EXPECT_TRUE(RelNear(QENMean(z), 5, 1e-17L));
   EXPECT_TRUE(RelNear(PopulationVariance(z), 9, 1e-17L));
-  using testing::ExpectRaisesUntouched;
   ExpectRaisesUntouched(rsVectorIsEmpty, TQENFloatVector{},
                         [](auto& v) { Standardise(v, 0, 0, 0, 1); });
   ExpectRaisesUntouched(rsVectorIsEmpty, TQENFloatVector{},
@@ -351,24 +342,24 @@ TEST(SampleMeans, GeometricHarmonicAndOthers) {
 TEST(SampleMeans, ErrorsInOrder) {
   const TQENFloatVector empty, zero = Floats({1, 0, 2}), tiny = Floats({1, 1e-13L}),
                                negativeOne = Floats({-1});
-  ExpectRaises(rsVectorIsEmpty, [&] { GeometricMean(empty); });
-  ExpectRaises(rsVectorNotPos, [&] { GeometricMean(zero); });
-  ExpectRaises(rsVectorNotPos, [&] { GeometricMean(tiny); });  // not positive beyond tolerance
+  // tiny is not positive beyond the tolerance; negativeOne fails in the geometric mean.
   for (const bool sample : {true, false}) {
-    ExpectRaises(rsVectorIsEmpty, [&] { GeometricStdDev(empty, sample); });
-    ExpectRaises(rsVectorIsEmpty, [&] { GeometricStdDev(empty, 2, sample); });
-    ExpectRaises(rsVectorIsEmpty, [&] { GeometricVariance(empty, 2, sample); });
-    ExpectRaises(rsVectorNotPos, [&] { GeometricStdDev(zero, 2, sample); });
-    ExpectRaises(rsVectorNotPos, [&] { GeometricVariance(zero, sample); });
-    ExpectRaises(rsVectorNotPos, [&] { GeometricStdDev(negativeOne, sample); });  // the mean's
+    ExpectEachRaises(
+        rsVectorIsEmpty,
+        {[&] { GeometricMean(empty); }, [&] { GeometricStdDev(empty, sample); },
+         [&] { GeometricStdDev(empty, 2, sample); }, [&] { GeometricVariance(empty, 2, sample); },
+         [] { HarmonicMean(TQENFloatVector{}); }, [] { RootMeanSquare(TQENFloatVector{}); }});
+    ExpectEachRaises(rsVectorNotPos, {[&] { GeometricMean(zero); }, [&] { GeometricMean(tiny); },
+                                      [&] { GeometricStdDev(zero, 2, sample); },
+                                      [&] { GeometricVariance(zero, sample); },
+                                      [&] { GeometricStdDev(negativeOne, sample); },
+                                      [] {
+                                        HarmonicMean(Floats({1, -2}));
+                                      }});
   }
-  ExpectRaises(rsVectorG1, [&] { GeometricStdDev(negativeOne, 2, true); });  // size first
-  ExpectRaises(rsVectorG1, [&] { GeometricVariance(Floats({3}), 3, true); });
-  ExpectRaises(rsVectorIsEmpty, [] { HarmonicMean(TQENFloatVector{}); });
-  ExpectRaises(rsVectorNotPos, [] { HarmonicMean(Floats({1, -2})); });
-  ExpectRaises(rsVectorIsEmpty, [] { RootMeanSquare(TQENFloatVector{}); });
-  ExpectRaises(rsValueGEZero, [] { HeronianMean(-1, 4); });
-  ExpectRaises(rsValueGEZero, [] { HeronianMean(4, -1e-11L); });
+  ExpectEachRaises(rsVectorG1, {[&] { GeometricStdDev(negativeOne, 2, true); },  // size first
+                                [&] { GeometricVariance(Floats({3}), 3, true); }});
+  ExpectEachRaises(rsValueGEZero, {[] { HeronianMean(-1, 4); }, [] { HeronianMean(4, -1e-11L); }});
 }
 
 }  // namespace

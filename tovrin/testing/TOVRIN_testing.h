@@ -9,6 +9,7 @@
 #include <cstring>
 #include <functional>
 #include <initializer_list>
+#include <limits>
 #include <type_traits>
 #include <vector>
 
@@ -19,6 +20,10 @@
 #include "tovrin/foundation/TOVRINGlobals.h"
 
 namespace tovrin::testing {
+
+inline constexpr Extended kInf = std::numeric_limits<Extended>::infinity();
+inline constexpr Extended kNaN = std::numeric_limits<Extended>::quiet_NaN();
+inline constexpr Extended kEps = std::numeric_limits<Extended>::epsilon();  // 2^-63
 
 // Runs call and expects EMathError with the identifier Ident.
 template <typename Call>

@@ -11,7 +11,7 @@ namespace tovrin::detail::checks {
 
 // A standard deviation that is not positive (within the tolerance).
 inline void CheckStdDev(Extended StdDev) {
-  if (!FloatIsPositive(StdDev)) RaiseMathError(rsStdDev);
+  if (!(StdDev > QENTolerance)) RaiseMathError(rsStdDev);  // !FloatIsPositive, inline
 }
 // The inverses reject a standard deviation that is zero within the tolerance or negative, so
 // QENTolerance itself passes here while CheckStdDev rejects it.
