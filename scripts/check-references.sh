@@ -5,6 +5,8 @@
 set -euo pipefail
 cd "$(dirname "$0")/.."
 python3 -c 'import mpmath' || { echo "check-references: python3 lacks mpmath (scripts/setup.sh)"; exit 1; }
+# The scripts' shared helpers (tovrin/testing/reference_support.py) are found through PYTHONPATH.
+support="$PWD/tovrin/testing"
 scratch=$(mktemp -d)
 trap 'rm -rf "$scratch"' EXIT
 status=0
@@ -13,7 +15,7 @@ for script in $(find tovrin -name '*_reference.py' | sort); do
   table="$(dirname "$script")/$name.inc"
   mkdir -p "$scratch/$name"
   cp "$script" "$scratch/$name/"
-  if ! (cd "$scratch/$name" && python3 "$name.py" >"$scratch/$name/stdout"); then
+  if ! (cd "$scratch/$name" && PYTHONPATH="$support" python3 "$name.py" >"$scratch/$name/stdout"); then
     echo "FAILED to run $script"; status=1; continue
   fi
   # A script that prints its table instead of writing it beside itself is read from its output.

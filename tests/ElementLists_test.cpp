@@ -9,30 +9,19 @@
 namespace tovrin {
 namespace {
 
-template <typename V>
-concept CanSqrt = requires(V& v) {
-  SqrtVector(v);
-};
-template <typename V>
-concept CanAppend = requires(V& v) {
-  AppendValue2Vector(v, 1);
-};
-template <typename V>
-concept CanAdd = requires(const V& v) {
-  AddVectors(v, v);
-};
-template <typename V>
-concept CanTestSign = requires(const V& v) {
-  VectorPositive(v);
-};
-template <typename V>
-concept CanConvertToLInt = requires(const V& v) {
-  Vector2LIntVector(v);
-};
-template <typename V>
-concept CanSort = requires(V& v) {
-  QSortVector(v, true);
-};
+// Name<T> holds when the call compiles for an argument of type T.
+#define TOVRIN_ACCEPTS(Name, Param, Call) \
+  template <typename T>                   \
+  concept Name = requires(Param) {        \
+    Call;                                 \
+  };
+
+TOVRIN_ACCEPTS(CanSqrt, T& v, SqrtVector(v))
+TOVRIN_ACCEPTS(CanAppend, T& v, AppendValue2Vector(v, 1))
+TOVRIN_ACCEPTS(CanAdd, const T& v, AddVectors(v, v))
+TOVRIN_ACCEPTS(CanTestSign, const T& v, VectorPositive(v))
+TOVRIN_ACCEPTS(CanConvertToLInt, const T& v, Vector2LIntVector(v))
+TOVRIN_ACCEPTS(CanSort, T& v, QSortVector(v, true))
 
 static_assert(CanSqrt<TQENFloatVector> && CanSqrt<TQENSingleVector>);
 static_assert(!CanSqrt<TQENInt64Vector> && !CanSqrt<TQENWordVector>);
@@ -45,30 +34,19 @@ static_assert(CanSort<TQENSIntVector> && !CanSort<std::vector<Int64*>>);
 static_assert(!CanSort<TQENFloatMatrix> && !CanSort<std::vector<long double>>);
 
 // The open-array conversions take a span, and what converts to one of a listed type.
-template <typename A>
-concept CanConvertArray = requires(const A& a) {
-  Array2FloatVector(a);
-};
+TOVRIN_ACCEPTS(CanConvertArray, const T& a, Array2FloatVector(a))
 static_assert(CanConvertArray<std::span<const Word>> && CanConvertArray<TQENWordVector>);
 static_assert(CanConvertArray<std::array<Double, 3>> && CanConvertArray<std::span<Byte>>);
 static_assert(!CanConvertArray<std::vector<long long>> && !CanConvertArray<std::vector<char>>);
 
-template <typename M>
-concept CanInvert = requires(M& m) {
-  MatrixInverse(m, m);
-};
-template <typename M>
-concept CanSumRow = requires(const M& m) {
-  SumMatrixRow(m, 0);
-};
-template <typename V>
-concept CanTakeMedian = requires(const V& v) {
-  GetMedian(v);
-};
+TOVRIN_ACCEPTS(CanInvert, T& m, MatrixInverse(m, m))
+TOVRIN_ACCEPTS(CanSumRow, const T& m, SumMatrixRow(m, 0))
+TOVRIN_ACCEPTS(CanTakeMedian, const T& v, GetMedian(v))
 
 static_assert(CanInvert<TQENDoubleMatrix> && !CanInvert<TQENInt64Matrix>);
 static_assert(CanSumRow<TQENLWordMatrix> && !CanSumRow<TQENLIntMatrix>);
 static_assert(CanTakeMedian<TQENLWordVector> && !CanTakeMedian<TQENWordVector>);
+#undef TOVRIN_ACCEPTS
 
 }  // namespace
 }  // namespace tovrin

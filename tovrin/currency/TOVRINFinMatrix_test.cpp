@@ -23,10 +23,7 @@ constexpr Int64 kOne = std::is_same_v<T, TQENCurrency>       ? 100
                        : std::is_same_v<T, TQENLongCurrency> ? 1000000
                                                              : 10000;
 
-template <typename T>
-class MoneyMatrix : public ::testing::Test {};
-using MoneyTypes = ::testing::Types<TQENCurrency, TQENLongCurrency, Currency>;
-TYPED_TEST_SUITE(MoneyMatrix, MoneyTypes);
+TOVRIN_TYPED_SUITE(MoneyMatrix, MoneyElements);
 
 TYPED_TEST(MoneyMatrix, CreatorsAndIdentityHoldTheStoredOne) {
   using T = TypeParam;

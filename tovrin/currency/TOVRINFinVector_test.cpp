@@ -20,10 +20,7 @@ namespace {
 using namespace testing;
 using Ints = std::vector<Int64>;
 
-template <typename T>
-class MoneyVector : public ::testing::Test {};
-using MoneyTypes = ::testing::Types<TQENCurrency, TQENLongCurrency, Currency>;
-TYPED_TEST_SUITE(MoneyVector, MoneyTypes);
+TOVRIN_TYPED_SUITE(MoneyVector, MoneyElements);
 
 TYPED_TEST(MoneyVector, BuildingCopyingAndTheSameTypeConversion) {
   using T = TypeParam;

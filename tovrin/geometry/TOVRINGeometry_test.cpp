@@ -65,56 +65,27 @@ TEST(GeometryChecks, EveryLengthArgumentIsChecked) {
   using F1 = Extended (*)(Extended);
   using F2 = Extended (*)(Extended, Extended);
   using F3 = Extended (*)(Extended, Extended, Extended);
-  const F1 ones[] = {&AreaSquare,
-                     &AreaCircle,
-                     &AreaSemiCircle,
-                     &AreaPentagon,
-                     &AreaHexagon,
-                     &AreaHeptagon,
-                     &AreaOctagon,
-                     &AreaNonagon,
-                     &AreaDecagon,
-                     &PerimeterSquare,
-                     &CircumferenceCircle,
-                     &CircumferenceSemiCircle,
-                     &PerimeterPentagon,
-                     &PerimeterHexagon,
-                     &PerimeterOctagon,
-                     &PerimeterDecagon,
-                     &VolCube,
-                     &VolSphere,
-                     &VolHemiSphere,
-                     &VolTetrahedron,
-                     &VolOctahedron,
-                     &VolDodecahedron,
-                     &VolIcosahedron,
-                     &SurfaceAreaCube,
-                     &SurfaceAreaSphere,
-                     &SurfaceAreaHemiSphere,
-                     &SurfaceAreaTetrahedron,
-                     &SurfaceAreaOctahedron,
-                     &SurfaceAreaDodecahedron,
-                     &SurfaceAreaIcosahedron};
+  // clang-format off
+  const F1 ones[] = {
+      &AreaSquare, &AreaCircle, &AreaSemiCircle, &AreaPentagon, &AreaHexagon, &AreaHeptagon,
+      &AreaOctagon, &AreaNonagon, &AreaDecagon, &PerimeterSquare, &CircumferenceCircle,
+      &CircumferenceSemiCircle, &PerimeterPentagon, &PerimeterHexagon, &PerimeterOctagon,
+      &PerimeterDecagon, &VolCube, &VolSphere, &VolHemiSphere, &VolTetrahedron, &VolOctahedron,
+      &VolDodecahedron, &VolIcosahedron, &SurfaceAreaCube, &SurfaceAreaSphere,
+      &SurfaceAreaHemiSphere, &SurfaceAreaTetrahedron, &SurfaceAreaOctahedron,
+      &SurfaceAreaDodecahedron, &SurfaceAreaIcosahedron};
+  // clang-format on
   for (F1 f : ones) {
     ExpectRaises(rsLengthNotNeg, [&] { f(-0.5L); });
     EXPECT_EQ(f(0), 0);
   }
-  const F2 twos[] = {&AreaRectangle,
-                     &AreaParallelogram,
-                     &AreaRhombus,
-                     &AreaSector,
-                     &AreaEllipse,
-                     &PerimeterRectangle,
-                     &ArcLength,
-                     &PerimeterSector,
-                     &VolRectangularPrism,
-                     &VolCylinder,
-                     &VolPyramid,
-                     &VolCone,
-                     &SurfaceAreaRectangularPrism,
-                     &SurfaceAreaCylinder,
-                     &SurfaceAreaPyramid,
-                     &SurfaceAreaCone};
+  // clang-format off
+  const F2 twos[] = {
+      &AreaRectangle, &AreaParallelogram, &AreaRhombus, &AreaSector, &AreaEllipse,
+      &PerimeterRectangle, &ArcLength, &PerimeterSector, &VolRectangularPrism, &VolCylinder,
+      &VolPyramid, &VolCone, &SurfaceAreaRectangularPrism, &SurfaceAreaCylinder,
+      &SurfaceAreaPyramid, &SurfaceAreaCone};
+  // clang-format on
   for (F2 f : twos) {
     ExpectRaises(rsLengthNotNeg, [&] { f(-0.5L, 4); });
     ExpectRaises(rsLengthNotNeg, [&] { f(3, -0.5L); });

@@ -22,9 +22,7 @@ struct ReduceCase {
 
 using namespace testing;
 
-template <typename T>
-class Reduce : public ::testing::Test {};
-TYPED_TEST_SUITE(Reduce, testing::FloatElements);
+TOVRIN_TYPED_SUITE(Reduce, testing::FloatElements);
 
 // The unit roundoff of the element type, for error bounds.
 template <typename T>

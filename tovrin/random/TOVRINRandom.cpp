@@ -288,20 +288,22 @@ Extended StandardNormal(Gen& gen) {
     double x = u - 0.449871;
     double y = std::fabs(vNear) + 0.386595;
     double q = x * x + y * (0.196 * y - 0.25472 * x);
-    if (std::fabs(q - 0.27597) < 1e-9 || std::fabs(q - 0.27846) < 1e-9) [[unlikely]] {
+    // Clear of both bounds (the common case) the estimate decides alone.
+    if (q <= 0.27597 - 1e-9) {
       v = LevaV(rawV);
+      break;
+    }
+    if (q >= 0.27846 + 1e-9) continue;
+    v = LevaV(rawV);
+    if (std::fabs(q - 0.27597) < 1e-9 || std::fabs(q - 0.27846) < 1e-9) {
       x = static_cast<double>(u - 0.449871L);
       y = static_cast<double>(std::fabs(v) + 0.386595L);
       const Extended xe = x;
       const Extended ye = y;
       q = static_cast<double>(xe * xe + ye * (0.196L * ye - 0.25472L * xe));
     }
-    if (q <= 0.27597) {
-      v = LevaV(rawV);
-      break;
-    }
+    if (q <= 0.27597) break;
     if (q > 0.27846) continue;
-    v = LevaV(rawV);
     if (static_cast<Extended>(v) * v < -4.0L * static_cast<Extended>(u) * u * Ln80(Extended{u})) {
       break;
     }

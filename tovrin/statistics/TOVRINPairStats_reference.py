@@ -12,20 +12,17 @@ Writes TOVRINPairStats_reference.inc next to this script:
 The pairs are dyadic numbers, exact in the extended format.
 Run: python3 TOVRINPairStats_reference.py
 """
-import os
 from fractions import Fraction
 
 import mpmath
 from mpmath import mp, mpf
+import os
+import sys
+
+sys.path.insert(0, os.path.join(os.path.dirname(os.path.abspath(__file__)), "..", "testing"))
+from reference_support import exact_lit, fixed_lit, hexfloat, lcg, q2mp  # noqa: E402
 
 mp.prec = 256
-
-
-def lcg(seed):
-    state = seed
-    while True:
-        state = (state * 6364136223846793005 + 1442695040888963407) % 2**64
-        yield state >> 33
 
 
 gen = lcg(777)
@@ -34,31 +31,6 @@ X = [Fraction(next(gen) % 4001 - 2000, 128) for _ in range(N)]
 # y = 3 - 1.5 x + 0.25 x^2 plus dyadic noise.
 Y = [3 - Fraction(3, 2) * x + Fraction(1, 4) * x * x + Fraction(next(gen) % 2001 - 1000, 64)
      for x in X]
-
-
-def q2mp(q):
-    return mpf(q.numerator) / q.denominator
-
-
-def lit(x):
-    return mpmath.nstr(mpf(x), 30, min_fixed=-5, max_fixed=5, strip_zeros=False) + "L"
-
-
-def exact_lit(q):
-    text = mpmath.nstr(q2mp(q), 40, min_fixed=-40, max_fixed=40)
-    if "." not in text:
-        text += ".0"
-    return text + "L"
-
-
-def hexfloat(x):
-    x = mpf(x)
-    if x == 0:
-        return "0.0L"
-    sign = "-" if x < 0 else ""
-    man, exp = abs(x).man_exp
-    assert man.bit_length() <= 64
-    return f"{sign}0x{man:x}p{exp}L"
 
 
 xs = [q2mp(v) for v in X]
@@ -114,7 +86,7 @@ for name, value in (("Correlation", r), ("Determination", r * r), ("Slope", slop
                     ("Intercept", intercept), ("SSEAboutFit", sse),
                     ("SSEAboutGiven", q2mp(sse_given)), ("ExactA", abc[0]), ("ExactB", abc[1]),
                     ("ExactC", abc[2])):
-    lines.append(f"inline constexpr long double k{name} = {lit(value)};")
+    lines.append(f"inline constexpr long double k{name} = {fixed_lit(value)};")
 lines.append(f"inline constexpr long double kGivenIntercept = {exact_lit(GIVEN_INTERCEPT)};")
 lines.append(f"inline constexpr long double kGivenSlope = {exact_lit(GIVEN_SLOPE)};")
 for name, value in (("A", a), ("B", b), ("C", c)):

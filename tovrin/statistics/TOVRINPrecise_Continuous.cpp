@@ -36,9 +36,13 @@ Extended NormalUpper(const Pair& z) {
   const Pair x = detail::Product(z, Pair{kInvSqrt2, kInvSqrt2Lo});
   Extended e = std::erfc(x.hi);
   // The correction is x.lo erfc'(x.hi), at most 2 x^2 units in the last place of erfc for
-  // x > 0 and less than one below: below x = 2 it is not worth its exp.
+  // x > 0 and less than one below: below x = 2 it is not worth its exp. It needs few digits
+  // (a relative 1e-6 at most), which the double exp gives while x^2 < 700.
   if (x.lo != 0.0L && x.hi > 2.0L && x.hi < 110.0L) {
-    e -= x.lo * kTwoOverSqrtPi * Exp80(-x.hi * x.hi);
+    const Extended x2 = x.hi * x.hi;
+    const Extended decay =
+        x2 < 700.0L ? static_cast<Extended>(std::exp(static_cast<double>(-x2))) : Exp80(-x2);
+    e -= x.lo * kTwoOverSqrtPi * decay;
   }
   return 0.5L * e;
 }
@@ -68,11 +72,6 @@ Extended ExpMinusHalfSquare(Extended hi, Extended lo) {
   return ExpMinusHalfSquareOfHalves(h, (hi - h) + lo);
 }
 
-// (X - Mean) / StdDev to twice the working precision.
-Pair Standardized(Extended Mean, Extended StdDev, Extended X) {
-  return detail::Quotient(detail::ExactSum(X, -Mean), Pair{StdDev});
-}
-
 // Scales within 2^(+-1000) have a normal reciprocal and split without overflow (the bounds are
 // doubles, cheap to load).
 bool ScaleInRange(Extended s) { return s >= 0x1p-1000 && s <= 0x1p1000; }
@@ -87,18 +86,29 @@ Pair HalvesOfQuotient(Extended n, Extended nlo, Extended d, Extended r) {
   return {h, (((n - h * d_hi) - h * (d - d_hi)) + nlo) * r};
 }
 
-// The normal density at X, z = (X - Mean) / StdDev carried to twice the precision.
-Extended NormalDensity(Extended Mean, Extended StdDev, Extended X) {
+// (X - Mean) / StdDev to twice the working precision (hi + lo, |lo| below 2^-31 |hi|).
+Pair Standardized(Extended Mean, Extended StdDev, Extended X) {
+  const Pair d = detail::ExactSum(X, -Mean);
+  if (ScaleInRange(StdDev)) {
+    const Extended inverse = 1.0L / StdDev;
+    if (std::fabs(d.hi * inverse) < 0x1p1000) return HalvesOfQuotient(d.hi, d.lo, StdDev, inverse);
+  }
+  return detail::Quotient(d, Pair{StdDev});
+}
+
+// The normal density at X, z = (X - Mean) / StdDev carried to twice the precision, times
+// Scale (which the log-normal density forms beside its logarithm).
+Extended NormalDensity(Extended Mean, Extended StdDev, Extended X, Extended Scale = 1.0L) {
   if (!ScaleInRange(StdDev)) {
     const Pair z = Standardized(Mean, StdDev, X);
-    return kInvSqrt2Pi * ExpMinusHalfSquare(z.hi, z.lo) / StdDev;
+    return kInvSqrt2Pi * ExpMinusHalfSquare(z.hi, z.lo) / StdDev * Scale;
   }
   const Extended inverse = 1.0L / StdDev;
   const Pair d = detail::ExactSum(X, -Mean);
   const Extended rounded = d.hi * inverse;
   if (!(std::fabs(rounded) < 152.0L)) return std::isnan(rounded) ? kNaN : 0.0L;
   const Pair z = HalvesOfQuotient(d.hi, d.lo, StdDev, inverse);
-  return kInvSqrt2Pi * inverse * ExpMinusHalfSquareOfHalves(z.hi, z.lo);
+  return kInvSqrt2Pi * inverse * Scale * ExpMinusHalfSquareOfHalves(z.hi, z.lo);
 }
 
 #include "tovrin/statistics/TOVRINPrecise_InvNormal.inc"
@@ -393,6 +403,7 @@ Extended InvNormalDistGreater(Extended Mean, Extended StdDev, Extended P) {
 Extended LogNormalPDF(Extended Mean, Extended StdDev, Extended X) {
   CheckStdDev(StdDev);
   if (!(X > 0)) RaiseMathError(rsValueGZero);
+  if (ScaleInRange(X)) return NormalDensity(Mean, StdDev, Ln80(X), 1.0L / X);
   return NormalDensity(Mean, StdDev, Ln80(X)) / X;
 }
 

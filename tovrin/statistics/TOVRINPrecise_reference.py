@@ -13,21 +13,14 @@ step to the exact root of that rounded probability. Run from this folder:
 """
 from mpmath import (mp, mpf, workprec, sqrt, exp, log, log1p, pi, erfc, loggamma,
                     nstr, inf, beta as mbeta, fsum)
+import os
+import sys
+
+sys.path.insert(0, os.path.join(os.path.dirname(os.path.abspath(__file__)), "..", "testing"))
+from reference_support import ext, sci_lit  # noqa: E402
 
 mp.dps = 80
 SMALLEST = mpf("3.3621031431120935063e-4932")  # smallest normal Extended
-
-
-def ext(x):
-    with workprec(64):
-        return +mpf(x)
-
-
-def lit(x):
-    x = mpf(x)
-    if x == 0:
-        return "0.0L"
-    return nstr(x, 30, min_fixed=1, max_fixed=0, strip_zeros=False) + "L"
 
 
 # --- Normal -----------------------------------------------------------------------------------
@@ -421,5 +414,5 @@ print("// Arguments are rounded to the 80-bit format before the reference is com
 print("// {function, {arguments}, exact value}")
 print("inline constexpr PreciseRow kPreciseReference[] = {")
 for name, args, value in ROWS:
-    print(f'    {{"{name}", {{{", ".join(lit(a) for a in args)}}}, {lit(value)}}},')
+    print(f'    {{"{name}", {{{", ".join(sci_lit(a) for a in args)}}}, {sci_lit(value)}}},')
 print("};")

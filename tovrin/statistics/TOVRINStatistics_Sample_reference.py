@@ -13,46 +13,17 @@ dyadic numbers, so the C++ literals hold them exactly. Two kinds of values are p
 
 Run: python3 TOVRINStatistics_Sample_reference.py
 """
-import os
 from fractions import Fraction
 
 import mpmath
 from mpmath import mp, mpf
+import os
+import sys
+
+sys.path.insert(0, os.path.join(os.path.dirname(os.path.abspath(__file__)), "..", "testing"))
+from reference_support import exact_lit, fixed_lit, hexfloat, lcg  # noqa: E402
 
 mp.prec = 256
-
-
-def lcg(seed):
-    state = seed
-    while True:
-        state = (state * 6364136223846793005 + 1442695040888963407) % 2**64
-        yield state >> 33
-
-
-def hexfloat(x):
-    """An mpf as an exact C++ long double hex literal (x must fit in 64 bits of mantissa)."""
-    x = mpf(x)
-    if x == 0:
-        return "0.0L"
-    sign = "-" if x < 0 else ""
-    man, exp = mpmath.mpf(abs(x)).man_exp
-    assert man.bit_length() <= 64, "value does not fit the extended format"
-    return f"{sign}0x{man:x}p{exp}L"
-
-
-def lit(x, digits=30):
-    """A high-precision value as a decimal long double literal."""
-    return mpmath.nstr(mpf(x), digits, min_fixed=-5, max_fixed=5, strip_zeros=False) + "L"
-
-
-def exact_lit(q):
-    """A dyadic rational as an exact decimal literal."""
-    q = Fraction(q)
-    assert q.denominator & (q.denominator - 1) == 0
-    text = mpmath.nstr(mpf(q.numerator) / q.denominator, 40, min_fixed=-40, max_fixed=40)
-    if "." not in text:
-        text += ".0"
-    return text + "L"
 
 
 def round_to(x, bits):
@@ -162,7 +133,7 @@ def emit_vector(name, values):
 
 
 def emit(name, value):
-    lines.append(f"inline constexpr long double {name} = {lit(value)};")
+    lines.append(f"inline constexpr long double {name} = {fixed_lit(value)};")
 
 
 emit_vector("kCentred", CENTRED)
@@ -270,7 +241,7 @@ for size in sizes:
     q1 = hazen_single(part, Fraction(1, 4))
     q3 = hazen_single(part, Fraction(3, 4))
     dec = [hazen_single(part, Fraction(j, 10)) for j in range(1, 10)]
-    lines.append(f"    {{{size}, {lit(q1)}, {lit(q3)}, {{{', '.join(lit(d) for d in dec)}}}}},")
+    lines.append(f"    {{{size}, {fixed_lit(q1)}, {fixed_lit(q3)}, {{{', '.join(fixed_lit(d) for d in dec)}}}}},")
 lines.append("};")
 
 out = os.path.join(os.path.dirname(os.path.abspath(__file__)),

@@ -213,5 +213,12 @@ using ArithmeticElements = ::testing::Types<PackedExtended, Double, Single, Int6
 // One type for each rule: Extended, Single (its own precision), Int64, LongWord (32-bit
 // unsigned wrap), LongInt (32-bit signed wrap) and Byte (widening).
 using RuleElements = ::testing::Types<PackedExtended, Single, Int64, LongWord, LongInt, Byte>;
+using MoneyElements = ::testing::Types<TQENCurrency, TQENLongCurrency, Currency>;
+
+// A typed test suite Name over the element types Types.
+#define TOVRIN_TYPED_SUITE(Name, Types)   \
+  template <typename T>                   \
+  class Name : public ::testing::Test {}; \
+  TYPED_TEST_SUITE(Name, Types)
 
 }  // namespace tovrin::testing

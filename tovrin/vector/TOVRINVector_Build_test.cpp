@@ -11,9 +11,7 @@ namespace {
 
 using namespace testing;
 
-template <typename T>
-class VectorBuild : public ::testing::Test {};
-TYPED_TEST_SUITE(VectorBuild, testing::BuildableElements);
+TOVRIN_TYPED_SUITE(VectorBuild, testing::BuildableElements);
 
 TYPED_TEST(VectorBuild, AppendInsertAndDelete) {
   std::vector<TypeParam> v;
@@ -44,9 +42,7 @@ TYPED_TEST(VectorBuild, AppendInsertAndDelete) {
   EXPECT_EQ(d.capacity(), 0u);  // the storage is released, not merely resized
 }
 
-template <typename T>
-class VectorAggregate : public ::testing::Test {};
-TYPED_TEST_SUITE(VectorAggregate, testing::AllElements);
+TOVRIN_TYPED_SUITE(VectorAggregate, testing::AllElements);
 
 TYPED_TEST(VectorAggregate, ExtremesSumsAndEmptiness) {
   const auto v = Vec<TypeParam>({3, 1, 4, 1, 5});
@@ -150,9 +146,7 @@ std::string Signs(const V& v) {
   return s;
 }
 
-template <typename T>
-class VectorSigns : public ::testing::Test {};
-TYPED_TEST_SUITE(VectorSigns, testing::FloatElements);
+TOVRIN_TYPED_SUITE(VectorSigns, testing::FloatElements);
 
 TYPED_TEST(VectorSigns, ExactValuesAndTheTolerance) {
   const struct {
@@ -163,12 +157,11 @@ TYPED_TEST(VectorSigns, ExactValuesAndTheTolerance) {
                {{1e-11L}, "101001"}, {{-1e-11L}, "011010"}};
   for (const auto& c : cases) EXPECT_EQ(Signs(Vec<TypeParam>(c.values)), c.signs);
   const std::vector<TypeParam> empty;
-  ExpectRaises(rsVectorIsEmpty, [&] { VectorNonNegative(empty); });
-  ExpectRaises(rsVectorIsEmpty, [&] { VectorNegative(empty); });
-  ExpectRaises(rsVectorIsEmpty, [&] { VectorNonZero(empty); });
-  ExpectRaises(rsVectorIsEmpty, [&] { VectorZero(empty); });
-  ExpectRaises(rsVectorIsEmpty, [&] { VectorNonPositive(empty); });
-  ExpectRaises(rsVectorIsEmpty, [&] { VectorPositive(empty); });
+  for (auto f :
+       {&VectorNonNegative<TypeParam>, &VectorNegative<TypeParam>, &VectorNonZero<TypeParam>,
+        &VectorZero<TypeParam>, &VectorNonPositive<TypeParam>, &VectorPositive<TypeParam>}) {
+    ExpectRaises(rsVectorIsEmpty, [&] { f(empty); });
+  }
 }
 
 TEST(VectorSigns, SingleNonZeroIsExactAndInt64HasNoTolerance) {

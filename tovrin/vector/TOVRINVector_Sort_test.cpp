@@ -18,9 +18,7 @@ namespace {
 
 using namespace testing;
 
-template <typename T>
-class Sort : public ::testing::Test {};
-TYPED_TEST_SUITE(Sort, testing::RuleElements);
+TOVRIN_TYPED_SUITE(Sort, testing::RuleElements);
 
 // Random vectors with many repeats come out as std::sort orders them; the empty and the
 // one-element vectors are left alone.
@@ -117,24 +115,15 @@ TEST(Sort, ExtendedKeysGiveThePlainResultBitForBit) {
     for (int variant = 0; variant <= 3; ++variant) {
       TQENFloatVector v(size);
       for (int k = 0; k < size; ++k) {
-        switch (rng() % 6) {
-          case 0:
-            v[k] = rng() % 2 ? 0.0L : -0.0L;
-            break;
-          case 1:
-            v[k] = 0x1p-16440L * static_cast<Extended>(rng() % 4) * (rng() % 2 ? 1 : -1);
-            break;
-          case 2:
-            v[k] = rng() % 2 ? std::numeric_limits<Extended>::infinity()
-                             : -std::numeric_limits<Extended>::infinity();
-            break;
-          case 3:
-            v[k] = static_cast<Extended>(rng() % 5) - 2;
-            break;
-          default:
-            v[k] = std::ldexp(static_cast<Extended>(rng()), static_cast<int>(rng() % 64) - 90) *
-                   (rng() % 2 ? 1 : -1);
-        }
+        // Signed zeros, subnormals, infinities, small integers and values of many magnitudes.
+        const Extended sign = rng() % 2 ? 1 : -1;
+        const std::uint64_t kind = rng() % 6, r = rng();
+        v[k] = kind == 0   ? sign * 0.0L
+               : kind == 1 ? sign * 0x1p-16440L * static_cast<Extended>(r % 4)
+               : kind == 2 ? sign * std::numeric_limits<Extended>::infinity()
+               : kind == 3
+                   ? static_cast<Extended>(r % 5) - 2
+                   : sign * std::ldexp(static_cast<Extended>(r), static_cast<int>(rng() % 64) - 90);
       }
       if (variant > 0) v[static_cast<std::size_t>(size / 2)] = odd[variant - 1];
       ExpectSameBitsAsPlainSort(v);
@@ -197,9 +186,7 @@ TEST(QuickSortPositions, ExchangesAsTracedByHand) {
   EXPECT_EQ(sortTagged({{1, 'a'}, {0, 'b'}, {1, 'c'}, {0, 'd'}}, true), "dbac");
 }
 
-template <typename T>
-class Rank : public ::testing::Test {};
-TYPED_TEST_SUITE(Rank, testing::RuleElements);
+TOVRIN_TYPED_SUITE(Rank, testing::RuleElements);
 
 TYPED_TEST(Rank, FirstPositionInTheSortedCopy) {
   const auto v = Vec<TypeParam>({10, 30, 20});

@@ -68,17 +68,6 @@ void MatrixEditModel::Resize(std::size_t Rows, std::size_t Cols) {
   ReportChanged();
 }
 
-void MatrixEditModel::MakeNull(const QModelIndexList& Cells) {
-  bool changed = false;
-  for (const QModelIndex& cell : Cells) {
-    if (!checkIndex(cell, CheckIndexOption::IndexIsValid) || CellIsNull(cell)) continue;
-    StoreCell(cell, std::nullopt);
-    emit dataChanged(cell, cell);
-    changed = true;
-  }
-  if (changed) ReportChanged();
-}
-
 int MatrixEditModel::rowCount(const QModelIndex& parent) const {
   return parent.isValid() ? 0 : Rows();
 }

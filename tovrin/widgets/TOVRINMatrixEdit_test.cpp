@@ -3,7 +3,6 @@
 #include <gtest/gtest.h>
 
 #include <QSignalSpy>
-#include <functional>
 
 #include "tovrin/widgets/TOVRINMatrixFractEdit.h"
 #include "tovrin/widgets/TOVRINWidgets_testing.h"

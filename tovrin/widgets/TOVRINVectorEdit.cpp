@@ -85,18 +85,6 @@ class VectorEditModel : public GridModel {
     ReportChanged();
   }
 
-  // The Delete key: the selected value cells become null, one change in all.
-  void MakeNull(const QModelIndexList& Cells) {
-    bool changed = false;
-    for (const QModelIndex& cell : Cells) {
-      if (!cell.isValid() || !IsValueCell(cell) || CellIsNull(cell)) continue;
-      StoreCell(cell, std::nullopt);
-      emit dataChanged(cell, cell);
-      changed = true;
-    }
-    if (changed) ReportChanged();
-  }
-
   // The values become Work, none null; Order, when given, is the old row of each new row and
   // carries the labels along.
   void Commit(TQENFloatVector Work, const std::vector<std::size_t>& Order = {}) {

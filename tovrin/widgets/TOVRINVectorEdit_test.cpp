@@ -5,15 +5,11 @@
 #include <QLineEdit>
 #include <QSignalSpy>
 #include <QTest>
-#include <functional>
 
 #include "tovrin/widgets/TOVRINWidgets_testing.h"
 
 namespace tovrin {
 namespace {
-
-template <typename Outcome>
-using Case = testing::CommandCase<TQENVectorEdit, TQENFloatVector, Outcome>;
 
 QString Cell(const TQENVectorEdit& edit, int row, int col = 0) {
   return edit.model()->index(row, col).data().toString();

@@ -130,6 +130,20 @@ void GridModel::AllCellsChanged() {
     emit dataChanged(index(0, 0), index(rowCount() - 1, columnCount() - 1));
 }
 
+void GridModel::MakeNull(const QModelIndexList& Cells) {
+  bool changed = false;
+  for (const QModelIndex& cell : Cells) {
+    if (!checkIndex(cell, CheckIndexOption::IndexIsValid) || !IsValueCell(cell) ||
+        CellIsNull(cell)) {
+      continue;
+    }
+    StoreCell(cell, std::nullopt);
+    emit dataChanged(cell, cell);
+    changed = true;
+  }
+  if (changed) ReportChanged();
+}
+
 QString GridModel::DisplayText(const QModelIndex& index) const {
   if (maxDenominator_ > 0)
     return FractionCellText(CellValue(index), CellIsNull(index), decimals_, maxDenominator_);

@@ -79,6 +79,8 @@ class GridModel : public QAbstractTableModel {
 
   // Every cell whose text may have changed (all of them) is repainted.
   void AllCellsChanged();
+  // The Delete key: the selected value cells become null, one change in all.
+  void MakeNull(const QModelIndexList& Cells);
 
  protected:
   virtual bool IsValueCell(const QModelIndex& index) const = 0;

@@ -25,8 +25,6 @@ class MatrixEditModel : public GridModel {
   void Resize(std::size_t Rows, std::size_t Cols);
   // The values become Work (which a library function produced), none null.
   void Commit(TQENFloatMatrix Work);
-  // The Delete key: the selected cells become null, one change in all.
-  void MakeNull(const QModelIndexList& Cells);
 
   int rowCount(const QModelIndex& parent = QModelIndex()) const override;
   int columnCount(const QModelIndex& parent = QModelIndex()) const override;
