@@ -419,6 +419,8 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
     if (floorBound < 0) floorBound = 2 * std::exp(-699.0 * static_cast<double>(shape));
     return u <= floorBound;
   };
+  const Extended oneMinusP = 1 - p;
+  const Extended power = 1 / shape;
   Extended w0 = 0;
   bool haveW0 = false;
   Extended tLnT = 0;
@@ -429,38 +431,47 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
   for (;;) {
     const Extended u = gen();
     if (u >= 1) continue;
-    Extended x;
-    Extended w = 0;        // in the tail, an estimate of t ln x - t ln t within wError
+    if (!(u > p)) {
+      // The body: x = t (u / p)^(1 / Shape), accepted if x < 1 - u2, or u2 <= 0, or
+      // u2 (1 + x) < 1 and x < -ln u2, the logarithm first in double.
+      if (underFloorBound(u)) {
+        if (!haveW0) {
+          w0 = p * XtoY(kTiny / t, shape);
+          haveW0 = true;
+        }
+        if (u <= w0) return 0;
+      }
+      const Extended x = t * Power(u / p, power);
+      const Extended u2 = gen();
+      if (x < 1 - u2) return x;
+      if (u2 <= 0) return x;
+      if (!(u2 * (1 + x) < 1)) continue;
+      BoundedLog logU2;
+      if (DoubleLog(u2, logU2)) {
+        const Settled beyond = SettleLess(x, 0, -logU2.value, logU2.bound);
+        if (beyond == Settled::kYes) return x;
+        if (beyond == Settled::kNo) continue;
+      }
+      if (x < -Ln80(u2)) return x;
+      continue;
+    }
+    // The tail: the same test with w = t ln x - t ln t, first from an estimate within wError.
+    const Extended x = t - Ln80((1 - u) / oneMinusP);
+    Extended w = 0;
     Extended wError = -1;  // -1: w is not known yet
-    const bool tail = u > p;
-    if (tail) {
-      x = t - Ln80((1 - u) / (1 - p));
-      BoundedLog logX;
-      if (!haveLogT) {
-        logTValid = DoubleLog(t, logT);
-        haveLogT = true;
-      }
-      if (DoubleLog(x, logX) && logTValid) {
-        const Extended lnX = logX.value;
-        const Extended lnT = logT.value;
-        w = t * lnX - t * lnT;
-        wError = t * Extended(logX.bound + logT.bound) * 1.01L +
-                 0x1p-60L * t * (std::fabs(lnX) + std::fabs(lnT));
-      }
-    } else {
-      const bool underBound = underFloorBound(u);
-      if (underBound && !haveW0) {
-        w0 = p * XtoY(kTiny / t, shape);
-        haveW0 = true;
-      }
-      if (underBound && u <= w0) return 0;
-      x = t * Power(u / p, 1 / shape);
-      w = x;
-      wError = 0;
+    BoundedLog logX;
+    if (!haveLogT) {
+      logTValid = DoubleLog(t, logT);
+      haveLogT = true;
+    }
+    if (DoubleLog(x, logX) && logTValid) {
+      const Extended lnX = logX.value;
+      const Extended lnT = logT.value;
+      w = t * lnX - t * lnT;
+      wError = t * Extended(logX.bound + logT.bound) * 1.01L +
+               0x1p-60L * t * (std::fabs(lnX) + std::fabs(lnT));
     }
     const Extended u2 = gen();
-    // Accept if w < 1 - u2, or u2 <= 0, or u2 (1 + w) < 1 and w < -ln u2: first from the
-    // estimates, then, where they cannot tell, from the exact w and logarithm.
     if (wError >= 0) {
       const Settled below = SettleLess(w, wError, 1 - u2, 0);
       if (below == Settled::kYes) return x;
@@ -476,13 +487,11 @@ Extended GammaSmallShape(Extended shape, Gen& gen) {
         }
       }
     }
-    if (tail) {
-      if (!haveTLnT) {
-        tLnT = t * Ln80(t);
-        haveTLnT = true;
-      }
-      w = t * Ln80(x) - tLnT;
+    if (!haveTLnT) {
+      tLnT = t * Ln80(t);
+      haveTLnT = true;
     }
+    w = t * Ln80(x) - tLnT;
     if (w < 1 - u2) return x;
     if (u2 <= 0) return x;
     if (u2 * (1 + w) < 1 && w < -Ln80(u2)) return x;
