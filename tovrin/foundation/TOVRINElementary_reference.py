@@ -6,9 +6,14 @@ literal. Prints the table; takes a few seconds:
 
     python3 TOVRINElementary_reference.py > TOVRINElementary_reference.inc
 """
+import os
 import random
+import sys
 
 from mpmath import mp, mpf, exp, log, floor, nint
+
+sys.path.insert(0, os.path.join(os.path.dirname(os.path.abspath(__file__)), "..", "testing"))
+from reference_support import hexfloat  # noqa: E402
 
 mp.prec = 320
 QMIN = -16382 - 63
@@ -26,20 +31,9 @@ def rounded(v):
 
 
 def lit(v):
-    if v == mp.inf:
-        return "Inf"
-    if v == -mp.inf:
-        return "-Inf"
-    if v == 0:
-        return "0.0L"
-    sign = "-" if v < 0 else ""
-    v = abs(v)
-    e = int(floor(log(v, 2))) - 63
-    m = int(nint(v / mpf(2) ** e))
-    while m % 2 == 0:
-        m //= 2
-        e += 1
-    return f"{sign}0x{m:X}p{e}L"
+    if v in (mp.inf, -mp.inf):
+        return "Inf" if v > 0 else "-Inf"
+    return hexfloat(v)
 
 
 def uniform(rng, lo, hi):

@@ -387,15 +387,11 @@ Extended NormalDistGreater(Extended Mean, Extended StdDev, Extended X) {
 }
 
 Extended InvNormalDistLess(Extended Mean, Extended StdDev, Extended P) {
-  CheckOpenProbability(P);
-  CheckInverseStdDev(StdDev);
-  return Mean + StdDev * InvNormalLess(P);
+  return NormalQuantile(Mean, StdDev, P, InvNormalLess);
 }
 
 Extended InvNormalDistGreater(Extended Mean, Extended StdDev, Extended P) {
-  CheckOpenProbability(P);
-  CheckInverseStdDev(StdDev);
-  return Mean + StdDev * InvNormalGreater(P);
+  return NormalQuantile(Mean, StdDev, P, InvNormalGreater);
 }
 
 // === Log-normal =================================================================================

@@ -525,15 +525,11 @@ Extended NormalDistBetween(Extended Mean, Extended StdDev, Extended X1, Extended
 }
 
 Extended InvNormalDistLess(Extended Mean, Extended StdDev, Extended P) {
-  CheckOpenProbability(P);
-  CheckInverseStdDev(StdDev);
-  return Mean + StdDev * InvNormalLess(P);
+  return NormalQuantile(Mean, StdDev, P, InvNormalLess);
 }
 
 Extended InvNormalDistGreater(Extended Mean, Extended StdDev, Extended P) {
-  CheckOpenProbability(P);
-  CheckInverseStdDev(StdDev);
-  return Mean + StdDev * InvNormalGreater(P);
+  return NormalQuantile(Mean, StdDev, P, InvNormalGreater);
 }
 
 // === Log-normal =================================================================================

@@ -34,4 +34,13 @@ inline void CheckPoisson(Extended Mean) {
   if (Mean <= 0) RaiseMathError(rsPoissonInvalid);
 }
 
+// Mean + StdDev z for the standard normal quantile z = StandardInverse(P), after the checks of
+// the normal's inverse functions.
+inline Extended NormalQuantile(Extended Mean, Extended StdDev, Extended P,
+                               Extended (*StandardInverse)(Extended)) {
+  CheckOpenProbability(P);
+  CheckInverseStdDev(StdDev);
+  return Mean + StdDev * StandardInverse(P);
+}
+
 }  // namespace tovrin::detail::checks
