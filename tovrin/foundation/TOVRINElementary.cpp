@@ -62,21 +62,7 @@ int Parity(Extended y) {
 
 }  // namespace
 
-Extended Ln80(Extended x) {
-  if (SignExponentOf(x) - 1u >= 0x7FFEu) {  // not a positive normal number
-    if (x == 0) return -Inf;
-    if (x < 0) return std::numeric_limits<Extended>::quiet_NaN();
-    if (!(x < Inf)) return x + x;  // +inf or NaN
-  }
-  const LnReduced q = LnReduce(x);
-  const Extended t = q.t, t2 = t * t;
-  const Extended head = LnHead(q);
-  const Extended s = head + t;  // fast two-sum, as in LnTwoPart
-  const Extended e = t - (s - head);
-  const Extended p = t2 * (-0.5L + t * (1.0 / 3) + t2 * (-0.25L + t * 0.2) +
-                           t2 * t2 * ((-1.0 / 6) + t * (1.0 / 7) - t2 * 0.125L));
-  return s + ((e + (q.tl * (1 - t) + LnTail(q))) + p);
-}
+Extended Ln80(Extended x) { return LnInline(x); }
 
 Extended Pow80(Extended x, Extended y) {
   // The common case first, told from the exponent bits alone: x positive and normal, y normal

@@ -399,22 +399,23 @@ Extended InvNormalDistGreater(Extended Mean, Extended StdDev, Extended P) {
 Extended LogNormalPDF(Extended Mean, Extended StdDev, Extended X) {
   CheckStdDev(StdDev);
   if (!(X > 0)) RaiseMathError(rsValueGZero);
-  if (ScaleInRange(X)) return NormalDensity(Mean, StdDev, Ln80(X), 1.0L / X);
-  return NormalDensity(Mean, StdDev, Ln80(X)) / X;
+  const Extended lnX = detail::elementary::LnInline(X);
+  if (ScaleInRange(X)) return NormalDensity(Mean, StdDev, lnX, 1.0L / X);
+  return NormalDensity(Mean, StdDev, lnX) / X;
 }
 
 Extended LogNormalLess(Extended Mean, Extended StdDev, Extended X) {
   CheckStdDev(StdDev);
   if (std::isnan(X)) return kNaN;
   if (X <= 0) return 0;
-  return NormalDistLess(Mean, StdDev, Ln80(X));
+  return NormalDistLess(Mean, StdDev, detail::elementary::LnInline(X));
 }
 
 Extended LogNormalGreater(Extended Mean, Extended StdDev, Extended X) {
   CheckStdDev(StdDev);
   if (std::isnan(X)) return kNaN;
   if (X <= 0) return 1;
-  return NormalDistGreater(Mean, StdDev, Ln80(X));
+  return NormalDistGreater(Mean, StdDev, detail::elementary::LnInline(X));
 }
 
 namespace {

@@ -3,7 +3,8 @@
 // but a small fraction of cases (bench/RESULTS.md); the special values are those of the C
 // library's expl, logl and powl. Exp80 is inline (a call costs a third of its time); Ln80 is
 // not, as reading the bits of an argument held in a register stalls where those of one passed in
-// memory do not.
+// memory do not: a caller whose argument is still its own stack-passed parameter inlines
+// LnInline instead.
 //
 // e^x is Tang's: x = (256 m + j) ln2/256 + r with |r| <= ln2/512, e^x = 2^m 2^(j/256) e^r,
 // 2^(j/256) from a table in 64 + 53 bits and e^r - 1 a Taylor polynomial of degree 6; r is kept in
@@ -126,6 +127,24 @@ struct LnReduced {
 }
 [[gnu::always_inline]] inline Extended LnTail(const LnReduced& q) {
   return q.k * Ln2Lo + LnTableLo[q.j];
+}
+
+// ln x for any x, inline for callers whose argument is still in memory (an argument passed on
+// the stack): Ln80 is this body out of line.
+[[gnu::always_inline]] inline Extended LnInline(Extended x) {
+  if (SignExponentOf(x) - 1u >= 0x7FFEu) {  // not a positive normal number
+    if (x == 0) return -Inf;
+    if (x < 0) return std::numeric_limits<Extended>::quiet_NaN();
+    if (!(x < Inf)) return x + x;  // +inf or NaN
+  }
+  const LnReduced q = LnReduce(x);
+  const Extended t = q.t, t2 = t * t;
+  const Extended head = LnHead(q);
+  const Extended s = head + t;  // fast two-sum
+  const Extended e = t - (s - head);
+  const Extended p = t2 * (-0.5L + t * (1.0 / 3) + t2 * (-0.25L + t * 0.2) +
+                           t2 * t2 * ((-1.0 / 6) + t * (1.0 / 7) - t2 * 0.125L));
+  return s + ((e + (q.tl * (1 - t) + LnTail(q))) + p);
 }
 
 }  // namespace elementary
